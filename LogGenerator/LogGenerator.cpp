@@ -1,0 +1,71 @@
+#include "LogGenerator.h"
+
+#include "Array.h"
+#include "SystemLog.h"
+#include "TelephonyConstants.h"
+#include "TextFormat.h"
+
+namespace orvex {
+
+namespace {
+constexpr std::size_t kHistoryLength = 5;
+
+// The ordered entries up to the first absent value.
+DictionaryRef entryEndingAtFirstAbsent(std::initializer_list<Dictionary::Entry> entries)
+{
+    auto result = Dictionary::make();
+    for (const auto& [key, value] : entries) {
+        if (value.isNull())
+            break;
+        result->set(key, value.shallowCopy());
+    }
+    return result;
+}
+} // namespace
+
+LogGenerator::LogGenerator(const GeneratorEnvironment& environment) : _environment(environment)
+{
+    systemLog(Priority::warning, "Creating Log object: %p", static_cast<const void*>(this));
+}
+
+std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
+    const Value& technology, const GeneratorEnvironment& environment)
+{
+    using Maker = std::unique_ptr<LogGenerator> (*)(const GeneratorEnvironment&);
+    struct Choice {
+        const char* technology;
+        Maker generator; // null while this build does not decode the technology
+    };
+    static constexpr Choice kChoices[] = {
+        {telephony::kTechnologyIFX, nullptr},
+        {telephony::kTechnologyMRL_GSM, nullptr},
+        {telephony::kTechnologyMRL_CDMA, nullptr},
+        {telephony::kTechnologyMRL_LTE, nullptr},
+        {telephony::kTechnologyMRL_UTRAN2, nullptr},
+    };
+    for (const Choice& choice : kChoices) {
+        if (technology == Value(choice.technology))
+            return choice.generator ? choice.generator(environment) : nullptr;
+    }
+    return nullptr;
+}
+
+void LogGenerator::updateHistoryInState(Dictionary& state, const Clock& clock)
+{
+    ArrayRef history = state["History"].array();
+    if (!history) {
+        history = Array::make();
+        state.set("History", history);
+    }
+    if (history->size() >= kHistoryLength)
+        history->removeFirst(history->size() - (kHistoryLength - 1));
+    history->append(entryEndingAtFirstAbsent({
+        {"DisplayState", state["DisplayState"]},
+        {"Display", state["Display"]},
+        {"ExtraInfo", state["ExtraInfo"]},
+        {"Date", dateText(clock.now())},
+        {"Description", text("Snapshot (%s)", dateText(clock.now()).c_str())},
+    }));
+}
+
+} // namespace orvex

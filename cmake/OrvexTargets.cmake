@@ -1,0 +1,33 @@
+# How a floor becomes a target: the same warnings everywhere, headers in a verified file set.
+
+add_library(orvex_build_flags INTERFACE)
+target_compile_options(orvex_build_flags INTERFACE
+    -Wall -Wextra -Wpedantic -Werror -Wshadow -Wconversion -Wsign-conversion -Wnon-virtual-dtor
+    -Woverloaded-virtual -Wformat=2 -Wimplicit-fallthrough -Wundef -Wcast-align)
+if(ORVEX_SANITIZE)
+    target_compile_options(orvex_build_flags INTERFACE
+        -fsanitize=address,undefined -fno-sanitize-recover=all)
+    target_link_options(orvex_build_flags INTERFACE -fsanitize=address,undefined)
+endif()
+
+# orvex_add_floor(TARGET BASE <folder> HEADERS ... SOURCES ... LINKS ...)
+# BASE is the one folder the target exports. Every header is also compiled alone by the target
+# all_verify_interface_header_sets.
+function(orvex_add_floor target)
+    cmake_parse_arguments(FLOOR "" "BASE" "HEADERS;SOURCES;LINKS;PRIVATE_LINKS" ${ARGN})
+    if(FLOOR_SOURCES)
+        add_library(${target} STATIC ${FLOOR_SOURCES})
+        set(scope PUBLIC)
+    else()
+        add_library(${target} INTERFACE)
+        set(scope INTERFACE)
+    endif()
+    target_sources(${target} ${scope} FILE_SET HEADERS BASE_DIRS ${FLOOR_BASE} FILES ${FLOOR_HEADERS})
+    set_target_properties(${target} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
+    target_link_libraries(${target} ${scope} ${FLOOR_LINKS})
+    if(FLOOR_SOURCES)
+        target_link_libraries(${target} PRIVATE orvex_build_flags ${FLOOR_PRIVATE_LINKS})
+    else()
+        target_link_libraries(${target} INTERFACE orvex_build_flags)
+    endif()
+endfunction()

@@ -1,0 +1,48 @@
+#pragma once
+
+#include "Value.h"
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+namespace orvex {
+
+class OrvexModelNode;
+using OrvexModelNodeRef = std::shared_ptr<const OrvexModelNode>;
+
+// Every node of one tree under its path. Of two nodes with one path, the one stored last is kept.
+using NodesByPath = std::unordered_map<std::string, OrvexModelNodeRef>;
+
+// A node of the display tree: what one row of the screens shows. Immutable; a screen may keep a node of a
+// tree that the model has dropped.
+//
+// A branch has child nodes, a leaf has a value; a plain node has neither.
+class OrvexModelNode {
+public:
+    explicit OrvexModelNode(std::string name) : _name(std::move(name)) {}
+    virtual ~OrvexModelNode() = default;
+    OrvexModelNode(const OrvexModelNode&) = delete;
+    OrvexModelNode& operator=(const OrvexModelNode&) = delete;
+
+    const std::string& displayName() const { return _name; }
+    virtual const std::vector<OrvexModelNodeRef>* childNodes() const { return nullptr; }
+    virtual const std::string* value() const { return nullptr; }
+
+    // Builds the tree of a display dictionary (or of any other value) and enters every node into the path
+    // dictionary. The root is named "Orvex" and has the path "/".
+    //
+    // A dictionary that holds the key "_sorted" shows its keys in string order, and a key of the form
+    // "prefix;name" under its name. Values that are neither texts nor containers show as "(unknown)".
+    static OrvexModelNodeRef makeTreeFromObject(const Value& object, NodesByPath& pathDictionary);
+
+private:
+    std::string _name;
+};
+
+// Appends a display name to a path: exactly one "/" between the two. An empty name leaves the path as it is.
+std::string pathByAppending(const std::string& path, const std::string& component);
+
+} // namespace orvex

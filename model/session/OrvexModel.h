@@ -1,0 +1,86 @@
+#pragma once
+
+#include "LogGenerator.h"
+#include "OrvexModelNode.h"
+
+#include "MessagePort.h"
+#include "RunLoop.h"
+#include "TelephonyService.h"
+
+#include <memory>
+
+namespace orvex {
+
+// Told on the run loop that the display tree has to be read again.
+class OrvexModelListener {
+public:
+    virtual ~OrvexModelListener() = default;
+    virtual void updateViewControllerFromModel() = 0;
+};
+
+// The monitor session: opens the log channel, asks for the log technology, starts the stream, feeds the
+// generator with what arrives and, every two seconds in which something arrived, drops the display tree so
+// that the next reader rebuilds it. A start that fails is tried again after five seconds, without limit; a
+// channel that breaks is reopened at once. Failures go to the system log.
+//
+// Everything runs on the run loop's thread. Tasks that wait on the run loop hold the model.
+class OrvexModel : public std::enable_shared_from_this<OrvexModel> {
+public:
+    struct Platform {
+        RunLoop& runLoop;
+        MessagePorts& ports;
+        TelephonyService& telephony;
+        GeneratorEnvironment generators;
+    };
+
+    static std::shared_ptr<OrvexModel> create(const Platform& platform);
+    ~OrvexModel();
+    OrvexModel(const OrvexModel&) = delete;
+    OrvexModel& operator=(const OrvexModel&) = delete;
+
+    // The listener is held weakly by address: clear it before it goes.
+    void setListener(OrvexModelListener* listener) { _listener = listener; }
+
+    // True while both ports exist.
+    bool isConnected() const { return _recvPort && _sendPort; }
+
+    void startMonitor();
+    void restartMonitor();
+    // Tests the ports' health and, when a message arrived since the last call, drops the tree and tells the
+    // listener.
+    void refresh();
+    // Takes one log message.
+    void updateWithData(ByteView data);
+
+    // The root of the display tree, built on demand. Null while no technology is known.
+    OrvexModelNodeRef topLevelNodes();
+    // Null when no node has the path.
+    OrvexModelNodeRef nodeAtPath(const std::string& path);
+    // What a snapshot stores. Null while no technology is known.
+    ArrayRef getSaveContents() const;
+
+private:
+    explicit OrvexModel(const Platform& platform);
+
+    bool createPorts();
+    void destroyPorts();
+    void configureGenerator();
+    bool sendStartCommand();
+    void retryLater();
+
+    Platform _platform;
+    OrvexModelListener* _listener = nullptr;
+
+    std::shared_ptr<LocalPort> _recvPort;
+    std::shared_ptr<RemotePort> _sendPort;
+    std::unique_ptr<RunLoop::Timer> _displayUpdateTimer; // set while the monitor is running
+    bool _updated = false;                               // something arrived since the last refresh
+
+    std::unique_ptr<LogGenerator> _logGenerator;
+    DictionaryRef _state; // the generator state; survives restarts
+
+    OrvexModelNodeRef _nodes; // null means that the tree is to be rebuilt
+    std::unique_ptr<NodesByPath> _nodesByPath;
+};
+
+} // namespace orvex

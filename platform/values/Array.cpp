@@ -1,0 +1,31 @@
+#include "Array.h"
+
+#include <algorithm>
+
+namespace orvex {
+
+ArrayRef Array::make(std::initializer_list<Value> elements) { return std::make_shared<Array>(elements); }
+
+void Array::appendAll(const Array& other)
+{
+    // Index by index: the other array may be this one.
+    const std::size_t count = other.size();
+    _elements.reserve(_elements.size() + count);
+    for (std::size_t i = 0; i < count; ++i)
+        _elements.push_back(other._elements[i]);
+}
+
+void Array::removeFirst(std::size_t count)
+{
+    const auto last = _elements.begin() + static_cast<std::ptrdiff_t>(std::min(count, _elements.size()));
+    _elements.erase(_elements.begin(), last);
+}
+
+ArrayRef Array::shallowCopy() const
+{
+    auto copy = std::make_shared<Array>();
+    copy->_elements = _elements;
+    return copy;
+}
+
+} // namespace orvex

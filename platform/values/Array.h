@@ -1,0 +1,38 @@
+#pragma once
+
+#include "Value.h"
+
+#include <initializer_list>
+
+namespace orvex {
+
+// A mutable list of values, shared by reference (ArrayRef). It cannot be copied by accident.
+class Array {
+public:
+    Array() = default;
+    Array(std::initializer_list<Value> elements) : _elements(elements) {}
+    Array(const Array&) = delete;
+    Array& operator=(const Array&) = delete;
+
+    static ArrayRef make(std::initializer_list<Value> elements = {});
+
+    std::size_t size() const { return _elements.size(); }
+    bool isEmpty() const { return _elements.empty(); }
+    const Value& operator[](std::size_t index) const { return _elements[index]; }
+    auto begin() const { return _elements.begin(); }
+    auto end() const { return _elements.end(); }
+
+    void append(Value value) { _elements.push_back(std::move(value)); }
+    void appendAll(const Array& other);
+    void removeAll() { _elements.clear(); }
+    void removeFirst(std::size_t count);
+
+    ArrayRef shallowCopy() const;
+
+    friend bool operator==(const Array& left, const Array& right) { return left._elements == right._elements; }
+
+private:
+    std::vector<Value> _elements;
+};
+
+} // namespace orvex

@@ -1,0 +1,69 @@
+#pragma once
+
+#include "Value.h"
+
+#include <initializer_list>
+#include <string_view>
+#include <unordered_map>
+#include <utility>
+
+namespace orvex {
+
+// A mutable dictionary with string keys, shared by reference (DictionaryRef). It cannot be copied by
+// accident. Keys keep the order in which they were first set; setting a key again keeps its place, removing
+// and setting it moves it to the end.
+//
+// Small dictionaries, the rows of a screen, are searched directly; large ones get an index.
+class Dictionary {
+public:
+    struct Entry {
+        std::string key;
+        Value value;
+
+        friend bool operator==(const Entry&, const Entry&) = default;
+    };
+
+    Dictionary() = default;
+    Dictionary(std::initializer_list<Entry> entries);
+    Dictionary(const Dictionary&) = delete;
+    Dictionary& operator=(const Dictionary&) = delete;
+
+    static DictionaryRef make(std::initializer_list<Entry> entries = {});
+
+    std::size_t size() const { return _entries.size(); }
+    bool isEmpty() const { return _entries.empty(); }
+    auto begin() const { return _entries.begin(); }
+    auto end() const { return _entries.end(); }
+
+    // The value under the key; a null value when there is none.
+    const Value& operator[](std::string_view key) const;
+    bool contains(std::string_view key) const { return find(key) != kNotFound; }
+
+    // The value to be written under the key, made at the end when there is none. The reference holds until
+    // the next change of the dictionary.
+    Value& slot(std::string_view key);
+    void set(std::string_view key, Value value) { slot(key) = std::move(value); }
+    void remove(std::string_view key);
+
+    DictionaryRef shallowCopy() const;
+
+    // Equal entries in any order.
+    friend bool operator==(const Dictionary& left, const Dictionary& right);
+
+private:
+    static constexpr std::size_t kNotFound = static_cast<std::size_t>(-1);
+    static constexpr std::size_t kSearchedDirectly = 24;
+
+    struct KeyHash : std::hash<std::string_view> {
+        using is_transparent = void;
+    };
+    using Index = std::unordered_map<std::string, std::size_t, KeyHash, std::equal_to<>>;
+
+    std::size_t find(std::string_view key) const;
+    void rebuildIndex();
+
+    std::vector<Entry> _entries;
+    Index _index; // empty while the dictionary is small
+};
+
+} // namespace orvex

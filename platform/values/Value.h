@@ -1,0 +1,76 @@
+#pragma once
+
+#include "Date.h"
+
+#include <concepts>
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <variant>
+#include <vector>
+
+namespace orvex {
+
+class Array;
+class Dictionary;
+
+using Bytes = std::vector<std::uint8_t>;
+using ArrayRef = std::shared_ptr<Array>;
+using DictionaryRef = std::shared_ptr<Dictionary>;
+using BytesRef = std::shared_ptr<Bytes>;
+
+// The one value type of property lists, generator state, display dictionary and snapshots.
+//
+// Scalars are held by value. Arrays, dictionaries and byte buffers are held by reference: copying a Value
+// that holds one shares it. shallowCopy() is the one way to a container of its own.
+class Value {
+public:
+    enum class Kind { null, string, integer, real, boolean, date, data, array, dictionary };
+
+    Value() = default;
+    Value(std::string text) : _content(std::move(text)) {}
+    Value(std::string_view text) : _content(std::string(text)) {}
+    Value(const char* text) : _content(std::string(text)) {}
+    Value(std::same_as<bool> auto flag) : _content(flag) {}
+    Value(std::integral auto number) requires(!std::same_as<decltype(number), bool>)
+        : _content(static_cast<std::int64_t>(number))
+    {
+    }
+    Value(double number) : _content(number) {}
+    Value(Date date) : _content(date) {}
+    // A null reference makes a null value.
+    Value(BytesRef data);
+    Value(ArrayRef array);
+    Value(DictionaryRef dictionary);
+
+    Kind kind() const { return static_cast<Kind>(_content.index()); }
+    bool isNull() const { return kind() == Kind::null; }
+
+    // Each returns null when the value is of another kind.
+    const std::string* string() const { return std::get_if<std::string>(&_content); }
+    std::string* string() { return std::get_if<std::string>(&_content); }
+    const std::int64_t* integer() const { return std::get_if<std::int64_t>(&_content); }
+    const double* real() const { return std::get_if<double>(&_content); }
+    const bool* boolean() const { return std::get_if<bool>(&_content); }
+    const Date* date() const { return std::get_if<Date>(&_content); }
+    BytesRef data() const;
+    ArrayRef array() const;
+    DictionaryRef dictionary() const;
+
+    // A container of its own kind holding the same elements; any other value as it is.
+    Value shallowCopy() const;
+
+    // Scalars by value, containers element by element.
+    friend bool operator==(const Value& left, const Value& right);
+
+private:
+    std::variant<std::monostate, std::string, std::int64_t, double, bool, Date, BytesRef, ArrayRef,
+        DictionaryRef>
+        _content;
+};
+
+// The name of a kind, for messages: "string", "dictionary", ...
+const char* nameOf(Value::Kind kind);
+
+} // namespace orvex
