@@ -1,0 +1,30 @@
+#pragma once
+
+#include <QCoreApplication>
+#include <QElapsedTimer>
+
+#include <chrono>
+
+namespace orvex::test {
+
+// Turns the event loop until the condition holds; false when it did not within the time.
+template <typename Condition>
+bool waitUntil(Condition condition, std::chrono::milliseconds longest = std::chrono::seconds(10))
+{
+    QElapsedTimer elapsed;
+    elapsed.start();
+    while (!condition()) {
+        if (elapsed.elapsed() > longest.count())
+            return false;
+        QCoreApplication::processEvents(QEventLoop::AllEvents, 10);
+    }
+    return true;
+}
+
+// Turns the event loop for a while, for what must not happen.
+inline void turnFor(std::chrono::milliseconds time)
+{
+    waitUntil([] { return false; }, time);
+}
+
+} // namespace orvex::test

@@ -1,0 +1,123 @@
+#include "QtRunLoop.h"
+
+#include "EventLoop.h"
+
+#include <gtest/gtest.h>
+
+#include <stdexcept>
+#include <thread>
+
+namespace orvex {
+namespace {
+
+using namespace std::chrono_literals;
+using test::turnFor;
+using test::waitUntil;
+
+TEST(QtRunLoop, RunsPostedTasksLaterAndInOrder)
+{
+    QtRunLoop loop;
+    std::string order;
+    loop.post([&] {
+        order += 'a';
+        loop.post([&] { order += 'd'; });
+    });
+    loop.post([&] { order += 'b'; });
+    std::thread([&] { loop.post([&] { order += 'c'; }); }).join();
+    EXPECT_EQ(order, "");
+    EXPECT_TRUE(waitUntil([&] { return order.size() == 4; }));
+    EXPECT_EQ(order, "abcd");
+}
+
+TEST(QtRunLoop, TaskThatAlwaysPostsItselfLeavesTimersTheirTurn)
+{
+    QtRunLoop loop;
+    int turns = 0;
+    std::function<void()> again = [&] {
+        ASSERT_LT(++turns, 1'000'000) << "the timer never had its turn";
+        loop.post(again);
+    };
+    loop.post(again);
+    bool fired = false;
+    loop.postAfter(20ms, [&] { fired = true; });
+    EXPECT_TRUE(waitUntil([&] { return fired; }));
+    EXPECT_GT(turns, 1);
+}
+
+TEST(QtRunLoop, PostsAreServedByAnEventLoopInsideATask)
+{
+    QtRunLoop loop;
+    bool inner = false;
+    bool outer = false;
+    loop.post([&] {
+        loop.post([&] { inner = true; });
+        outer = waitUntil([&] { return inner; }, 2s);
+    });
+    EXPECT_TRUE(waitUntil([&] { return inner; }, 5s));
+    EXPECT_TRUE(outer);
+}
+
+TEST(QtRunLoop, DelaysAreNeverShort)
+{
+    QtRunLoop loop;
+    for (const auto delay : {0ns, 1ns, 1'000'001ns, 30'500'000ns}) {
+        const auto start = std::chrono::steady_clock::now();
+        auto elapsed = 0ns;
+        bool ran = false;
+        loop.postAfter(delay, [&] {
+            elapsed = std::chrono::steady_clock::now() - start;
+            ran = true;
+        });
+        EXPECT_FALSE(ran);
+        ASSERT_TRUE(waitUntil([&] { return ran; }));
+        EXPECT_GE(elapsed, delay);
+    }
+}
+
+TEST(QtRunLoop, TimerStopsWhenItsOwnTaskDestroysIt)
+{
+    QtRunLoop loop;
+    int ticks = 0;
+    std::unique_ptr<RunLoop::Timer> timer;
+    // The capture is looked at after the timer has gone: it must still be there.
+    timer = loop.startTimer(5ms, [&timer, &ticks, marker = std::string(100, 'x')] {
+        if (++ticks == 3)
+            timer.reset();
+        EXPECT_EQ(marker, std::string(100, 'x'));
+    });
+    EXPECT_TRUE(waitUntil([&] { return !timer; }));
+    turnFor(40ms);
+    EXPECT_EQ(ticks, 3);
+}
+
+TEST(QtRunLoop, TasksThatHaveNotRunDieWithTheLoop)
+{
+    const auto witness = std::make_shared<int>();
+    int runs = 0;
+    {
+        QtRunLoop loop;
+        loop.post([&runs, witness] { ++runs; });
+        loop.postAfter(1ms, [&runs, witness] { ++runs; });
+    }
+    auto loop = std::make_unique<QtRunLoop>();
+    loop->post([&loop] { loop.reset(); });
+    loop->post([&runs, witness] { ++runs; });
+    turnFor(50ms);
+    EXPECT_FALSE(loop);
+    EXPECT_EQ(runs, 0);
+    EXPECT_EQ(witness.use_count(), 1) << "a dropped task is destroyed, not kept";
+}
+
+TEST(QtRunLoopDeathTest, ExceptionOfATaskEndsTheProcess)
+{
+    EXPECT_DEATH(
+        {
+            QtRunLoop loop;
+            loop.post([] { throw std::runtime_error("out of range"); });
+            turnFor(1s);
+        },
+        "out of range");
+}
+
+} // namespace
+} // namespace orvex

@@ -1,0 +1,12 @@
+// Test programs whose subjects need Qt's event loop.
+
+#include <gmock/gmock.h>
+
+#include <QCoreApplication>
+
+int main(int argc, char** argv)
+{
+    testing::InitGoogleMock(&argc, argv);
+    const QCoreApplication application(argc, argv);
+    return RUN_ALL_TESTS();
+}
