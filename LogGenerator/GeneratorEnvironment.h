@@ -10,8 +10,8 @@ namespace orvex {
 
 // What every generator needs of the platform. The referents outlive all generators.
 struct GeneratorEnvironment {
-    const Resources& resources; // templates
-    const Clock& clock;         // dates of history entries, times of a DLF
+    const Resources& resources;              // templates
+    const Clock& clock;                      // dates of history entries, times of a DLF
     std::optional<std::string> buildVersion; // of the application; absent when it has none
 };
 

@@ -1,5 +1,7 @@
 #include "LogGenerator.h"
 
+#include "LTE/LTELogGenerator.h"
+
 #include "Array.h"
 #include "SystemLog.h"
 #include "TelephonyConstants.h"
@@ -23,7 +25,8 @@ DictionaryRef entryEndingAtFirstAbsent(std::initializer_list<Dictionary::Entry> 
 }
 } // namespace
 
-LogGenerator::LogGenerator(const GeneratorEnvironment& environment) : _environment(environment)
+LogGenerator::LogGenerator(const GeneratorEnvironment& environment)
+    : _environment(environment)
 {
     systemLog(Priority::warning, "Creating Log object: %p", static_cast<const void*>(this));
 }
@@ -40,7 +43,7 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
         {telephony::kTechnologyIFX, nullptr},
         {telephony::kTechnologyMRL_GSM, nullptr},
         {telephony::kTechnologyMRL_CDMA, nullptr},
-        {telephony::kTechnologyMRL_LTE, nullptr},
+        {telephony::kTechnologyMRL_LTE, &LTELogGenerator::generator},
         {telephony::kTechnologyMRL_UTRAN2, nullptr},
     };
     for (const Choice& choice : kChoices) {

@@ -11,8 +11,8 @@ namespace orvex {
 
 // The decoder of one log technology: turns log messages into the display dictionary.
 //
-// A generator keeps little of its own. What a session knows lies in the generator state, a dictionary that the
-// session makes once and hands to every call. Keys that all generators share:
+// A generator keeps little of its own. What a session knows lies in the generator state, a dictionary that
+// the session makes once and hands to every call. Keys that all generators share:
 //
 //   "Display"       the display dictionary, into which packets write
 //   "DisplayState"  the raw material of the display

@@ -8,7 +8,8 @@ namespace orvex {
 class OrvexModelLeafNode final : public OrvexModelNode {
 public:
     OrvexModelLeafNode(std::string name, std::string value)
-        : OrvexModelNode(std::move(name)), _string(std::move(value))
+        : OrvexModelNode(std::move(name))
+        , _string(std::move(value))
     {
     }
 

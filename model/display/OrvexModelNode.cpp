@@ -28,7 +28,10 @@ std::string nameWithoutSortPrefix(const std::string& key)
 
 class TreeBuilder {
 public:
-    explicit TreeBuilder(NodesByPath& nodesByPath) : _nodesByPath(nodesByPath) {}
+    explicit TreeBuilder(NodesByPath& nodesByPath)
+        : _nodesByPath(nodesByPath)
+    {
+    }
 
     OrvexModelNodeRef build(std::string name, const Value& object, const std::string& path)
     {

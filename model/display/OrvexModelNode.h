@@ -22,7 +22,10 @@ using NodesByPath = std::unordered_map<std::string, OrvexModelNodeRef>;
 // A branch has child nodes, a leaf has a value; a plain node has neither.
 class OrvexModelNode {
 public:
-    explicit OrvexModelNode(std::string name) : _name(std::move(name)) {}
+    explicit OrvexModelNode(std::string name)
+        : _name(std::move(name))
+    {
+    }
     virtual ~OrvexModelNode() = default;
     OrvexModelNode(const OrvexModelNode&) = delete;
     OrvexModelNode& operator=(const OrvexModelNode&) = delete;

@@ -8,7 +8,8 @@ namespace orvex {
 class OrvexModelTreeNode final : public OrvexModelNode {
 public:
     OrvexModelTreeNode(std::string name, std::vector<OrvexModelNodeRef> children)
-        : OrvexModelNode(std::move(name)), _childNodes(std::move(children))
+        : OrvexModelNode(std::move(name))
+        , _childNodes(std::move(children))
     {
     }
 

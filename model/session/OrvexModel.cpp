@@ -23,9 +23,16 @@ std::shared_ptr<OrvexModel> OrvexModel::create(const Platform& platform)
     return std::shared_ptr<OrvexModel>(new OrvexModel(platform));
 }
 
-OrvexModel::OrvexModel(const Platform& platform) : _platform(platform), _state(Dictionary::make()) {}
+OrvexModel::OrvexModel(const Platform& platform)
+    : _platform(platform)
+    , _state(Dictionary::make())
+{
+}
 
-OrvexModel::~OrvexModel() { destroyPorts(); }
+OrvexModel::~OrvexModel()
+{
+    destroyPorts();
+}
 
 bool OrvexModel::createPorts()
 {
@@ -98,8 +105,8 @@ void OrvexModel::destroyPorts()
 
 void OrvexModel::configureGenerator()
 {
-    const auto query
-        = propertyListXML(Dictionary::make({{telephony::kGetTechnology, telephony::kGetTechnology}}));
+    const auto query =
+        propertyListXML(Dictionary::make({{telephony::kGetTechnology, telephony::kGetTechnology}}));
     if (!query) {
         systemLog(Priority::error, " Could not generate GetTechnology command; cannot configure");
         return;
@@ -124,8 +131,8 @@ void OrvexModel::configureGenerator()
         systemLog(Priority::error, " ***** Reply to GetTechnology had no answer; cannot configure");
         return;
     }
-    _logGenerator = LogGenerator::generatorFromTechnology(
-        (*answers)[telephony::kGetTechnology], _platform.generators);
+    _logGenerator =
+        LogGenerator::generatorFromTechnology((*answers)[telephony::kGetTechnology], _platform.generators);
     systemLog(Priority::error, "Got log generated: %p", static_cast<const void*>(_logGenerator.get()));
 }
 

@@ -13,7 +13,10 @@ ConsoleSink& theConsole()
 }
 } // namespace
 
-void installConsole(ConsoleSink sink) { theConsole() = std::move(sink); }
+void installConsole(ConsoleSink sink)
+{
+    theConsole() = std::move(sink);
+}
 
 void writeConsoleLine(std::string_view line)
 {

@@ -45,8 +45,7 @@ public:
     virtual Status send(std::int32_t messageId, ByteView data, std::chrono::milliseconds sendTimeout) = 0;
     // Sends a request and waits for its reply; nothing else of the run loop is served meanwhile.
     virtual SendResult request(std::int32_t messageId, ByteView data, std::chrono::milliseconds sendTimeout,
-        std::chrono::milliseconds receiveTimeout)
-        = 0;
+        std::chrono::milliseconds receiveTimeout) = 0;
     // Bytes accepted for sending that the peer's side has not taken yet.
     virtual std::size_t pendingBytes() const = 0;
 };

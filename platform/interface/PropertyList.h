@@ -11,7 +11,7 @@ namespace orvex {
 
 // Bounds that a property list must keep before it is looked into.
 struct PropertyListLimits {
-    std::size_t maximumBytes = std::size_t {64} << 20;
+    std::size_t maximumBytes = std::size_t{64} << 20;
     std::size_t maximumDepth = 256;       // containers inside containers
     std::size_t maximumNodes = 2'000'000; // values and keys, shared ones counted wherever they appear
 };

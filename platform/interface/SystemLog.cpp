@@ -10,9 +10,15 @@ namespace {
 SystemLog* theSink = nullptr;
 } // namespace
 
-SystemLog* SystemLog::install(SystemLog* sink) { return std::exchange(theSink, sink); }
+SystemLog* SystemLog::install(SystemLog* sink)
+{
+    return std::exchange(theSink, sink);
+}
 
-SystemLog* SystemLog::installed() { return theSink; }
+SystemLog* SystemLog::installed()
+{
+    return theSink;
+}
 
 void systemLog(Priority priority, const char* format, ...)
 {

@@ -18,7 +18,7 @@ public:
     // False when nobody would read a line of this priority, so that it need not be made.
     virtual bool wants(Priority) const { return true; }
     // Returns when all that was written has reached its destination. Called before the process ends.
-    virtual void flush() {}
+    virtual void flush() { }
 
     // Lines are dropped while no sink is installed. Returns the previous sink.
     static SystemLog* install(SystemLog* sink);

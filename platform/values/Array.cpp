@@ -4,7 +4,10 @@
 
 namespace orvex {
 
-ArrayRef Array::make(std::initializer_list<Value> elements) { return std::make_shared<Array>(elements); }
+ArrayRef Array::make(std::initializer_list<Value> elements)
+{
+    return std::make_shared<Array>(elements);
+}
 
 void Array::appendAll(const Array& other)
 {

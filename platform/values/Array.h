@@ -10,7 +10,10 @@ namespace orvex {
 class Array {
 public:
     Array() = default;
-    Array(std::initializer_list<Value> elements) : _elements(elements) {}
+    Array(std::initializer_list<Value> elements)
+        : _elements(elements)
+    {
+    }
     Array(const Array&) = delete;
     Array& operator=(const Array&) = delete;
 
@@ -29,7 +32,10 @@ public:
 
     ArrayRef shallowCopy() const;
 
-    friend bool operator==(const Array& left, const Array& right) { return left._elements == right._elements; }
+    friend bool operator==(const Array& left, const Array& right)
+    {
+        return left._elements == right._elements;
+    }
 
 private:
     std::vector<Value> _elements;

@@ -2,8 +2,8 @@
 
 #include "TextFormat.h"
 
-#include <chrono>
 #include <algorithm>
+#include <chrono>
 #include <cmath>
 
 namespace orvex {
@@ -14,7 +14,7 @@ std::string dateText(Date date)
     // The calendar of the standard library covers the years -32767 to 32767; dates outside are clamped.
     constexpr double kFarthest = 9.0e11;
     const double whole = std::floor(std::isnan(date.secondsSince1970) ? 0 : date.secondsSince1970);
-    const sys_seconds moment {seconds(static_cast<long long>(std::clamp(whole, -kFarthest, kFarthest)))};
+    const sys_seconds moment{seconds(static_cast<long long>(std::clamp(whole, -kFarthest, kFarthest)))};
     const auto day = floor<days>(moment);
     const year_month_day calendar(day);
     const hh_mm_ss time(moment - day);

@@ -6,7 +6,7 @@
 namespace orvex {
 
 namespace {
-template<typename Reference>
+template <typename Reference>
 Reference referenceIn(const auto& content)
 {
     const auto* reference = std::get_if<Reference>(&content);
@@ -32,9 +32,18 @@ Value::Value(DictionaryRef dictionary)
         _content = std::move(dictionary);
 }
 
-BytesRef Value::data() const { return referenceIn<BytesRef>(_content); }
-ArrayRef Value::array() const { return referenceIn<ArrayRef>(_content); }
-DictionaryRef Value::dictionary() const { return referenceIn<DictionaryRef>(_content); }
+BytesRef Value::data() const
+{
+    return referenceIn<BytesRef>(_content);
+}
+ArrayRef Value::array() const
+{
+    return referenceIn<ArrayRef>(_content);
+}
+DictionaryRef Value::dictionary() const
+{
+    return referenceIn<DictionaryRef>(_content);
+}
 
 Value Value::shallowCopy() const
 {
@@ -60,8 +69,8 @@ bool operator==(const Value& left, const Value& right)
 
 const char* nameOf(Value::Kind kind)
 {
-    static constexpr const char* kNames[]
-        = {"null", "string", "integer", "real", "boolean", "date", "data", "array", "dictionary"};
+    static constexpr const char* kNames[] = {
+        "null", "string", "integer", "real", "boolean", "date", "data", "array", "dictionary"};
     return kNames[static_cast<std::size_t>(kind)];
 }
 

@@ -29,16 +29,34 @@ public:
     enum class Kind { null, string, integer, real, boolean, date, data, array, dictionary };
 
     Value() = default;
-    Value(std::string text) : _content(std::move(text)) {}
-    Value(std::string_view text) : _content(std::string(text)) {}
-    Value(const char* text) : _content(std::string(text)) {}
-    Value(std::same_as<bool> auto flag) : _content(flag) {}
+    Value(std::string text)
+        : _content(std::move(text))
+    {
+    }
+    Value(std::string_view text)
+        : _content(std::string(text))
+    {
+    }
+    Value(const char* text)
+        : _content(std::string(text))
+    {
+    }
+    Value(std::same_as<bool> auto flag)
+        : _content(flag)
+    {
+    }
     Value(std::integral auto number) requires(!std::same_as<decltype(number), bool>)
         : _content(static_cast<std::int64_t>(number))
     {
     }
-    Value(double number) : _content(number) {}
-    Value(Date date) : _content(date) {}
+    Value(double number)
+        : _content(number)
+    {
+    }
+    Value(Date date)
+        : _content(date)
+    {
+    }
     // A null reference makes a null value.
     Value(BytesRef data);
     Value(ArrayRef array);

@@ -1,0 +1,30 @@
+#pragma once
+
+#include "PacketReader.h"
+
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+namespace orvex {
+
+class Base;
+
+// Which sections want which log code. Sections of one code stand in the order in which they subscribed.
+class CodeDictionary {
+public:
+    using Subscribers = std::vector<Base*>;
+
+    // A section that subscribes twice receives each packet twice.
+    void subscribe(LogCode code, Base& section);
+    // Null when nobody wants the code.
+    const Subscribers* subscribers(LogCode code) const;
+    // Every code as a decimal text, in the order of the first subscription.
+    std::vector<std::string> keys() const;
+
+private:
+    std::unordered_map<LogCode, Subscribers> _subscribers;
+    std::vector<LogCode> _codes;
+};
+
+} // namespace orvex

@@ -1,0 +1,23 @@
+#pragma once
+
+#include <span>
+
+namespace orvex {
+
+// One value of an enumerated field and the text that shows it.
+struct EnumText {
+    int value;
+    const char* text;
+};
+
+// The text of a value, or the fallback when the table does not name it.
+constexpr const char* textFor(int value, std::span<const EnumText> table, const char* fallback)
+{
+    for (const EnumText& entry : table) {
+        if (entry.value == value)
+            return entry.text;
+    }
+    return fallback;
+}
+
+} // namespace orvex

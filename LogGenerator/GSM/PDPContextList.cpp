@@ -1,0 +1,23 @@
+#include "GSM/PDPContextList.h"
+
+#include "PropertyList.h"
+#include "SystemLog.h"
+
+namespace orvex {
+
+PDPContextList::PDPContextList(ClassDictionary& dict, CodeDictionary& codeDict)
+    : Base("PDP Context Info", {kExtraCodePDPContexts}, dict, codeDict)
+{
+}
+
+void PDPContextList::updateWithData(Packet packet, LogCode)
+{
+    systemLog(Priority::warning, "PDPContextList");
+    const auto list = propertyListFromData(PacketReader(packet).from(kPacketHeaderLength).bytes());
+    if (!list.value)
+        throw UnknownDataException("PDP context list: " + list.error);
+    if (const ArrayRef contexts = list.value->array())
+        replaceSection(*contexts);
+}
+
+} // namespace orvex

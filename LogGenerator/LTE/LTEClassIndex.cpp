@@ -1,0 +1,12 @@
+#include "LTE/LTEClassIndex.h"
+
+#include "Console.h"
+
+namespace orvex {
+
+LTEClassIndex::~LTEClassIndex()
+{
+    writeConsoleLine("Deallocing LTEClassIndex");
+}
+
+} // namespace orvex

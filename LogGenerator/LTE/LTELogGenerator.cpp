@@ -1,0 +1,33 @@
+#include "LTE/LTELogGenerator.h"
+
+#include "LTE/LTEClassIndex.h"
+
+#include "SystemLog.h"
+
+namespace orvex {
+
+namespace {
+// Runs, and logs, before the generators below come into being.
+std::unique_ptr<ClassIndex> makeClassIndex()
+{
+    systemLog(Priority::error, "Creating LTELogGenerator object");
+    return std::make_unique<LTEClassIndex>();
+}
+} // namespace
+
+std::unique_ptr<LogGenerator> LTELogGenerator::generator(const GeneratorEnvironment& environment)
+{
+    return std::make_unique<LTELogGenerator>(environment);
+}
+
+LTELogGenerator::LTELogGenerator(const GeneratorEnvironment& environment)
+    : MRLLogGenerator2(environment, "LTE", makeClassIndex())
+{
+}
+
+LTELogGenerator::~LTELogGenerator()
+{
+    systemLog(Priority::warning, "LTELogGenerator is destructed %p", static_cast<const void*>(this));
+}
+
+} // namespace orvex

@@ -1,0 +1,62 @@
+#include "LTE/NeighborCellsList.h"
+
+#include "LTE/LogCode_0xB180.h"
+
+#include "SystemLog.h"
+
+namespace orvex {
+
+namespace {
+
+// One format for every scaled row in the log, whichever row it is.
+void printAndLog(Rows& row, const char* name, double value, const char* unit)
+{
+    row.print(name, "%4.2f %s", value, unit);
+    systemLog(Priority::warning, "Measured RSSI: %lf\n", value);
+}
+
+DictionaryRef rowsOf(const LogCode_0xB180::NeighborCell& cell)
+{
+    Rows row = Rows::make();
+    row.print("Physical Cell ID", "%d", cell.physicalCellIdentity());
+    systemLog(Priority::warning, "Physical Cell ID: %d\n", cell.physicalCellIdentity());
+    printAndLog(row, "Measured RSSI", cell.measuredRSSI(), "dBm");
+    printAndLog(row, "Measured RSRP", cell.measuredRSRP(), "dBm");
+    printAndLog(row, "Average RSRP", cell.averageRSRP(), "dBm");
+    printAndLog(row, "Measured RSRQ", cell.measuredRSRQ(), "dB");
+    printAndLog(row, "Average RSRQ", cell.averageRSRQ(), "dB");
+    row.print("Srxlev", "%d dBm", cell.srxlev());
+    row.print("Frequency Offset", "%d", cell.frequencyOffset());
+    row.print("Ant 0 Frame Offset", "%d", cell.antenna0FrameOffset());
+    row.print("Ant 0 Sample Offset", "%d", cell.antenna0SampleOffset());
+    // Antenna 1 shows antenna 0 again: the record has no other bits for it.
+    row.print("Ant 1 Frame Offset", "%d", cell.antenna0FrameOffset());
+    row.print("Ant 1 Sample Offset", "%d", cell.antenna0SampleOffset());
+    return row.dictionary();
+}
+
+} // namespace
+
+NeighborCellsList::NeighborCellsList(ClassDictionary& dict, CodeDictionary& codeDict)
+    : Base("Neighbor Cells List", {LogCode_0xB180::kCode}, dict, codeDict)
+{
+}
+
+void NeighborCellsList::updateWithData(Packet packet, LogCode logCode)
+{
+    systemLog(Priority::warning, "%s", getSectionName().c_str());
+    if (logCode != LogCode_0xB180::kCode)
+        return reportUnknown(logCode);
+    if (packet.size() < LogCode_0xB180::kMinimumLength)
+        return;
+    clearSection();
+    const auto neighbors = LogCode_0xB180(packet).neighborCells();
+    systemLog(Priority::warning, "Number of neighboring cells being reported: %d\n",
+        static_cast<int>(neighbors.count()));
+    Array cells;
+    for (const auto& neighbor : neighbors)
+        cells.append(rowsOf(neighbor));
+    replaceSection(cells);
+}
+
+} // namespace orvex

@@ -1,0 +1,90 @@
+#include "LTE/ReselectionCandidatesList.h"
+
+#include "EnumTable.h"
+#include "LTE/LogCode_0xB186.h"
+
+#include "SystemLog.h"
+
+namespace orvex {
+
+namespace {
+
+constexpr EnumText kTechnologies[] = {
+    {LogCode_0xB186::lte, "LTE"},
+    {LogCode_0xB186::utran, "UTRAN"},
+    {LogCode_0xB186::geran, "GERAN"},
+    {LogCode_0xB186::cdma1xRTT, "CDMA1XRTT"},
+    {LogCode_0xB186::cdmaHRPD, "CDMAHRPD"},
+};
+
+void printTechnologyFields(Rows& row, const LogCode_0xB186::Candidate& candidate)
+{
+    switch (candidate.technology()) {
+    case LogCode_0xB186::lte: {
+        const auto cell = candidate.lteFields();
+        row.print("E ARFCN", "%d", cell.earfcn);
+        row.print("Cell ID", "%d", cell.cellIdentity);
+        break;
+    }
+    case LogCode_0xB186::utran: {
+        const auto cell = candidate.utranFields();
+        row.print("U ARFCN", "%d", cell.uarfcn);
+        row.print("PSC", "%d", cell.primaryScramblingCode);
+        break;
+    }
+    case LogCode_0xB186::geran: {
+        const auto cell = candidate.geranFields();
+        row.print("ARFCN", "%d", cell.arfcn);
+        row.print("Band", "%d", cell.band);
+        row.print("BSIC ID", "%d", cell.bsic);
+        break;
+    }
+    case LogCode_0xB186::cdma1xRTT:
+    case LogCode_0xB186::cdmaHRPD: {
+        const auto cell = candidate.cdmaFields();
+        row.print("Band", "%d", cell.band);
+        row.print("Channel", "%d", cell.channel);
+        row.print("Pilot", "%d", cell.pilot);
+        break;
+    }
+    default: break;
+    }
+}
+
+DictionaryRef rowsOf(const LogCode_0xB186::Candidate& candidate)
+{
+    Rows row = Rows::make();
+    row.print("Candidate Priority", "%d", candidate.priority());
+    row.set("Candidate RAT Type", textFor(candidate.technology(), kTechnologies, "??"));
+    printTechnologyFields(row, candidate);
+    return row.dictionary();
+}
+
+} // namespace
+
+ReselectionCandidatesList::ReselectionCandidatesList(ClassDictionary& dict, CodeDictionary& codeDict)
+    : Base("Reselection Candidates List", {LogCode_0xB186::kCode}, dict, codeDict)
+{
+}
+
+void ReselectionCandidatesList::updateWithData(Packet packet, LogCode logCode)
+{
+    systemLog(Priority::warning, "%s", getSectionName().c_str());
+    if (logCode != LogCode_0xB186::kCode)
+        return reportUnknown(logCode);
+    if (packet.size() < LogCode_0xB186::kMinimumLength)
+        return;
+    clearSection();
+    const auto candidates = LogCode_0xB186(packet).candidates();
+    if (candidates.count() == 0)
+        return;
+    Array cells;
+    for (const auto& candidate : candidates) {
+        if (!candidate.isComplete())
+            break;
+        cells.append(rowsOf(candidate));
+    }
+    replaceSection(cells);
+}
+
+} // namespace orvex

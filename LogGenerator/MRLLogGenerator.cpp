@@ -1,0 +1,83 @@
+#include "MRLLogGenerator.h"
+
+#include "MTLDLFAddVersionReport.h"
+
+#include "Array.h"
+#include "SystemLog.h"
+#include "TextFormat.h"
+
+#include <utility>
+
+namespace orvex {
+
+namespace {
+// What the report has always said in place of the program's name and date.
+constexpr const char* kExecutableName = "EXECUTABLE_NAME";
+constexpr const char* kBuildDate = "Dec 19 2018 23:59:16";
+} // namespace
+
+MRLLogGenerator::MRLLogGenerator(const GeneratorEnvironment& environment)
+    : LogGenerator(environment)
+    , _binData(std::make_shared<Bytes>())
+{
+}
+
+BytesRef MRLLogGenerator::generateDlfFromState(const Dictionary& state) const
+{
+    const auto& [resources, clock, buildVersion] = environment();
+    const std::string version = buildVersion ? text("Orvex %s", buildVersion->c_str()) : "(none)";
+    const Date now = clock.now();
+    const Clock::Zone zone = clock.zoneAt(now);
+    const MTLDLFTimeInformation time{
+        .secondsSince1970 = static_cast<std::uint32_t>(static_cast<std::int64_t>(now.secondsSince1970)),
+        .zoneMinutes = static_cast<std::int16_t>(zone.secondsEastOfUTC / 60),
+        .isDaylightSaving = static_cast<std::uint8_t>(zone.isDaylightSaving ? 1 : 0),
+    };
+
+    auto dlf = std::make_shared<Bytes>(kMTLDLFVersionReportLength);
+    std::uint32_t written = 0;
+    const std::uint32_t result = MTLDLFAddVersionReport(dlf->data(), static_cast<std::uint32_t>(dlf->size()),
+        written, 1, 1, version.c_str(), kExecutableName, kBuildDate, time);
+    if (result != 0) {
+        systemLog(Priority::dlfFailure, "Could not write DLF header (result=%d)", static_cast<int>(result));
+        return nullptr;
+    }
+
+    const ArrayRef history = state["History"].array();
+    if (!history)
+        return dlf;
+    for (const Value& element : *history) {
+        const DictionaryRef entry = element.dictionary();
+        if (!entry || (*entry)["DisplayState"].isNull())
+            continue;
+        const BytesRef packets = (*entry)["DisplayState"].data();
+        if (!packets) {
+            systemLog(Priority::dlfFailure,
+                "Got wrong class writing history to DLF; aborting writing the DLF file");
+            return nullptr;
+        }
+        if (packets->size() >= 2)
+            dlf->insert(dlf->end(), packets->begin() + 1, packets->end());
+    }
+    return dlf;
+}
+
+ArrayRef MRLLogGenerator::getSaveContentsFromState(const Dictionary& state) const
+{
+    const ArrayRef history = state["History"].array();
+    auto contents = history ? history->shallowCopy() : Array::make();
+    if (const BytesRef dlf = generateDlfFromState(state)) {
+        contents->append(Dictionary::make({
+            {"Description", text("DLF binary (%d bytes)", static_cast<int>(dlf->size()))},
+            {"DLF", dlf},
+        }));
+    }
+    return contents;
+}
+
+void MRLLogGenerator::handOverBinData(Dictionary& state)
+{
+    state.set("DisplayState", std::exchange(_binData, std::make_shared<Bytes>()));
+}
+
+} // namespace orvex

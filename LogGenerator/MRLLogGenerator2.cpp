@@ -1,0 +1,197 @@
+#include "MRLLogGenerator2.h"
+
+#include "Array.h"
+#include "SystemLog.h"
+#include "TelephonyConstants.h"
+#include "TextFormat.h"
+
+#include <charconv>
+
+namespace orvex {
+
+namespace {
+constexpr std::uint8_t kPrefixMark = 0x81;
+constexpr std::size_t kPrefixLength = 2;
+constexpr std::uint8_t kLogTypeBaseband = 1;
+constexpr std::uint8_t kLogTypeExtra = 255;
+
+// Says that a generator comes into being before the generators below it say so themselves.
+const GeneratorEnvironment& announced(const GeneratorEnvironment& environment, const ClassIndex* cIndex)
+{
+    systemLog(Priority::error, "Creating MRLLogGenerator2 object with %p", static_cast<const void*>(cIndex));
+    return environment;
+}
+} // namespace
+
+MRLLogGenerator2::MRLLogGenerator2(
+    const GeneratorEnvironment& environment, std::string pListName, std::unique_ptr<ClassIndex> cIndex)
+    : MRLLogGenerator(announced(environment, cIndex.get()))
+    , _pListName(std::move(pListName))
+    , _cIndex(std::move(cIndex))
+{
+    const long owners = 1; // this generator alone
+    systemLog(Priority::error, "Class Index: %ld", owners);
+}
+
+MRLLogGenerator2::~MRLLogGenerator2()
+{
+    // All Marlin technologies say this, whichever they are.
+    systemLog(Priority::warning, "MRL_GSMLogGenerator is destructed %p", static_cast<const void*>(this));
+}
+
+void MRLLogGenerator2::updateState(Dictionary& state, ByteView data)
+{
+    getDisplayFromState(state);
+    updateWithData(data);
+    _binData->insert(_binData->end(), data.begin(), data.end());
+}
+
+void MRLLogGenerator2::updateWithData(ByteView data)
+{
+    if (data.size() < kPacketHeaderLength)
+        return;
+    const Packet packet = data[0] == kPrefixMark ? data.subspan(kPrefixLength) : data;
+    const PacketReader header(packet);
+    const std::uint8_t logType = header.u8(0);
+    if (logType != kLogTypeBaseband && logType != kLogTypeExtra) {
+        systemLog(Priority::error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(logType));
+        return;
+    }
+    const LogCode code = header.u16(3) | (logType == kLogTypeExtra ? kExtraCodeBase : 0);
+    const auto* subscribers = _cIndex->getSubscribers(code);
+    if (!subscribers)
+        return;
+    for (Base* section : *subscribers)
+        section->updateWithData(packet, code);
+}
+
+Value MRLLogGenerator2::generateLogUsingState(Dictionary& state)
+{
+    const Value display = getDisplayFromState(state);
+    handOverBinData(state);
+    updateHistoryInState(state, environment().clock);
+    return display;
+}
+
+Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
+{
+    const DictionaryRef display = state["Display"].dictionary();
+    if (display && display == _boundDisplay.lock())
+        return display;
+    const Value& templateName = state["TemplateName"];
+    if (display && (templateName.isNull() || templateName == Value(_pListName))) {
+        // The session went on with a new generator, after the service came back say: the display stays, and
+        // the new sections take over where the old ones stopped writing.
+        bindToDisplay(state["Template"], display);
+        _boundDisplay = display;
+        return display;
+    }
+    if (display)
+        state.remove("Template"); // another technology's
+
+    const DictionaryRef skeleton = templateFromState(state);
+    if (!skeleton)
+        return {};
+    systemLog(Priority::warning, "Initialized class index: %p, Self: %p",
+        static_cast<const void*>(_cIndex.get()), static_cast<const void*>(this));
+    _cIndex->status();
+    const Value built = processTemplate(skeleton);
+    printDict(built);
+    state.set("Display", built);
+    state.set("ExtraInfo", Dictionary::make());
+    _boundDisplay = built.dictionary();
+    return {}; // deliberately: only the next call gets it
+}
+
+DictionaryRef MRLLogGenerator2::templateFromState(Dictionary& state) const
+{
+    if (auto skeleton = state["Template"].dictionary())
+        return skeleton;
+    auto skeleton = environment().resources.dictionaryNamed(_pListName);
+    if (!skeleton) {
+        systemLog(Priority::error, "Cannot load template for display");
+        return nullptr;
+    }
+    state.set("Template", skeleton);
+    state.set("TemplateName", _pListName);
+    return skeleton;
+}
+
+Value MRLLogGenerator2::processTemplate(const Value& object)
+{
+    if (object.string())
+        return object;
+    if (const auto dictionary = object.dictionary()) {
+        auto result = Dictionary::make();
+        for (const auto& [key, value] : *dictionary) {
+            const Value processed = processTemplate(value); // children are bound before their parent
+            bindSection(key, processed);
+            result->set(key, processed);
+        }
+        return result;
+    }
+    if (const auto array = object.array()) {
+        auto result = Array::make();
+        for (const Value& element : *array)
+            result->append(processTemplate(element));
+        return result;
+    }
+    systemLog(Priority::error, "Received an object of unknown type");
+    systemLog(Priority::warning, "Processing the template");
+    throw InvalidTemplateException(
+        text("template %s holds a value of kind %s", _pListName.c_str(), nameOf(object.kind())));
+}
+
+void MRLLogGenerator2::bindToDisplay(const Value& templateObject, const Value& display)
+{
+    const auto skeleton = templateObject.dictionary();
+    const auto shown = display.dictionary();
+    if (!skeleton || !shown)
+        return;
+    for (const auto& [key, value] : *skeleton) {
+        bindToDisplay(value, (*shown)[key]);
+        bindSection(key, (*shown)[key]);
+    }
+}
+
+void MRLLogGenerator2::bindSection(std::string_view name, const Value& container)
+{
+    if (Base* section = _cIndex->getClass(name))
+        section->updateSectionRef(container);
+}
+
+void MRLLogGenerator2::printDict(const Value& object) const
+{
+    if (object.string())
+        return;
+    if (const auto dictionary = object.dictionary()) {
+        for (const auto& entry : *dictionary)
+            printDict(entry.value);
+    } else if (const auto array = object.array()) {
+        for (const Value& element : *array)
+            printDict(element);
+    } else {
+        systemLog(Priority::error, "Received an object of unknown type");
+    }
+}
+
+DictionaryRef MRLLogGenerator2::getStartCommand() const
+{
+    auto logCodes = Array::make();
+    auto extraCodes = Array::make();
+    for (const std::string& key : _cIndex->getAllLogCodes()) {
+        LogCode code = 0;
+        std::from_chars(key.data(), key.data() + key.size(), code);
+        if (code >= kExtraCodeBase)
+            extraCodes->append(code - kExtraCodeBase);
+        else
+            logCodes->append(code);
+    }
+    return Dictionary::make({
+        {telephony::kSetState, telephony::kStreaming},
+        {telephony::kSetMarlinLogCodes, logCodes},
+        {telephony::kSetKoratExtraCodes, extraCodes},
+    });
+}
+
+} // namespace orvex

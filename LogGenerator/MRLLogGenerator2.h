@@ -1,0 +1,60 @@
+#pragma once
+
+#include "ClassIndex.h"
+#include "MRLLogGenerator.h"
+
+#include <stdexcept>
+
+namespace orvex {
+
+// A template that holds something else than texts, arrays and dictionaries. Nobody catches it.
+class InvalidTemplateException : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+// The generator of the Marlin technologies. It decodes nothing itself: a template resource lays out the
+// display, a class index holds the sections, and every message is framed and routed by its log code to the
+// sections that want it.
+//
+// The template is a dictionary of texts, arrays and dictionaries. The entry under a section's name becomes
+// the section's own; what it holds is shown until the first packet. Besides the common keys the state holds
+// "Template" and "TemplateName", the resource it came from.
+class MRLLogGenerator2 : public MRLLogGenerator {
+public:
+    // `pListName` is the base name of the template resource.
+    MRLLogGenerator2(
+        const GeneratorEnvironment& environment, std::string pListName, std::unique_ptr<ClassIndex> cIndex);
+    ~MRLLogGenerator2() override;
+
+    DictionaryRef getStartCommand() const override;
+    void updateState(Dictionary& state, ByteView data) override;
+    Value generateLogUsingState(Dictionary& state) override;
+
+    // Frames one message and routes it:
+    //
+    //   at least 13 bytes, or it is ignored
+    //   0x81 in byte 0: the first 2 bytes are a prefix and are removed
+    //   log type 1: routed under its code; 255: under 0xFF0000 plus its code; others are dropped
+    void updateWithData(ByteView data);
+
+    // A new display for the template, its sections bound. A value of another kind than text, array or
+    // dictionary throws InvalidTemplateException.
+    Value processTemplate(const Value& object);
+
+    // The state's display. The call that has to build it first returns null; the next one returns it.
+    Value getDisplayFromState(Dictionary& state);
+
+private:
+    void printDict(const Value& object) const;
+    void bindToDisplay(const Value& templateObject, const Value& display);
+    void bindSection(std::string_view name, const Value& container);
+    // Null, with a log line, when there is no template.
+    DictionaryRef templateFromState(Dictionary& state) const;
+
+    std::string _pListName;
+    std::unique_ptr<ClassIndex> _cIndex;
+    std::weak_ptr<Dictionary> _boundDisplay; // whose entries the sections write into
+};
+
+} // namespace orvex

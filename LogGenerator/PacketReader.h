@@ -1,0 +1,77 @@
+#pragma once
+
+#include "MessagePort.h"
+
+#include <cstddef>
+#include <cstdint>
+
+namespace orvex {
+
+// A log packet as the sections get it, the optional 2-byte prefix removed:
+//
+//   0     u8    log type: 1 baseband packet, 255 extra packet
+//   1     u16   not interpreted
+//   3     u16   log code
+//   5     8     time, not interpreted
+//   13    ...   payload
+using Packet = ByteView;
+
+// The 16-bit code of a baseband packet, or kExtraCodeBase plus the 16-bit code of an extra packet.
+using LogCode = std::int32_t;
+
+inline constexpr std::size_t kPacketHeaderLength = 13;
+
+// Extra packets come from the telephony service, not from the baseband. Each carries a property list.
+inline constexpr LogCode kExtraCodeBase = 0xFF0000;
+inline constexpr LogCode kExtraCodeSimFiles = 0xFF0000;
+inline constexpr LogCode kExtraCodeCellMonitorList = 0xFF0001;
+inline constexpr LogCode kExtraCodePDPContexts = 0xFF0002;
+
+// The only place that touches raw bytes. Little-endian reads at an offset; a read that does not lie wholly
+// inside the packet yields 0.
+class PacketReader {
+public:
+    explicit PacketReader(Packet packet)
+        : _bytes(packet)
+    {
+    }
+
+    std::size_t size() const { return _bytes.size(); }
+    bool contains(std::size_t offset, std::size_t width) const
+    {
+        return offset <= size() && width <= size() - offset;
+    }
+
+    std::uint8_t u8(std::size_t offset) const { return static_cast<std::uint8_t>(number<1>(offset)); }
+    std::uint16_t u16(std::size_t offset) const { return static_cast<std::uint16_t>(number<2>(offset)); }
+    std::uint32_t u32(std::size_t offset) const { return number<4>(offset); }
+    std::int16_t s16(std::size_t offset) const { return static_cast<std::int16_t>(u16(offset)); }
+    std::int32_t s32(std::size_t offset) const { return static_cast<std::int32_t>(u32(offset)); }
+
+    // An unsigned field of up to 32 bits in the bit string that starts at a byte: bit 0 is the least
+    // significant bit of that byte, bit 8 that of the next.
+    std::uint32_t bits(std::size_t offset, std::size_t firstBit, std::size_t width) const;
+
+    // All bytes from the offset on; empty beyond the end.
+    PacketReader from(std::size_t offset) const
+    {
+        return PacketReader(offset < size() ? _bytes.subspan(offset) : Packet());
+    }
+    Packet bytes() const { return _bytes; }
+
+private:
+    template <std::size_t width>
+    std::uint32_t number(std::size_t offset) const
+    {
+        if (!contains(offset, width))
+            return 0;
+        std::uint32_t result = 0;
+        for (std::size_t i = 0; i < width; ++i)
+            result |= static_cast<std::uint32_t>(_bytes[offset + i]) << (8 * i);
+        return result;
+    }
+
+    Packet _bytes;
+};
+
+} // namespace orvex

@@ -1,0 +1,70 @@
+#pragma once
+
+#include "ArrayOutOfBoundsException.h"
+#include "PacketReader.h"
+
+namespace orvex {
+
+// The repeated records of a packet: `count` of them, as the packet itself says, `stride` bytes apart from
+// `start` on. Record is made from a reader that begins at the record's first byte.
+//
+// Iterating ends at the last record that lies wholly inside the packet, whatever the count claims. Indexing
+// goes by the count alone: at or beyond it throws ArrayOutOfBoundsException, and fields of a record that the
+// packet does not hold read as 0.
+template <typename Record>
+class RecordList {
+public:
+    RecordList(PacketReader packet, std::size_t start, std::size_t stride, std::size_t count)
+        : _packet(packet)
+        , _start(start)
+        , _stride(stride)
+        , _count(count)
+    {
+    }
+
+    std::size_t count() const { return _count; }
+    Record operator[](std::size_t index) const
+    {
+        if (index >= _count)
+            throw ArrayOutOfBoundsException();
+        return Record(_packet.from(_start + index * _stride));
+    }
+
+    class Iterator {
+    public:
+        Iterator(const RecordList& list, std::size_t index)
+            : _list(list)
+            , _index(index)
+        {
+        }
+
+        Record operator*() const { return _list[_index]; }
+        Iterator& operator++()
+        {
+            ++_index;
+            return *this;
+        }
+        bool operator==(const Iterator& other) const { return _index == other._index; }
+
+    private:
+        const RecordList& _list;
+        std::size_t _index;
+    };
+
+    Iterator begin() const { return {*this, 0}; }
+    Iterator end() const { return {*this, countInside()}; }
+
+private:
+    std::size_t countInside() const
+    {
+        const std::size_t available = _packet.from(_start).size() / _stride;
+        return available < _count ? available : _count;
+    }
+
+    PacketReader _packet;
+    std::size_t _start;
+    std::size_t _stride;
+    std::size_t _count;
+};
+
+} // namespace orvex
