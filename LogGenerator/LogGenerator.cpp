@@ -1,6 +1,7 @@
 #include "LogGenerator.h"
 
 #include "LTE/LTELogGenerator.h"
+#include "UTRAN/UTRANLogGenerator.h"
 
 #include "Array.h"
 #include "SystemLog.h"
@@ -44,7 +45,7 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
         {telephony::kTechnologyMRL_GSM, nullptr},
         {telephony::kTechnologyMRL_CDMA, nullptr},
         {telephony::kTechnologyMRL_LTE, &LTELogGenerator::generator},
-        {telephony::kTechnologyMRL_UTRAN2, nullptr},
+        {telephony::kTechnologyMRL_UTRAN2, &UTRANLogGenerator::generator},
     };
     for (const Choice& choice : kChoices) {
         if (technology == Value(choice.technology))

@@ -48,6 +48,13 @@ public:
     virtual ArrayRef getSaveContentsFromState(const Dictionary& state) const = 0;
 
 protected:
+    // Marks the construction of a generator on which no set-up runs, not even the log line of its birth.
+    struct NeverSetUp { };
+    LogGenerator(const GeneratorEnvironment& environment, NeverSetUp)
+        : _environment(environment)
+    {
+    }
+
     const GeneratorEnvironment& environment() const { return _environment; }
 
 private:

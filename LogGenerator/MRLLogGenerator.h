@@ -22,6 +22,12 @@ public:
     ArrayRef getSaveContentsFromState(const Dictionary& state) const override;
 
 protected:
+    // Without a buffer until the first display request.
+    MRLLogGenerator(const GeneratorEnvironment& environment, NeverSetUp tag)
+        : LogGenerator(environment, tag)
+    {
+    }
+
     // Moves the packets gathered so far into the state's "DisplayState" and starts anew.
     void handOverBinData(Dictionary& state);
 

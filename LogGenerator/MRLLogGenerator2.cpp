@@ -43,7 +43,8 @@ void MRLLogGenerator2::updateState(Dictionary& state, ByteView data)
 {
     getDisplayFromState(state);
     updateWithData(data);
-    _binData->insert(_binData->end(), data.begin(), data.end());
+    if (_binData)
+        _binData->insert(_binData->end(), data.begin(), data.end());
 }
 
 void MRLLogGenerator2::updateWithData(ByteView data)
@@ -58,7 +59,7 @@ void MRLLogGenerator2::updateWithData(ByteView data)
         return;
     }
     const LogCode code = header.u16(3) | (logType == kLogTypeExtra ? kExtraCodeBase : 0);
-    const auto* subscribers = _cIndex->getSubscribers(code);
+    const auto* subscribers = _cIndex ? _cIndex->getSubscribers(code) : nullptr;
     if (!subscribers)
         return;
     for (Base* section : *subscribers)
@@ -94,7 +95,8 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
         return {};
     systemLog(Priority::warning, "Initialized class index: %p, Self: %p",
         static_cast<const void*>(_cIndex.get()), static_cast<const void*>(this));
-    _cIndex->status();
+    if (_cIndex)
+        _cIndex->status();
     const Value built = processTemplate(skeleton);
     printDict(built);
     state.set("Display", built);
@@ -107,7 +109,7 @@ DictionaryRef MRLLogGenerator2::templateFromState(Dictionary& state) const
 {
     if (auto skeleton = state["Template"].dictionary())
         return skeleton;
-    auto skeleton = environment().resources.dictionaryNamed(_pListName);
+    const auto skeleton = _pListName.empty() ? nullptr : environment().resources.dictionaryNamed(_pListName);
     if (!skeleton) {
         systemLog(Priority::error, "Cannot load template for display");
         return nullptr;
@@ -156,7 +158,7 @@ void MRLLogGenerator2::bindToDisplay(const Value& templateObject, const Value& d
 
 void MRLLogGenerator2::bindSection(std::string_view name, const Value& container)
 {
-    if (Base* section = _cIndex->getClass(name))
+    if (Base* section = _cIndex ? _cIndex->getClass(name) : nullptr)
         section->updateSectionRef(container);
 }
 
@@ -179,7 +181,7 @@ DictionaryRef MRLLogGenerator2::getStartCommand() const
 {
     auto logCodes = Array::make();
     auto extraCodes = Array::make();
-    for (const std::string& key : _cIndex->getAllLogCodes()) {
+    for (const std::string& key : _cIndex ? _cIndex->getAllLogCodes() : std::vector<std::string>()) {
         LogCode code = 0;
         std::from_chars(key.data(), key.data() + key.size(), code);
         if (code >= kExtraCodeBase)

@@ -45,6 +45,13 @@ public:
     // The state's display. The call that has to build it first returns null; the next one returns it.
     Value getDisplayFromState(Dictionary& state);
 
+protected:
+    // Without template and class index.
+    MRLLogGenerator2(const GeneratorEnvironment& environment, NeverSetUp tag)
+        : MRLLogGenerator(environment, tag)
+    {
+    }
+
 private:
     void printDict(const Value& object) const;
     void bindToDisplay(const Value& templateObject, const Value& display);
@@ -53,7 +60,7 @@ private:
     DictionaryRef templateFromState(Dictionary& state) const;
 
     std::string _pListName;
-    std::unique_ptr<ClassIndex> _cIndex;
+    std::unique_ptr<ClassIndex> _cIndex;     // null in a generator that was never set up
     std::weak_ptr<Dictionary> _boundDisplay; // whose entries the sections write into
 };
 

@@ -12,7 +12,7 @@ class Resources {
 public:
     virtual ~Resources() = default;
 
-    // The paths of all of them, sorted by name.
+    // The file names of all of them, relative to where resources are kept, sorted.
     virtual std::vector<std::string> propertyListPaths() const = 0;
     // The dictionary in the resource of that base name; null when it is missing, is no property list or
     // holds something else. Why is said in the system log.
