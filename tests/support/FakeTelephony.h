@@ -1,0 +1,117 @@
+#pragma once
+
+#include "MessagePort.h"
+#include "PropertyList.h"
+#include "TelephonyConstants.h"
+#include "TelephonyService.h"
+
+#include "Dictionary.h"
+
+#include <map>
+
+namespace orvex::test {
+
+// A port that is just there until it is invalidated.
+template<typename Interface>
+class FakePort : public Interface {
+public:
+    bool isValid() const override { return valid; }
+    void invalidate() override
+    {
+        if (!std::exchange(valid, false))
+            return;
+        if (const auto callback = std::exchange(_callback, {}))
+            callback();
+    }
+    void setInvalidationCallback(std::function<void()> callback) override { _callback = std::move(callback); }
+
+    bool valid = true;
+
+private:
+    std::function<void()> _callback;
+};
+
+// The telephony service and its message ports in one, with a switch for everything that can go wrong. As it
+// comes, it answers with `technology` and takes every command.
+class FakeTelephony final : public MessagePorts, public TelephonyService {
+public:
+    // What goes wrong.
+    bool localPortFails = false;
+    bool localPortExists = false;
+    bool serviceIsAbsent = false;
+    long channelError = 0;
+    std::optional<std::string> remotePortName = "org.orvex.Korat.Test";
+    bool remotePortFails = false;
+    RemotePort::Status requestStatus = RemotePort::Status::success;
+    RemotePort::Status commandStatus = RemotePort::Status::success;
+    std::optional<Bytes> rawReply; // in place of the well-formed one; empty for no reply at all
+    Value technology = telephony::kTechnologyMRL_LTE;
+
+    // What was seen.
+    int localPortsCreated = 0;
+    std::vector<Value> requests;
+    std::vector<Value> commands;
+    std::shared_ptr<FakePort<LocalPort>> localPort;
+    std::shared_ptr<FakePort<RemotePort>> remotePort;
+
+    // Delivers a message to the local port.
+    void deliver(const Bytes& message, std::int32_t messageId = 0) { _receiver(messageId, message); }
+
+    LocalPortResult createLocalPort(const std::string&, Receiver receiver) override
+    {
+        ++localPortsCreated;
+        if (localPortFails)
+            return {};
+        _receiver = std::move(receiver);
+        localPort = std::make_shared<FakePort<LocalPort>>();
+        return {localPort, localPortExists};
+    }
+
+    std::shared_ptr<RemotePort> createRemotePort(const std::string&) override
+    {
+        if (remotePortFails)
+            return nullptr;
+        remotePort = std::make_shared<FakeRemotePort>(*this);
+        return remotePort;
+    }
+
+    std::unique_ptr<TelephonyConnection> connect(std::function<void()>) override
+    {
+        return serviceIsAbsent ? nullptr : std::make_unique<FakeConnection>(*this);
+    }
+
+private:
+    struct FakeConnection final : TelephonyConnection {
+        explicit FakeConnection(const FakeTelephony& owner) : _owner(owner) {}
+        LogChannelReply createNetworkMonitorLogChannel(const std::string&) override
+        {
+            return {0, _owner.channelError, _owner.remotePortName};
+        }
+        const FakeTelephony& _owner;
+    };
+
+    struct FakeRemotePort final : FakePort<RemotePort> {
+        explicit FakeRemotePort(FakeTelephony& owner) : _owner(owner) {}
+        Status send(std::int32_t, ByteView data, std::chrono::milliseconds) override
+        {
+            _owner.commands.push_back(propertyListFromData(data).value.value_or(Value()));
+            return _owner.commandStatus;
+        }
+        SendResult request(
+            std::int32_t, ByteView data, std::chrono::milliseconds, std::chrono::milliseconds) override
+        {
+            _owner.requests.push_back(propertyListFromData(data).value.value_or(Value()));
+            if (_owner.requestStatus != Status::success)
+                return {_owner.requestStatus, std::nullopt};
+            if (_owner.rawReply)
+                return {Status::success, _owner.rawReply->empty() ? std::nullopt : _owner.rawReply};
+            return {Status::success, propertyListXML(Dictionary::make({{"GetTechnology", _owner.technology}}))};
+        }
+        std::size_t pendingBytes() const override { return 0; }
+        FakeTelephony& _owner;
+    };
+
+    Receiver _receiver;
+};
+
+} // namespace orvex::test

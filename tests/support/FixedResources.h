@@ -1,0 +1,30 @@
+#pragma once
+
+#include "Resources.h"
+
+#include "Dictionary.h"
+
+#include <map>
+
+namespace orvex::test {
+
+// Resources that the test lays out by base name.
+class FixedResources final : public Resources {
+public:
+    std::vector<std::string> propertyListPaths() const override
+    {
+        std::vector<std::string> paths;
+        for (const auto& [name, dictionary] : templates)
+            paths.push_back(name + ".plist");
+        return paths;
+    }
+    DictionaryRef dictionaryNamed(const std::string& baseName) const override
+    {
+        const auto found = templates.find(baseName);
+        return found == templates.end() ? nullptr : found->second;
+    }
+
+    std::map<std::string, DictionaryRef> templates;
+};
+
+} // namespace orvex::test
