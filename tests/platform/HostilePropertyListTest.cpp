@@ -1,0 +1,218 @@
+#include "PropertyList.h"
+
+#include "PropertyListForms.h"
+
+#include "Array.h"
+#include "Dictionary.h"
+
+#include <gmock/gmock.h>
+
+#include <random>
+
+namespace orvex {
+namespace {
+
+using test::binaryList;
+using test::bytesOf;
+using test::xmlList;
+using testing::HasSubstr;
+
+std::string repeated(std::string_view text, std::size_t count)
+{
+    std::string result;
+    for (std::size_t i = 0; i < count; ++i)
+        result += text;
+    return result;
+}
+
+std::string nestedXML(std::size_t depth)
+{
+    return xmlList(repeated("<array>", depth) + repeated("</array>", depth));
+}
+
+TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
+{
+    const struct {
+        std::string xml;
+        const char* reason;
+    } cases[] = {
+        {nestedXML(257), "nested deeper than 256"},
+        {nestedXML(1'000'000), "nested deeper than 256"},
+        {repeated("<array>", 1'000'000), "an element outside of <plist>"},
+        {xmlList(repeated("<dict><key>k</key>", 300)), "nested deeper"},
+        {xmlList("<array>" + repeated("<true/>", 2'000'000) + "</array>"), "more than 2000000 values"},
+        {std::string((std::size_t{64} << 20) + 1, ' '), "longer than"},
+        {"", "no data"},
+        {"what", "text outside"},
+        {xmlList(""), "no value"},
+        {xmlList("<true/><true/>"), "more than one value"},
+        {xmlList("<array><true/></dict>"), "closes nothing"},
+        {xmlList("<array>text</array>"), "text outside"},
+        {xmlList("<string>a<array></string>"), "an element inside of <string>"},
+        {xmlList("<lamp/>"), "an unknown element"},
+        {xmlList("<dict><key>a</key></dict>"), "a key without a value"},
+        {xmlList("<dict><true/></dict>"), "a value without a key"},
+        {xmlList("<dict><key>a</key><key>b</key></dict>"), "a key in the place"},
+        {xmlList("<array><key>a</key></array>"), "a key in the place"},
+        {xmlList("<integer>12x</integer>"), "the content of <integer>"},
+        {xmlList("<integer/>"), "the content of <integer>"},
+        {xmlList("<integer>18446744073709551616</integer>"), "the content of <integer>"},
+        {xmlList("<integer>-9223372036854775809</integer>"), "the content of <integer>"},
+        {xmlList("<real>1,5</real>"), "the content of <real>"},
+        {xmlList("<date>today</date>"), "the content of <date>"},
+        {xmlList("<data>A*</data>"), "the content of <data>"},
+        {xmlList("<true>no</true>"), "the content of <true>"},
+        {xmlList("<dict><key>a&#0;b</key><true/></dict>"), "malformed"},
+        {xmlList("<dict><key>a&#x00;</key><true/></dict>"), "malformed"},
+        {xmlList("<string>&bomb;</string>"), "malformed"},
+        {xmlList(std::string("<string>\0</string>", 18)), "a zero byte"},
+        {"<!DOCTYPE plist [<!ENTITY a \"&b;\">]><plist><true/></plist>", "with declarations"},
+        // Where parsers do not agree on what is skipped, a count would miss what hides there.
+        {xmlList("<array><?a \" ?></array><?b \" ?></array>"), "a malformed processing instruction"},
+        {xmlList("<array a=\">\"></array>"), "a malformed tag"},
+        {xmlList("<?><array/><?a?>"), "a malformed processing instruction"},
+    };
+    for (const auto& test : cases) {
+        const auto result = propertyListFromData(bytesOf(test.xml));
+        EXPECT_FALSE(result.value) << test.xml.substr(0, 200);
+        EXPECT_THAT(result.error, HasSubstr(test.reason)) << test.xml.substr(0, 200);
+    }
+    EXPECT_TRUE(propertyListFromData(bytesOf(nestedXML(256))).value);
+}
+
+TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
+{
+    std::vector<Bytes> chain(300);
+    for (std::size_t i = 0; i < 250; ++i)
+        chain[i] = {0xA1, static_cast<std::uint8_t>(i + 1)};
+    chain[250] = {0xA1, 0};
+    std::vector<Bytes> laughs(40);
+    for (std::size_t i = 0; i < 39; ++i)
+        laughs[i] =
+            Bytes{0xA4, std::uint8_t(i + 1), std::uint8_t(i + 1), std::uint8_t(i + 1), std::uint8_t(i + 1)};
+    laughs[39] = {0x09};
+    // 255 x 255 references to one text of 4096 bytes.
+    Bytes many{0xAF, 0x10, 0xFF};
+    many.resize(3 + 255, 1);
+    Bytes more{0xAF, 0x10, 0xFF};
+    more.resize(3 + 255, 2);
+    Bytes longText{0x5F, 0x11, 0x10, 0x00};
+    longText.resize(4 + 4096, 'x');
+
+    const struct {
+        const char* name;
+        Bytes list;
+        const char* reason;
+    } cases[] = {
+        {"header alone", bytesOf("bplist00"), "shorter"},
+        {"cycle", binaryList({{0xA1, 0}}), "nested deeper"},
+        {"long cycle", binaryList(chain), "nested deeper"},
+        {"dictionary cycle", binaryList({{0xD1, 1, 0}, {0x51, 'a'}}), "nested deeper"},
+        {"shared arrays multiply", binaryList(laughs), "more than 2000000 values"},
+        {"shared text multiplies", binaryList({many, more, longText}), "shared texts"},
+        {"root not there", binaryList({}), "not there"},
+        {"reference not there", binaryList({{0xA1, 9}}), "not there"},
+        {"array longer than the list",
+            binaryList({{0xAF, 0x13, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF}}),
+            "outside of the list"},
+        {"text longer than the list", binaryList({{0x5F, 0x12, 0x7F, 0xFF, 0xFF, 0xFF}}),
+            "outside of the list"},
+        {"UTF-16 half outside", binaryList({{0x62, 0, 'a', 0}}), "outside of the list"},
+        {"size is no number", binaryList({{0x5F, 0x51, 'a'}}), "malformed object"},
+        {"key is a number", binaryList({{0xD1, 1, 1}, {0x10, 1}}), "a key that is no text"},
+        {"zero in a key", binaryList({{0xD1, 1, 1}, {0x52, 'a', 0}}), "zero character"},
+        {"zero in a long key", binaryList({{0xD1, 1, 1}, {0x62, 0, 'a', 0, 0}}), "zero character"},
+        {"null", binaryList({{0xA1, 1}, {0x00}}), "malformed object"},
+        {"unknown kind", binaryList({{0x70}}), "unknown kind"},
+        {"integer of 128 bits", binaryList({{0x14, 1, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}}),
+            "malformed"},
+        {"integer cut off", binaryList({{0x13, 0, 0}}), "outside of the list"},
+    };
+    for (const auto& test : cases) {
+        const auto result = propertyListFromData(test.list);
+        EXPECT_FALSE(result.value) << test.name;
+        EXPECT_THAT(result.error, HasSubstr(test.reason)) << test.name;
+    }
+}
+
+// A list with every kind of value, in both forms.
+std::vector<Bytes> goodLists()
+{
+    const std::string xml =
+        "<?xml version=\"1.0\"?><!DOCTYPE plist PUBLIC \"-//A\" \"b\"><plist version=\"1.0\">"
+        "<dict><key>a &amp;</key><array><integer>-5</integer><real>1.5</real><true/>"
+        "<data>AAEC</data></array><key>b</key><date>2026-11-16T05:54:31Z</date><!-- c -->"
+        "<key>d</key><string>x<![CDATA[<y>]]>z</string><key>e</key><dict/></dict></plist>";
+    return {bytesOf(xml),
+        binaryList({{0xD3, 1, 2, 3, 4, 5, 6}, {0x51, 'a'}, {0x63, 0, 'b', 0xD8, 0x3D, 0xDE, 0x00},
+            {0x51, 'c'}, {0xA3, 7, 8, 9}, {0x09}, {0x5F, 0x10, 2, 'h', 'i'},
+            {0x13, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFE}, {0x33, 0x41, 0, 0, 0, 0, 0, 0, 0},
+            {0x43, 1, 2, 3}})};
+}
+
+TEST(HostilePropertyList, EveryTruncationIsAnError)
+{
+    for (const Bytes& list : goodLists()) {
+        ASSERT_EQ(propertyListFromData(list).error, "");
+        for (std::size_t length = 0; length < list.size(); ++length) {
+            const Bytes cut(list.begin(), list.begin() + static_cast<std::ptrdiff_t>(length));
+            const auto result = propertyListFromData(cut);
+            EXPECT_FALSE(result.value) << length;
+            EXPECT_NE(result.error, "") << length;
+        }
+    }
+}
+
+std::size_t depthOf(const Value& value)
+{
+    std::size_t inner = 0;
+    if (const auto array = value.array()) {
+        for (const Value& element : *array)
+            inner = std::max(inner, depthOf(element));
+    } else if (const auto dictionary = value.dictionary()) {
+        for (const auto& entry : *dictionary)
+            inner = std::max(inner, depthOf(entry.value));
+    } else {
+        return 0;
+    }
+    return inner + 1;
+}
+
+// Damage of any kind gives an error or a value, and never a value beyond the limits.
+TEST(HostilePropertyList, DamageNeverPassesTheLimits)
+{
+    std::mt19937 random(20261116); // NOLINT(bugprone-random-generator-seed): the same damage every time
+    const std::string_view pieces[] = {"<array>", "</array>", "<!--", "-->", "<![CDATA[", "]]>", "<?", "?>",
+        "\"", "'", "<", ">", "/", "<string>", "</string>", "<dict>", "<!DOCTYPE", "[", "<plist>", "</plist>",
+        "<key>"};
+    PropertyListLimits limits;
+    limits.maximumDepth = 3;
+    std::size_t values = 0;
+    for (const Bytes& list : goodLists()) {
+        const bool isText = list[0] == '<';
+        for (int round = 0; round < 20'000; ++round) {
+            Bytes damaged = list;
+            for (auto count = random() % 4 + 1; count > 0; --count) {
+                const std::size_t position = random() % damaged.size();
+                if (isText && random() % 2) {
+                    const auto piece = pieces[random() % std::size(pieces)];
+                    damaged.insert(
+                        damaged.begin() + static_cast<std::ptrdiff_t>(position), piece.begin(), piece.end());
+                } else {
+                    damaged[position] ^= static_cast<std::uint8_t>(1U << random() % 8);
+                }
+            }
+            const auto result = propertyListFromData(damaged, limits);
+            EXPECT_NE(result.value.has_value(), !result.error.empty());
+            EXPECT_EQ(result.error.find('\n'), std::string::npos);
+            if (result.value) {
+                ++values;
+                EXPECT_LE(depthOf(*result.value), limits.maximumDepth);
+            }
+        }
+    }
+    EXPECT_GT(values, 1000U) << "the damage is too great to get past the first check";
+}
+
+} // namespace
+} // namespace orvex

@@ -1,0 +1,198 @@
+#include "PropertyList.h"
+
+#include "Array.h"
+#include "Dictionary.h"
+#include "PropertyListForms.h"
+
+#include <gmock/gmock.h>
+
+#include <cmath>
+#include <limits>
+
+namespace orvex {
+namespace {
+
+using test::binaryList;
+using test::bytesOf;
+using test::xmlList;
+using testing::HasSubstr;
+
+Value data(Bytes bytes)
+{
+    return std::make_shared<Bytes>(std::move(bytes));
+}
+constexpr std::int64_t kLowest = std::numeric_limits<std::int64_t>::min();
+constexpr std::int64_t kHighest = std::numeric_limits<std::int64_t>::max();
+
+TEST(PropertyList, ReadsEachKindOfXMLValue)
+{
+    const struct {
+        const char* xml;
+        Value value;
+    } cases[] = {
+        {"<string>a&lt;b&amp;c &#228;</string>", "a<b&c \u00e4"},
+        {"<string>a<!-- <array> -->b<![CDATA[<c>]]></string>", "ab<c>"},
+        {"<string/>", ""},
+        {"<integer>-1</integer>", -1},
+        {"<integer> 0xFF </integer>", 255},
+        {"<integer>-9223372036854775808</integer>", kLowest},
+        {"<integer>9223372036854775807</integer>", kHighest},
+        {"<integer>9223372036854775808</integer>", 9223372036854775808.0},
+        {"<integer>18446744073709551615</integer>", 18446744073709551615.0},
+        {"<real>-0.25</real>", -0.25},
+        {"<real>6.02e23</real>", 6.02e23},
+        {"<true/>", true},
+        {"<false></false>", false},
+        {"<date>2026-11-16T05:54:31Z</date>", Date{1794808471}},
+        {"<date>1969-12-31T23:59:58Z</date>", Date{-2}},
+        {"<date>2150-01-02T03:04:05Z</date>", Date{5680379045}},
+        {"<data>AAH/\n\tfg==</data>", data({0, 1, 255, 126})},
+        {"<data/>", data({})},
+        {"<array/>", Array::make()},
+        {"<array><integer>1</integer><array><true/></array></array>", Array::make({1, Array::make({true})})},
+        {"<dict><key>b</key><integer>1</integer><key></key><dict/></dict>",
+            Dictionary::make({{"b", 1}, {"", Dictionary::make()}})},
+        {"<!-- <array> --><array\n></array ><?note <array> ?>", Array::make()},
+    };
+    for (const auto& test : cases) {
+        const auto result = propertyListFromData(bytesOf(xmlList(test.xml)));
+        ASSERT_TRUE(result.value) << test.xml << ": " << result.error;
+        EXPECT_TRUE(*result.value == test.value) << test.xml;
+    }
+    EXPECT_TRUE(propertyListFromData(bytesOf("\xEF\xBB\xBF <plist><true/></plist>")).value);
+    EXPECT_TRUE(
+        propertyListFromData(bytesOf("<!DOCTYPE plist PUBLIC \"-//A\" \"b.dtd\"><plist><true/></plist>"))
+            .value);
+}
+
+TEST(PropertyList, ReadsEachKindOfBinaryValue)
+{
+    const struct {
+        const char* name;
+        std::vector<Bytes> objects;
+        Value value;
+    } cases[] = {
+        {"ascii", {{0x52, 'h', 'i'}}, "hi"},
+        {"utf-16", {{0x62, 0x00, 0xE4, 0x20, 0xAC}}, "\u00e4\u20ac"},
+        {"long text", {{0x5F, 0x11, 0x00, 0x02, 'h', 'i'}}, "hi"},
+        {"one byte is never negative", {{0x10, 0xFF}}, 255},
+        {"two bytes", {{0x11, 0x12, 0x34}}, 0x1234},
+        {"negative", {{0x13, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFE}}, -2},
+        {"lowest", {{0x13, 0x80, 0, 0, 0, 0, 0, 0, 0}}, kLowest},
+        {"too large for a sign", {{0x14, 0, 0, 0, 0, 0, 0, 0, 0, 0x80, 0, 0, 0, 0, 0, 0, 0}},
+            9223372036854775808.0},
+        {"float", {{0x22, 0x3F, 0xC0, 0, 0}}, 1.5},
+        {"double", {{0x23, 0xBF, 0xD0, 0, 0, 0, 0, 0, 0}}, -0.25},
+        {"date with a fraction", {{0x33, 0x3F, 0xF8, 0, 0, 0, 0, 0, 0}}, Date{978307201.5}},
+        {"data", {{0x42, 0, 0xFF}}, data({0, 255})},
+        {"identifier", {{0x80, 5}}, {}},
+        {"shared element", {{0xA2, 1, 1}, {0x09}}, Array::make({true, true})},
+        {"dictionary", {{0xD2, 1, 2, 3, 4}, {0x51, 'z'}, {0x51, 'a'}, {0x08}, {0xA0}},
+            Dictionary::make({{"z", false}, {"a", Array::make()}})},
+    };
+    for (const auto& test : cases) {
+        const auto result = propertyListFromData(binaryList(test.objects));
+        ASSERT_TRUE(result.value) << test.name << ": " << result.error;
+        EXPECT_TRUE(*result.value == test.value) << test.name;
+    }
+}
+
+TEST(PropertyList, KeepsTheOrderOfKeysBothWays)
+{
+    const auto written =
+        propertyListXML(Dictionary::make({{"zulu", 1}, {"alpha", 2}, {"mike", 3}, {"10", 4}, {"9", 5}}));
+    ASSERT_TRUE(written);
+    const auto read = propertyListFromData(*written);
+    ASSERT_TRUE(read.value) << read.error;
+    std::string keys;
+    for (const auto& entry : *read.value->dictionary())
+        keys += entry.key + ' ';
+    EXPECT_EQ(keys, "zulu alpha mike 10 9 ");
+}
+
+TEST(PropertyList, WritesEachKindAsXML)
+{
+    const struct {
+        Value value;
+        const char* xml;
+    } cases[] = {
+        {"a<b>&\u00e4", "<string>a&lt;b&gt;&amp;\u00e4</string>"},
+        {std::string("\x01q\0\xFFq\xED\xA0\x80", 8),
+            "<string>\uFFFDq\uFFFD\uFFFDq\uFFFD\uFFFD\uFFFD</string>"},
+        {-1, "<integer>-1</integer>"},
+        {kLowest, "<integer>-9223372036854775808</integer>"},
+        {kHighest, "<integer>9223372036854775807</integer>"},
+        {-0.25, "<real>-0.25</real>"},
+        {true, "<true/>"},
+        {Date{1794808471.9}, "<date>2026-11-16T05:54:31Z</date>"},
+        {Date{-1.5}, "<date>1969-12-31T23:59:58Z</date>"},
+        {Dictionary::make({{"k\x02", Array::make()}}), "<key>k\uFFFD</key>\n\t<array/>"},
+        {data({0, 1, 255, 126}), "AAH/fg=="},
+    };
+    for (const auto& test : cases) {
+        const auto xml = propertyListXML(test.value);
+        ASSERT_TRUE(xml) << test.xml;
+        EXPECT_THAT(std::string(xml->begin(), xml->end()), HasSubstr(test.xml));
+        EXPECT_EQ(propertyListFromData(*xml).error, "");
+    }
+    // Reals come back exactly.
+    for (const double number : {0.1, 1e-300, 1.7976931348623157e308, -3.0, 123456789.123456789}) {
+        const auto read = propertyListFromData(propertyListXML(number).value_or(Bytes{}));
+        ASSERT_TRUE(read.value && read.value->real()) << number << read.error;
+        EXPECT_EQ(*read.value->real(), number);
+    }
+}
+
+TEST(PropertyList, RefusesToWriteWhatHasNoFormOrIsTooLarge)
+{
+    const auto nested = [](int depth) {
+        Value value = Array::make();
+        for (int i = 1; i < depth; ++i)
+            value = Array::make({value});
+        return value;
+    };
+    const auto loop = Array::make();
+    loop->append(loop);
+    Value doubling = Array::make();
+    for (int i = 0; i < 60; ++i)
+        doubling = Array::make({doubling, doubling});
+    const auto megabyte = std::make_shared<Bytes>(1 << 20);
+    const auto gigabyte = Array::make();
+    for (int i = 0; i < 1024; ++i)
+        gigabyte->append(megabyte);
+    const struct {
+        const char* name;
+        Value value;
+    } cases[] = {
+        {"null", {}},
+        {"null inside", Array::make({1, Dictionary::make({{"a", Value()}})})},
+        {"too deep", nested(257)},
+        {"holds itself", loop},
+        {"doubles sixty times", doubling},
+        {"one buffer a thousand times", gigabyte},
+        {"date too far", Date{5e9}},
+        {"no date", Date{std::nan("")}},
+    };
+    for (const auto& test : cases)
+        EXPECT_FALSE(propertyListXML(test.value)) << test.name;
+    loop->removeAll();
+
+    const auto deepest = propertyListXML(nested(256));
+    ASSERT_TRUE(deepest);
+    EXPECT_EQ(propertyListFromData(*deepest).error, "");
+}
+
+TEST(PropertyList, ManyValuesAreReadAndWrittenInGoodTime)
+{
+    const auto dictionary = Dictionary::make();
+    for (int i = 0; i < 100'000; ++i)
+        dictionary->set("key " + std::to_string(i), i);
+    const auto xml = propertyListXML(dictionary);
+    ASSERT_TRUE(xml);
+    const auto read = propertyListFromData(*xml);
+    ASSERT_TRUE(read.value) << read.error;
+    EXPECT_TRUE(*read.value == Value(dictionary));
+}
+
+} // namespace
+} // namespace orvex
