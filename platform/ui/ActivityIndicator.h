@@ -1,0 +1,33 @@
+#pragma once
+
+#include <QBasicTimer>
+#include <QWidget>
+
+namespace orvex {
+
+// The small spinner. Hidden while stopped. Its timer runs only while there is something to see.
+class ActivityIndicator final : public QWidget {
+public:
+    explicit ActivityIndicator(QWidget* parent = nullptr);
+
+    void startAnimating();
+    void stopAnimating();
+    bool isAnimating() const { return _isAnimating; }
+    // True while the timer runs.
+    bool isTicking() const { return _ticks.isActive(); }
+
+    QSize sizeHint() const override;
+    QSize minimumSizeHint() const override { return sizeHint(); }
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void showEvent(QShowEvent* event) override;
+    void hideEvent(QHideEvent* event) override;
+    void timerEvent(QTimerEvent* event) override;
+
+private:
+    bool _isAnimating = false;
+    QBasicTimer _ticks;
+};
+
+} // namespace orvex

@@ -1,0 +1,72 @@
+#pragma once
+
+#include "Animation.h"
+#include "Screen.h"
+
+#include <memory>
+#include <vector>
+
+namespace orvex {
+
+class NavigationBar;
+class Toolbar;
+
+// A stack of screens of which the top one is seen, between a title bar with a way back and a toolbar. Pushes
+// and pops slide; one that comes during another finishes that first. Escape, Backspace and the back key pop.
+class NavigationStack final : public QWidget {
+public:
+    class Delegate {
+    public:
+        virtual ~Delegate() = default;
+        // A push or a pop is about to bring the screen into view. Not called for the root of a new stack.
+        virtual void willShowScreen(NavigationStack& stack, Screen& screen, bool animated) = 0;
+    };
+
+    explicit NavigationStack(std::unique_ptr<Screen> root, QWidget* parent = nullptr);
+
+    // Held by address: clear it before it goes.
+    void setDelegate(Delegate* delegate) { _delegate = delegate; }
+
+    int count() const { return static_cast<int>(_screens.size()); }
+    Screen& screenAt(int index) const { return *_screens[static_cast<std::size_t>(index)]; }
+    Screen& topScreen() const { return *_screens.back(); }
+    NavigationBar& navigationBar() const { return *_bar; }
+
+    void push(std::unique_ptr<Screen> screen, bool animated);
+    // The root stays.
+    void pop(bool animated) { popTo(count() - 2, animated); }
+    // Drops every screen above the index. The screens live on until the slide is over and control is back in
+    // the event loop, so that a screen may pop itself.
+    void popTo(int index, bool animated);
+    bool isAnimating() const { return _slide.isRunning(); }
+
+    void setToolbarHidden(bool hidden);
+
+    // Told by screens.
+    void titleChanged();
+    void toolbarItemsChanged(const Screen& screen);
+
+protected:
+    void resizeEvent(QResizeEvent* event) override;
+    void showEvent(QShowEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+
+private:
+    enum class Direction { push, pop };
+
+    void adopt(std::unique_ptr<Screen> screen);
+    void announce(Screen& leaving, bool animated);
+    void slide(Screen& leaving, Direction direction, bool animated);
+    void layoutParts();
+
+    NavigationBar* _bar;
+    QWidget* _pages;
+    Toolbar* _toolbar;
+    std::vector<Screen*> _screens; // children of _pages
+    Delegate* _delegate = nullptr;
+    bool _rootHasAppeared = false;
+    Transition _slide{this};
+};
+
+} // namespace orvex

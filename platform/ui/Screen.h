@@ -1,0 +1,45 @@
+#pragma once
+
+#include "ToolbarRow.h"
+
+#include <QPointer>
+#include <QWidget>
+
+#include <vector>
+
+namespace orvex {
+
+class NavigationStack;
+
+// One page of a navigation stack, with its title and its toolbar items.
+class Screen : public QWidget {
+public:
+    explicit Screen(QWidget* parent = nullptr);
+    ~Screen() override;
+
+    QString title() const { return _title; }
+    void setTitle(const QString& title);
+
+    void setToolbarItems(std::vector<ToolbarItem> items, bool animated);
+    // Null until items were set.
+    ToolbarRow* toolbarRow() const { return _toolbarRow; }
+
+    // The stack the screen is on; null before its push.
+    NavigationStack* navigationStack() const { return _stack; }
+
+    // Called by the stack, before the screen comes into view and before it goes.
+    virtual void viewWillAppear(bool /*animated*/) { }
+    virtual void viewWillDisappear(bool /*animated*/) { }
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+
+private:
+    friend class NavigationStack;
+
+    QString _title;
+    QPointer<ToolbarRow> _toolbarRow; // owned; its parent is whichever bar shows it
+    NavigationStack* _stack = nullptr;
+};
+
+} // namespace orvex

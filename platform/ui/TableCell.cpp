@@ -1,0 +1,70 @@
+#include "TableCell.h"
+
+#include "Chevron.h"
+#include "Theme.h"
+
+#include <QPainter>
+
+#include <algorithm>
+#include <utility>
+
+namespace orvex {
+
+namespace {
+constexpr int kSeparatorLeft = 10;
+constexpr double kChevronWidth = 6.5;
+constexpr double kChevronHeight = 12;
+constexpr double kChevronRight = 14; // from the chevron's tip to the edge
+constexpr int kDisclosureWidth = 20; // what the chevron takes from the content view
+} // namespace
+
+TableCell::TableCell(std::string reuseIdentifier)
+    : _reuseIdentifier(std::move(reuseIdentifier))
+    , _contentView(new QWidget(this))
+{
+    setAttribute(Qt::WA_TransparentForMouseEvents);
+}
+
+void TableCell::setAccessory(Accessory accessory)
+{
+    if (_accessory == accessory)
+        return;
+    _accessory = accessory;
+    layoutSubviews();
+    update();
+}
+
+void TableCell::setHighlighted(bool highlighted)
+{
+    if (_isHighlighted == highlighted)
+        return;
+    _isHighlighted = highlighted;
+    update();
+}
+
+void TableCell::layoutSubviews()
+{
+    const int accessoryWidth = _accessory == Accessory::none ? 0 : kDisclosureWidth;
+    _contentView->setGeometry(0, 0, std::max(0, width() - accessoryWidth - kRightInset), height());
+}
+
+void TableCell::resizeEvent(QResizeEvent*)
+{
+    layoutSubviews();
+}
+
+void TableCell::paintEvent(QPaintEvent*)
+{
+    const Theme& theme = Theme::current();
+    QPainter painter(this);
+    if (_isHighlighted)
+        painter.fillRect(rect(), theme.rowHighlight);
+    painter.fillRect(QRect(kSeparatorLeft, height() - 1, width() - kSeparatorLeft, 1), theme.separator);
+    if (_accessory == Accessory::disclosureIndicator) {
+        const QRectF chevron(width() - kChevronRight - kChevronWidth, (height() - kChevronHeight) / 2.0,
+            kChevronWidth, kChevronHeight);
+        drawChevron(painter, chevron, ChevronDirection::right, theme.accessory, 2);
+    }
+}
+
+} // namespace orvex

@@ -1,0 +1,34 @@
+#pragma once
+
+#include "Animation.h"
+#include "Screen.h"
+
+#include <QPointer>
+#include <QWidget>
+
+#include <memory>
+
+namespace orvex {
+
+// The application's window: a root view that fills it, and at most one modal screen that slides up over it.
+class Window final : public QWidget {
+public:
+    Window(const QString& title, const QSize& size);
+
+    void setRootView(std::unique_ptr<QWidget> view);
+
+    // Covers the root view until it is dismissed. One screen at a time.
+    void presentModally(std::unique_ptr<Screen> screen, bool animated);
+    void dismissModal(bool animated);
+    Screen* modalScreen() const { return _modal; }
+
+protected:
+    void resizeEvent(QResizeEvent* event) override;
+
+private:
+    QWidget* _root = nullptr; // child
+    QPointer<Screen> _modal;  // child
+    Transition _slide{this};
+};
+
+} // namespace orvex
