@@ -16,7 +16,8 @@ using Lines = std::vector<std::string>;
 // 0xB179 with these counts, then whatever follows.
 Bytes connectedMode(std::uint8_t neighbors, std::uint8_t detected, const Bytes& records = {})
 {
-    Bytes payload = {9, 9, 9, 9, 0x01, 0x02, 0x03, 0x04, 0x05, 0x06, 0x18, 0x01, 0x50, 0x00, neighbors, detected};
+    Bytes payload = {
+        9, 9, 9, 9, 0x01, 0x02, 0x03, 0x04, 0x05, 0x06, 0x18, 0x01, 0x50, 0x00, neighbors, detected};
     payload.insert(payload.end(), records.begin(), records.end());
     return packet(0xB179, payload);
 }
@@ -25,9 +26,9 @@ TEST(ConnectedModeMeasurementMisc, ReadsAndScalesItsFields)
 {
     SectionFixture<ConnectedModeMeasurementMisc> fixture;
     EXPECT_EQ(fixture.rowsAfter(connectedMode(0, 0), 0xB179),
-        (RowTexts {{"E-ARFCN", "513"}, {"Serving Physical Cell ID", "1027"}, {"Subframe Number", "1541"},
+        (RowTexts{{"E-ARFCN", "513"}, {"Serving Physical Cell ID", "1027"}, {"Subframe Number", "1541"},
             {"Serving Filtered RSRP", "-70.00 dBm"}, {"Serving Filtered RSRQ", "-10.00 dB"}}));
-    EXPECT_EQ(fixture.log.take(), Lines {"<4>Connected mode LTE Intra-frequency Measurement"});
+    EXPECT_EQ(fixture.log.take(), Lines{"<4>Connected mode LTE Intra-frequency Measurement"});
 
     const struct {
         std::uint8_t low, high;
@@ -47,7 +48,8 @@ TEST(ConnectedModeMeasurementMisc, ReadsAndScalesItsFields)
 
 TEST(ConnectedModeLists, ShowTheRecordsOfTheirCountsThatFit)
 {
-    const Bytes twoAndOne = {0x01, 0x01, 0x18, 0x01, 0x50, 0x00, 0xF7, 0x01, 0x00, 0x00, 0xA0, 0x00, 0x2A, 0x00};
+    const Bytes twoAndOne = {
+        0x01, 0x01, 0x18, 0x01, 0x50, 0x00, 0xF7, 0x01, 0x00, 0x00, 0xA0, 0x00, 0x2A, 0x00};
     const std::vector<RowTexts> measured = {
         {{"Physical Cell ID", "257"}, {"Filtered RSRP", "-70.00 dBm"}, {"Filtered RSRQ", "-10.00 dB"}},
         {{"Physical Cell ID", "503"}, {"Filtered RSRP", "-140.00 dBm"}, {"Filtered RSRQ", "0.00 dB"}},
@@ -75,8 +77,8 @@ TEST(ConnectedModeLists, ShowTheRecordsOfTheirCountsThatFit)
         EXPECT_EQ(neighbors.listAfter(bytes, 0xB179), expectedMeasured) << name;
         EXPECT_EQ(cells.listAfter(bytes, 0xB179), expectedDetected) << name;
     }
-    EXPECT_EQ(neighbors.log.take(), Lines {"<4>Measured Neighbor Cells"});
-    EXPECT_EQ(cells.log.take(), Lines {"<4>Detected Cells"});
+    EXPECT_EQ(neighbors.log.take(), Lines{"<4>Measured Neighbor Cells"});
+    EXPECT_EQ(cells.log.take(), Lines{"<4>Detected Cells"});
 }
 
 TEST(ConnectedModeLists, KeepTheirCellsWhenThePacketIsNotTheirs)
@@ -88,17 +90,19 @@ TEST(ConnectedModeLists, KeepTheirCellsWhenThePacketIsNotTheirs)
     EXPECT_EQ(neighbors.listAfter(shortPacket, 0xB179), kept);
     EXPECT_EQ(neighbors.listAfter(connectedMode(0, 0), 0xB17F), kept);
     EXPECT_EQ(neighbors.log.take(),
-        (Lines {"<4>Measured Neighbor Cells", "<3>Received an unknown log message: 45439"}));
+        (Lines{"<4>Measured Neighbor Cells", "<3>Received an unknown log message: 45439"}));
     SectionFixture<DetectedCells> cells;
     EXPECT_EQ(cells.listAfter(shortPacket, 0xB179), kept);
     EXPECT_EQ(cells.listAfter(connectedMode(0, 0), 0xB180), kept);
+    EXPECT_EQ(cells.log.take(), (Lines {"<4>Detected Cells", "<3>Received an unknown log message: 45440"}));
 }
 
 TEST(LogCode_0xB179, IndexAtTheCountThrows)
 {
     const Bytes bytes = connectedMode(1, 2);
     const LogCode_0xB179 measurement(bytes);
-    EXPECT_EQ(measurement.measuredNeighbors()[0].physicalCellIdentity(), 0) << "counted, but not in the packet";
+    EXPECT_EQ(measurement.measuredNeighbors()[0].physicalCellIdentity(), 0)
+        << "counted, but not in the packet";
     EXPECT_THROW(measurement.measuredNeighbors()[1], ArrayOutOfBoundsException);
     EXPECT_THROW(measurement.detectedCells()[2], ArrayOutOfBoundsException);
 }
@@ -115,49 +119,68 @@ Bytes idleMode(const BitStringWriter& bits)
 TEST(ServingCellMeasurement, ReadsEachFieldFromItsOwnBits)
 {
     const BitStringWriter bits = BitStringWriter()
-                                     .put(0, 9, 501).put(9, 4, 6).put(13, 3, 7).put(16, 9, 280).put(25, 9, 279)
-                                     .put(34, 7, 80).put(41, 7, 77).put(48, 9, 151).put(57, 6, 5).put(63, 7, 53)
-                                     .put(70, 6, 53).put(76, 4, 15).put(80, 7, 100).put(87, 6, 33).put(93, 6, 31)
-                                     .put(99, 6, 4).put(105, 1, 1).put(106, 4, 9).put(110, 2, 3);
+                                     .put(0, 9, 501)
+                                     .put(9, 4, 6)
+                                     .put(13, 3, 7)
+                                     .put(16, 9, 280)
+                                     .put(25, 9, 279)
+                                     .put(34, 7, 80)
+                                     .put(41, 7, 77)
+                                     .put(48, 9, 151)
+                                     .put(57, 6, 5)
+                                     .put(63, 7, 53)
+                                     .put(70, 6, 53)
+                                     .put(76, 4, 15)
+                                     .put(80, 7, 100)
+                                     .put(87, 6, 33)
+                                     .put(93, 6, 31)
+                                     .put(99, 6, 4)
+                                     .put(105, 1, 1)
+                                     .put(106, 4, 9)
+                                     .put(110, 2, 3);
     SectionFixture<ServingCellMeasurement> fixture;
     EXPECT_EQ(fixture.rowsAfter(idleMode(bits), 0xB17F),
-        (RowTexts {{"Version", "5"}, {"E-ARFCN", "6300"}, {"Physical Cell ID", "501"},
+        (RowTexts{{"Version", "5"}, {"E-ARFCN", "6300"}, {"Physical Cell ID", "501"},
             {"Serving Layer Priority", "6"}, {"Measured RSRP", "-70.00 dBm"}, {"Average RSRP", "-70.25 dBm"},
             {"Measured RSRQ", "-10.00 dB"}, {"Average RSRQ", "-10.75 dB"}, {"Measured RSSI", "-64.50 dBm"},
-            {"Qrxlevmin", "-130 dBm"}, {"P_Max", "23 dBm"}, {"Max UE Tx Power", "23 dBm"}, {"Srxlev", "70 dBm"},
-            {"Num of Consecutive DRX Cycles of S < 0", "33"}, {"S Intra Search", "62 dB"},
-            {"S Non Intra Search", "8 dBm"}, {"Measurement Rules Updated", "True"}, {"Measurement Rules", "9"}}));
-    EXPECT_EQ(fixture.log.take(), Lines {"<4>Serving Cell Measurements"});
+            {"Qrxlevmin", "-130 dBm"}, {"P_Max", "23 dBm"}, {"Max UE Tx Power", "23 dBm"},
+            {"Srxlev", "70 dBm"}, {"Num of Consecutive DRX Cycles of S < 0", "33"},
+            {"S Intra Search", "62 dB"}, {"S Non Intra Search", "8 dBm"},
+            {"Measurement Rules Updated", "True"}, {"Measurement Rules", "9"}}));
+    EXPECT_EQ(fixture.log.take(), Lines{"<4>Serving Cell Measurements"});
 }
 
 TEST(ServingCellMeasurement, ShowsTheEndsOfEachRange)
 {
     SectionFixture<ServingCellMeasurement> fixture;
     EXPECT_EQ(fixture.rowsAfter(idleMode({}), 0xB17F),
-        (RowTexts {{"Version", "5"}, {"E-ARFCN", "6300"}, {"Physical Cell ID", "0"},
-            {"Serving Layer Priority", "0"}, {"Measured RSRP", "-140.00 dBm"}, {"Average RSRP", "-140.00 dBm"},
-            {"Measured RSRQ", "-30.00 dB"}, {"Average RSRQ", "-30.00 dB"}, {"Measured RSSI", "-140.00 dBm"},
-            {"Qrxlevmin", "-140 dBm"}, {"P_Max", "-30 dBm"}, {"Max UE Tx Power", "-30 dBm"},
-            {"Srxlev", "-30 dBm"}, {"Num of Consecutive DRX Cycles of S < 0", "0"}, {"S Intra Search", "0 dB"},
-            {"S Non Intra Search", "0 dBm"}, {"Measurement Rules Updated", "False"}, {"Measurement Rules", "0"}}));
+        (RowTexts{{"Version", "5"}, {"E-ARFCN", "6300"}, {"Physical Cell ID", "0"},
+            {"Serving Layer Priority", "0"}, {"Measured RSRP", "-140.00 dBm"},
+            {"Average RSRP", "-140.00 dBm"}, {"Measured RSRQ", "-30.00 dB"}, {"Average RSRQ", "-30.00 dB"},
+            {"Measured RSSI", "-140.00 dBm"}, {"Qrxlevmin", "-140 dBm"}, {"P_Max", "-30 dBm"},
+            {"Max UE Tx Power", "-30 dBm"}, {"Srxlev", "-30 dBm"},
+            {"Num of Consecutive DRX Cycles of S < 0", "0"}, {"S Intra Search", "0 dB"},
+            {"S Non Intra Search", "0 dBm"}, {"Measurement Rules Updated", "False"},
+            {"Measurement Rules", "0"}}));
 
     BitStringWriter full;
     for (std::size_t bit = 0; bit < 112; ++bit)
         full.put(bit, 1, 1);
     EXPECT_EQ(fixture.rowsAfter(idleMode(full), 0xB17F),
-        (RowTexts {{"Version", "5"}, {"E-ARFCN", "6300"}, {"Physical Cell ID", "511"},
+        (RowTexts{{"Version", "5"}, {"E-ARFCN", "6300"}, {"Physical Cell ID", "511"},
             {"Serving Layer Priority", "15"}, {"Measured RSRP", "-12.25 dBm"}, {"Average RSRP", "-12.25 dBm"},
             {"Measured RSRQ", "1.75 dB"}, {"Average RSRQ", "1.75 dB"}, {"Measured RSSI", "115.50 dBm"},
-            {"Qrxlevmin", "-14 dBm"}, {"P_Max", "97 dBm"}, {"Max UE Tx Power", "33 dBm"}, {"Srxlev", "97 dBm"},
-            {"Num of Consecutive DRX Cycles of S < 0", "63"}, {"S Intra Search", "126 dB"},
-            {"S Non Intra Search", "126 dBm"}, {"Measurement Rules Updated", "True"}, {"Measurement Rules", "15"}}));
+            {"Qrxlevmin", "-14 dBm"}, {"P_Max", "97 dBm"}, {"Max UE Tx Power", "33 dBm"},
+            {"Srxlev", "97 dBm"}, {"Num of Consecutive DRX Cycles of S < 0", "63"},
+            {"S Intra Search", "126 dB"}, {"S Non Intra Search", "126 dBm"},
+            {"Measurement Rules Updated", "True"}, {"Measurement Rules", "15"}}));
 }
 
 TEST(ServingCellMeasurement, TellsValuesThatStandForNone)
 {
     SectionFixture<ServingCellMeasurement> fixture;
-    const RowTexts rows
-        = fixture.rowsAfter(idleMode(BitStringWriter().put(63, 7, 64).put(93, 6, 32).put(99, 6, 32)), 0xB17F);
+    const RowTexts rows =
+        fixture.rowsAfter(idleMode(BitStringWriter().put(63, 7, 64).put(93, 6, 32).put(99, 6, 32)), 0xB17F);
     ASSERT_EQ(rows.size(), 18U);
     EXPECT_EQ(rows[10].second, "Not Present");
     EXPECT_EQ(rows[14].second, "Not Present");
@@ -165,10 +188,10 @@ TEST(ServingCellMeasurement, TellsValuesThatStandForNone)
 
     Bytes shortPacket = idleMode({});
     shortPacket.pop_back();
-    EXPECT_EQ(fixture.rowsAfter(shortPacket, 0xB17F), RowTexts {});
-    EXPECT_EQ(fixture.rowsAfter(idleMode({}), 0xB179), RowTexts {});
+    EXPECT_EQ(fixture.rowsAfter(shortPacket, 0xB17F), RowTexts{});
+    EXPECT_EQ(fixture.rowsAfter(idleMode({}), 0xB179), RowTexts{});
     EXPECT_EQ(fixture.log.take(),
-        (Lines {"<4>Serving Cell Measurements", "<3>Received an unknown log message: 45433"}));
+        (Lines{"<4>Serving Cell Measurements", "<3>Received an unknown log message: 45433"}));
 }
 
 } // namespace

@@ -25,12 +25,12 @@ TEST(LTEServingCellInfo, ReadsEachFieldOf0xB0C2FromItsOwnBytes)
         {"Upload Frequency", "19538"}, {"Download Bandwidth", "1.4 MHz"}, {"Upload Bandwidth", "20 MHz"},
         {"Cell Identity", "305419896"}, {"Tracking Area Code", "43981"}, {"Freq Band Indicator", "65543"}};
     EXPECT_EQ(fixture.rowsAfter(packet(0xB0C2, servingCellPayload()), 0xB0C2), expected);
-    EXPECT_EQ(fixture.log.take(), Lines {kEntryLine});
+    EXPECT_EQ(fixture.log.take(), Lines{kEntryLine});
 
     Bytes cut = packet(0xB0C2, servingCellPayload());
     cut.pop_back();
-    EXPECT_EQ(fixture.rowsAfter(cut, 0xB0C2), RowTexts {});
-    EXPECT_EQ(fixture.log.take(), Lines {kEntryLine});
+    EXPECT_EQ(fixture.rowsAfter(cut, 0xB0C2), RowTexts{});
+    EXPECT_EQ(fixture.log.take(), Lines{kEntryLine});
 }
 
 TEST(LTEServingCellInfo, NamesBandwidthsAndShowsIdentitiesSigned)
@@ -46,8 +46,8 @@ TEST(LTEServingCellInfo, NamesBandwidthsAndShowsIdentitiesSigned)
         std::fill_n(payload.begin() + 9, 4, 0xFF);
         const RowTexts rows = fixture.rowsAfter(packet(0xB0C2, payload), 0xB0C2);
         ASSERT_EQ(rows.size(), 8U);
-        EXPECT_EQ(rows[3].second, expected) << int {blocks};
-        EXPECT_EQ(rows[4].second, expected) << int {blocks};
+        EXPECT_EQ(rows[3].second, expected) << int{blocks};
+        EXPECT_EQ(rows[4].second, expected) << int{blocks};
         EXPECT_EQ(rows[5].second, "-1");
     }
 }
@@ -56,17 +56,17 @@ TEST(LTEServingCellInfo, ReportsEveryAntennaPacketAlthoughItIsDecoded)
 {
     Fixture fixture;
     const Bytes payload = {0, 1, 2, 3, 4, 5, 6, 4, 8};
-    EXPECT_EQ(fixture.rowsAfter(packet(0xB0C1, payload), 0xB0C1), (RowTexts {{"Num Tx Antennas", "4"}}));
-    EXPECT_EQ(fixture.log.take(), (Lines {kEntryLine, "<3>Received an unknown log message: 45249"}));
+    EXPECT_EQ(fixture.rowsAfter(packet(0xB0C1, payload), 0xB0C1), (RowTexts{{"Num Tx Antennas", "4"}}));
+    EXPECT_EQ(fixture.log.take(), (Lines{kEntryLine, "<3>Received an unknown log message: 45249"}));
 
-    EXPECT_EQ(fixture.rowsAfter(packet(0xB0C1, Bytes(8)), 0xB0C1), RowTexts {}) << "one byte short";
-    EXPECT_EQ(fixture.log.take(), Lines {kEntryLine});
+    EXPECT_EQ(fixture.rowsAfter(packet(0xB0C1, Bytes(8)), 0xB0C1), RowTexts{}) << "one byte short";
+    EXPECT_EQ(fixture.log.take(), Lines{kEntryLine});
     fixture.rowsAfter(packet(0xB0C3, Bytes(40)), 0xB0C3);
-    EXPECT_EQ(fixture.log.take(), (Lines {kEntryLine, "<3>Received an unknown log message: 45251"}));
+    EXPECT_EQ(fixture.log.take(), (Lines{kEntryLine, "<3>Received an unknown log message: 45251"}));
 }
 
-constexpr const char* kServingLTE
-    = "<key>RadioAccessTechnology</key><string>LTE</string><key>CellType</key><string>Serving</string>";
+constexpr const char* kServingLTE =
+    "<key>RadioAccessTechnology</key><string>LTE</string><key>CellType</key><string>Serving</string>";
 
 std::string cellList(std::initializer_list<std::string> records)
 {
@@ -88,8 +88,9 @@ TEST(LTEServingCellInfo, TakesTheFirstServingLTECellOfTheCellMonitorList)
     const std::string neighbor = "<key>RadioAccessTechnology</key><string>LTE</string><key>CellType</key>"
                                  "<string>Neighbor</string>"
         + number("TAC", "1");
-    const std::string otherTechnology = "<key>RadioAccessTechnology</key><string>GSM</string><key>CellType</key>"
-                                        "<string>Serving</string>"
+    const std::string otherTechnology =
+        "<key>RadioAccessTechnology</key><string>GSM</string><key>CellType</key>"
+        "<string>Serving</string>"
         + number("TAC", "2");
     const std::string second = kServingLTE + number("TAC", "3");
     const RowTexts expected = {{"Tracking Area Code", "4660"}, {"Cell Identity", "-7"},
@@ -101,26 +102,28 @@ TEST(LTEServingCellInfo, TakesTheFirstServingLTECellOfTheCellMonitorList)
     } cases[] = {
         {"only it", cellList({serving}), expected},
         {"others before it", cellList({neighbor, otherTechnology, "", serving, second}), expected},
-        {"an element that is no record", "<array><string>x</string><dict>" + serving + "</dict></array>", expected},
+        {"an element that is no record", "<array><string>x</string><dict>" + serving + "</dict></array>",
+            expected},
         {"no cell", "<array/>", {}},
         {"no serving LTE cell", cellList({neighbor, otherTechnology}), {}},
     };
     Fixture fixture;
     for (const auto& [name, list, rows] : cases) {
         EXPECT_EQ(fixture.rowsAfter(propertyListPacket(0xFF0001, list), 0xFF0001), rows) << name;
-        EXPECT_EQ(fixture.log.take(), Lines {kEntryLine}) << name;
+        EXPECT_EQ(fixture.log.take(), Lines{kEntryLine}) << name;
     }
 }
 
 TEST(LTEServingCellInfo, SaysWhichEntryOfTheServingCellIsNoNumber)
 {
     const std::string record = kServingLTE + number("TAC", "2147483647") + number("CellID", "2147483648")
-        + "<key>PhysicalCellID</key><real>5</real><key>BandInfo</key><true/><key>UARFCN</key><string>7</string>";
+        + "<key>PhysicalCellID</key><real>5</real><key>BandInfo</key><true/><key>UARFCN</key><string>7</"
+          "string>";
     Fixture fixture;
     EXPECT_EQ(fixture.rowsAfter(propertyListPacket(0xFF0001, cellList({record})), 0xFF0001),
-        (RowTexts {{"Tracking Area Code", "2147483647"}}));
+        (RowTexts{{"Tracking Area Code", "2147483647"}}));
     EXPECT_EQ(fixture.log.take(),
-        (Lines {kEntryLine, "<3>Serving Cell Info: Failed to retrieve Cell ID\n",
+        (Lines{kEntryLine, "<3>Serving Cell Info: Failed to retrieve Cell ID\n",
             "<3>Serving Cell Info: Failed to retrieve Physical Cell ID\n",
             "<3>Serving Cell Info: Failed to retrieve Freq Band Indicator\n",
             "<3>Serving Cell Info: Failed to retrieve UARFCN\n"}));
@@ -132,9 +135,10 @@ TEST(LTEServingCellInfo, SaysWhichEntryOfTheServingCellIsNoNumber)
 TEST(LTEServingCellInfo, ListThatIsNoPropertyListChangesNothingAndAnotherKindIsFatal)
 {
     Fixture fixture;
-    EXPECT_EQ(fixture.rowsAfter(packet(0xFF0001, {'n', 'o'}), 0xFF0001), RowTexts {});
+    EXPECT_EQ(fixture.rowsAfter(packet(0xFF0001, {'n', 'o'}), 0xFF0001), RowTexts{});
     EXPECT_EQ(fixture.log.take(),
-        (Lines {kEntryLine, "<3>Cell Info Array data could not be constructed", "<3>Failed to get Cell Array\n"}));
+        (Lines{kEntryLine, "<3>Cell Info Array data could not be constructed",
+            "<3>Failed to get Cell Array\n"}));
     EXPECT_THROW(fixture.rowsAfter(propertyListPacket(0xFF0001, "<dict/>"), 0xFF0001),
         CellMonitorList::WrongKindException);
 }
@@ -144,8 +148,8 @@ TEST(LTEServingCellInfo, ServingCellPacketDropsTheUARFCNOfTheCellMonitorList)
     Fixture fixture;
     const auto rows = Dictionary::make();
     fixture.section.updateSectionRef(rows);
-    const Bytes list
-        = propertyListPacket(0xFF0001, cellList({kServingLTE + number("UARFCN", "6300") + number("TAC", "1")}));
+    const Bytes list =
+        propertyListPacket(0xFF0001, cellList({kServingLTE + number("UARFCN", "6300") + number("TAC", "1")}));
     fixture.section.updateWithData(list, 0xFF0001);
     EXPECT_EQ((*rows)["UARFCN"], Value("6300"));
     EXPECT_EQ((*rows)["Tracking Area Code"], Value("1"));

@@ -1,0 +1,95 @@
+#include "OrvexModelNode.h"
+
+#include "Array.h"
+#include "Dictionary.h"
+
+#include <gtest/gtest.h>
+
+namespace orvex::test {
+namespace {
+
+// "/path=value" for a leaf, "/path" for a branch, in the order of the tree.
+void describe(const OrvexModelNode& node, const std::string& path, std::vector<std::string>& result)
+{
+    result.push_back(node.value() ? path + "=" + *node.value() : path);
+    if (!node.childNodes())
+        return;
+    for (const auto& child : *node.childNodes())
+        describe(*child, pathByAppending(path, child->displayName()), result);
+}
+
+std::vector<std::string> treeOf(const Value& display)
+{
+    NodesByPath nodesByPath;
+    const auto root = OrvexModelNode::makeTreeFromObject(display, nodesByPath);
+    EXPECT_EQ(root->displayName(), "Orvex");
+    EXPECT_EQ(nodesByPath["/"], root);
+    std::vector<std::string> result;
+    describe(*root, "/", result);
+    return result;
+}
+
+DictionaryRef nested(const Value& value)
+{
+    return Dictionary::make({{"x", value}});
+}
+
+TEST(OrvexModelNode, ShowsEveryKindOfObject)
+{
+    using Tree = std::vector<std::string>;
+    const struct {
+        const char* name;
+        Value display;
+        Tree tree;
+    } cases[] = {
+        {"an unsorted dictionary keeps its order and its keys",
+            Dictionary::make({{"02;B", "x"}, {"01;A", "y"}}), Tree{"/", "/02;B=x", "/01;A=y"}},
+        {"a sorted dictionary is in string order, without prefixes",
+            Dictionary::make({{"2;B", "x"}, {"_sorted", ""}, {"10;A", Dictionary::make()}}),
+            Tree{"/", "/A", "/B=x"}},
+        {"only one separator makes a prefix",
+            Dictionary::make({{"_sorted", "no"}, {"a;b;c", "1"}, {"plain", "2"}, {"z;", "3"}}),
+            Tree{"/", "/a;b;c=1", "/plain=2", "/=3"}},
+        {"a null value is left out", Dictionary::make({{"A", Value()}, {"B", "b"}}), Tree{"/", "/B=b"}},
+        {"array elements are numbered", Dictionary::make({{"List", Array::make({"a", "b"})}}),
+            Tree{"/", "/List", "/List/0=a", "/List/1=b"}},
+        {"arrays in arrays", Array::make({Array::make(), Array::make({"a"})}),
+            Tree{"/", "/0", "/1", "/1/0=a"}},
+        {"other values are unknown",
+            Dictionary::make(
+                {{"n", 1}, {"r", 1.5}, {"t", true}, {"d", Date()}, {"b", std::make_shared<Bytes>()}}),
+            Tree{"/", "/n=(unknown)", "/r=(unknown)", "/t=(unknown)", "/d=(unknown)", "/b=(unknown)"}},
+        {"only the top dictionary is sorted",
+            Dictionary::make({{"_sorted", ""}, {"1;S", Dictionary::make({{"2;b", ""}, {"1;a", ""}})}}),
+            Tree{"/", "/S", "/S/2;b=", "/S/1;a="}},
+        {"an absent display", Value(), Tree{"/=(unknown)"}},
+        {"a display that is a text", "text", Tree{"/=text"}},
+    };
+    for (const auto& [name, display, tree] : cases)
+        EXPECT_EQ(treeOf(display), tree) << name;
+}
+
+TEST(OrvexModelNode, PathDictionaryKeepsTheLaterOfTwoNodes)
+{
+    NodesByPath nodes;
+    OrvexModelNode::makeTreeFromObject(Dictionary::make({{"_sorted", ""}, {"1;Cell", "first"},
+                                           {"2;Cell", "second"}, {"3;a/b", nested("deep")}}),
+        nodes);
+    EXPECT_EQ(*nodes.at("/Cell")->value(), "second");
+    EXPECT_EQ(*nodes.at("/a/b/x")->value(), "deep");
+    EXPECT_FALSE(nodes.contains("/a"));
+}
+
+TEST(OrvexModelNode, NodeOutlivesItsTree)
+{
+    OrvexModelNodeRef leaf;
+    {
+        NodesByPath nodes;
+        const auto root = OrvexModelNode::makeTreeFromObject(nested("kept"), nodes);
+        leaf = root->childNodes()->front();
+    }
+    EXPECT_EQ(*leaf->value(), "kept");
+}
+
+} // namespace
+} // namespace orvex::test
