@@ -16,7 +16,8 @@ public:
             if (_bytes.size() <= position / 8)
                 _bytes.resize(position / 8 + 1);
             if ((value >> bit) & 1U)
-                _bytes[position / 8] = static_cast<std::uint8_t>(_bytes[position / 8] | (1U << (position % 8)));
+                _bytes[position / 8] =
+                    static_cast<std::uint8_t>(_bytes[position / 8] | (1U << (position % 8)));
         }
         return *this;
     }

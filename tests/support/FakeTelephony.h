@@ -12,7 +12,7 @@
 namespace orvex::test {
 
 // A port that is just there until it is invalidated.
-template<typename Interface>
+template <typename Interface>
 class FakePort : public Interface {
 public:
     bool isValid() const override { return valid; }
@@ -82,7 +82,10 @@ public:
 
 private:
     struct FakeConnection final : TelephonyConnection {
-        explicit FakeConnection(const FakeTelephony& owner) : _owner(owner) {}
+        explicit FakeConnection(const FakeTelephony& owner)
+            : _owner(owner)
+        {
+        }
         LogChannelReply createNetworkMonitorLogChannel(const std::string&) override
         {
             return {0, _owner.channelError, _owner.remotePortName};
@@ -91,7 +94,10 @@ private:
     };
 
     struct FakeRemotePort final : FakePort<RemotePort> {
-        explicit FakeRemotePort(FakeTelephony& owner) : _owner(owner) {}
+        explicit FakeRemotePort(FakeTelephony& owner)
+            : _owner(owner)
+        {
+        }
         Status send(std::int32_t, ByteView data, std::chrono::milliseconds) override
         {
             _owner.commands.push_back(propertyListFromData(data).value.value_or(Value()));
@@ -105,7 +111,8 @@ private:
                 return {_owner.requestStatus, std::nullopt};
             if (_owner.rawReply)
                 return {Status::success, _owner.rawReply->empty() ? std::nullopt : _owner.rawReply};
-            return {Status::success, propertyListXML(Dictionary::make({{"GetTechnology", _owner.technology}}))};
+            return {
+                Status::success, propertyListXML(Dictionary::make({{"GetTechnology", _owner.technology}}))};
         }
         std::size_t pendingBytes() const override { return 0; }
         FakeTelephony& _owner;

@@ -10,7 +10,7 @@ public:
     Date now() const override { return moment; }
     Zone zoneAt(Date) const override { return zone; }
 
-    Date moment {1'700'000'000.75}; // 2023-11-14 22:13:20 UTC
+    Date moment{1'700'000'000.75}; // 2023-11-14 22:13:20 UTC
     Zone zone;
 };
 

@@ -48,7 +48,10 @@ public:
 
 private:
     struct ManualTimer final : Timer {
-        explicit ManualTimer(ManualRunLoop& loop) : _loop(loop) {}
+        explicit ManualTimer(ManualRunLoop& loop)
+            : _loop(loop)
+        {
+        }
         ~ManualTimer() override
         {
             std::erase_if(_loop._timers, [this](const Running& running) { return running.timer == this; });
@@ -89,7 +92,7 @@ private:
         return hasDelayed || hasRunning;
     }
 
-    std::chrono::nanoseconds _now {0};
+    std::chrono::nanoseconds _now{0};
     std::deque<Task> _posted;
     std::vector<Delayed> _delayed;
     std::vector<Running> _timers;

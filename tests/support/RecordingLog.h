@@ -12,7 +12,10 @@ namespace orvex::test {
 // Keeps every log line as "<PRIORITY>TEXT" while it lives.
 class RecordingLog final : public SystemLog {
 public:
-    RecordingLog() : _previous(SystemLog::install(this)) {}
+    RecordingLog()
+        : _previous(SystemLog::install(this))
+    {
+    }
     ~RecordingLog() override { SystemLog::install(_previous); }
     RecordingLog(const RecordingLog&) = delete;
     RecordingLog& operator=(const RecordingLog&) = delete;

@@ -34,7 +34,7 @@ inline RowTexts rowsOf(const DictionaryRef& dictionary)
 }
 
 // One section on its own, bound to an empty dictionary and in turn to an empty array.
-template<typename Section>
+template <typename Section>
 class SectionFixture {
 public:
     SectionFixture() { log.take(); }
@@ -57,14 +57,15 @@ public:
         section.updateWithData(packet, code);
         std::vector<RowTexts> result;
         for (const Value& element : *array)
-            result.push_back(element.string() ? RowTexts {{"", *element.string()}} : rowsOf(element.dictionary()));
+            result.push_back(
+                element.string() ? RowTexts{{"", *element.string()}} : rowsOf(element.dictionary()));
         return result;
     }
 
     RecordingLog log;
     ClassDictionary classDict;
     CodeDictionary codeDict;
-    Section section {classDict, codeDict};
+    Section section{classDict, codeDict};
 };
 
 } // namespace orvex::test
