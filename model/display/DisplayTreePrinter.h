@@ -1,0 +1,22 @@
+#pragma once
+
+#include "OrvexModelNode.h"
+
+#include <string>
+#include <vector>
+
+namespace orvex {
+
+// The display tree as text for a terminal or a file: one line per node, the root first, two blanks of indent
+// per level. A branch is its name, a leaf "name: value".
+//
+// Names and values come from the air and from SIM cards. What would break a line or command a terminal is
+// written visibly: a line break as \n, other control characters as \x1b.
+class DisplayTreePrinter {
+public:
+    static std::vector<std::string> lines(const OrvexModelNode& root);
+    // The same lines, each ended by a line break.
+    static std::string text(const OrvexModelNode& root);
+};
+
+} // namespace orvex
