@@ -1,0 +1,15 @@
+#pragma once
+
+#include "OrvexModel.h"
+
+#include "Preferences.h"
+
+namespace orvex {
+
+// What the application takes from the platform. The referents outlive it.
+struct AppPlatform {
+    OrvexModel::Platform session;
+    Preferences& preferences;
+};
+
+} // namespace orvex

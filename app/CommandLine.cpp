@@ -1,0 +1,66 @@
+#include "CommandLine.h"
+
+#include <QCommandLineParser>
+
+namespace orvex {
+
+namespace {
+CommandLine wrongUsage(const QString& error)
+{
+    CommandLine result;
+    result.action = CommandLine::Action::wrongUsage;
+    result.error = error.toStdString();
+    return result;
+}
+} // namespace
+
+CommandLine CommandLine::parse(const QStringList& arguments)
+{
+    const QCommandLineOption help(QStringList{QStringLiteral("h"), QStringLiteral("help")});
+    const QCommandLineOption version(QStringList{QStringLiteral("v"), QStringLiteral("version")});
+    const QCommandLineOption console(QStringLiteral("console"));
+    const QCommandLineOption resources(QStringLiteral("resources"), {}, QStringLiteral("DIR"));
+    const QCommandLineOption light(QStringLiteral("light"));
+    const QCommandLineOption dark(QStringLiteral("dark"));
+    QCommandLineParser parser;
+    parser.addOptions({help, version, console, resources, light, dark});
+
+    // parse() rather than process(), which would end the program in its own way.
+    if (!parser.parse(arguments))
+        return wrongUsage(parser.errorText());
+    if (!parser.positionalArguments().isEmpty())
+        return wrongUsage(
+            QStringLiteral("Unexpected argument '%1'.").arg(parser.positionalArguments().first()));
+    if (parser.isSet(light) && parser.isSet(dark))
+        return wrongUsage(QStringLiteral("--light and --dark exclude each other."));
+
+    CommandLine result;
+    if (parser.isSet(help))
+        result.action = Action::help;
+    else if (parser.isSet(version))
+        result.action = Action::version;
+    else if (parser.isSet(console))
+        result.action = Action::console;
+    if (parser.isSet(light))
+        result.theme = Theme::Mode::light;
+    if (parser.isSet(dark))
+        result.theme = Theme::Mode::dark;
+    if (parser.isSet(resources))
+        result.resources = parser.value(resources).toStdString();
+    return result;
+}
+
+std::string CommandLine::usage()
+{
+    return "Usage: orvex [options]\n"
+           "Shows what the handset's baseband reports.\n"
+           "\n"
+           "Options:\n"
+           "  --console        Write to the terminal instead of opening a window.\n"
+           "  --resources DIR  Take the section templates from this directory.\n"
+           "  --light, --dark  Choose the colours. Default: as the desktop has them.\n"
+           "  -h, --help       Show this help and exit.\n"
+           "  -v, --version    Show the version and exit.\n";
+}
+
+} // namespace orvex

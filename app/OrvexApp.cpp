@@ -1,0 +1,119 @@
+#include "OrvexApp.h"
+
+#include "HomeScreenPreference.h"
+#include "OrvexPaneController.h"
+#include "PaneReloader.h"
+#include "UpdateMessage.h"
+
+#include "FixedPaths.h"
+
+#include <filesystem>
+
+namespace orvex {
+
+namespace {
+constexpr QSize kWindowSize{375, 667}; // a handset's screen
+} // namespace
+
+std::shared_ptr<OrvexApp> OrvexApp::create(const AppPlatform& platform)
+{
+    return std::shared_ptr<OrvexApp>(new OrvexApp(platform));
+}
+
+OrvexApp::OrvexApp(const AppPlatform& platform)
+    : _platform(platform)
+{
+}
+
+OrvexApp::~OrvexApp()
+{
+    // A retry that waits on the run loop may hold the model for longer.
+    if (_model)
+        _model->setListener(nullptr);
+}
+
+void OrvexApp::applicationDidFinishLaunching()
+{
+    getSaveButtonPref();
+    _window = std::make_unique<Window>(QStringLiteral("Orvex"), kWindowSize);
+    _model = OrvexModel::create(_platform.session);
+    _model->setListener(this);
+    _updateMessage = kConnectingMessage;
+
+    auto root = std::make_unique<OrvexPaneController>(*this, nullptr, "/");
+    // Without the dots: these come with the first answer of the session.
+    root->setStatus("Connecting", true);
+    auto stack = std::make_unique<NavigationStack>(std::move(root));
+    stack->setDelegate(this);
+    _navController = stack.get();
+    _window->setRootView(std::move(stack));
+    _window->show();
+
+    _platform.session.runLoop.post([self = shared_from_this()] {
+        if (self->_model)
+            self->_model->restartMonitor();
+    });
+}
+
+void OrvexApp::applicationWillTerminate()
+{
+    if (std::exchange(_hasTerminated, true))
+        return;
+    setGSMRSSI(false);
+    _updateMessage.reset();
+    _navController = nullptr;
+    _window.reset();
+    if (_model)
+        _model->setListener(nullptr);
+    _model.reset();
+}
+
+void OrvexApp::updateViewControllerFromModel()
+{
+    if (!_model || !_navController)
+        return;
+    reloadPanes(*_navController, _model->topLevelNodes(),
+        [this](const std::string& path) { return _model->nodeAtPath(path); });
+    if (_model->isConnected())
+        _updateMessage = updateMessageAt(_platform.session.generators.clock.now());
+    updateStatusForViewController(static_cast<OrvexPaneController&>(_navController->topScreen()));
+}
+
+void OrvexApp::updateStatusForViewController(OrvexPaneController& screen)
+{
+    if (_model && _model->isConnected())
+        screen.setStatus(_updateMessage, false);
+    else
+        screen.setStatus(kConnectingMessage, true);
+}
+
+void OrvexApp::willShowScreen(NavigationStack&, Screen& screen, bool)
+{
+    updateStatusForViewController(static_cast<OrvexPaneController&>(screen));
+}
+
+void OrvexApp::getSaveButtonPref()
+{
+    std::error_code ignored;
+    _allowSaveButton = std::filesystem::exists(paths::internalBuildMarker(), ignored);
+}
+
+void OrvexApp::showSaveView()
+{
+    if (!_window || !_saveScreenFactory || saveViewController())
+        return;
+    _window->presentModally(_saveScreenFactory(_model->getSaveContents()), true);
+}
+
+void OrvexApp::closeSaveView()
+{
+    if (saveViewController())
+        _window->dismissModal(true);
+}
+
+void OrvexApp::setGSMRSSI(bool shown)
+{
+    setGSMRSSIPreference(_platform.preferences, shown);
+}
+
+} // namespace orvex

@@ -1,0 +1,75 @@
+#pragma once
+
+#include "AppPlatform.h"
+#include "PaneHost.h"
+
+#include "NavigationStack.h"
+#include "Window.h"
+
+#include <functional>
+#include <memory>
+#include <optional>
+#include <string>
+
+namespace orvex {
+
+class OrvexPaneController;
+
+// The application with its window: one session, a stack of list screens, the status line of each.
+class OrvexApp final : public std::enable_shared_from_this<OrvexApp>,
+                       public OrvexModelListener,
+                       public NavigationStack::Delegate,
+                       public PaneHost {
+public:
+    // Makes the screen that saves a snapshot of these contents (null when there are none yet).
+    using SaveScreenFactory = std::function<std::unique_ptr<Screen>(const ArrayRef& saveContents)>;
+
+    static std::shared_ptr<OrvexApp> create(const AppPlatform& platform);
+    ~OrvexApp() override;
+    OrvexApp(const OrvexApp&) = delete;
+    OrvexApp& operator=(const OrvexApp&) = delete;
+
+    // Until a factory is given there is no Save button, as it would lead nowhere. To be given before launch.
+    void setSaveScreenFactory(SaveScreenFactory factory) { _saveScreenFactory = std::move(factory); }
+
+    // Opens the window and queues the start of the session.
+    void applicationDidFinishLaunching();
+    // Writes the home-screen preference, closes window and session. Further calls do nothing.
+    void applicationWillTerminate();
+
+    void updateViewControllerFromModel() override;
+    void updateStatusForViewController(OrvexPaneController& screen);
+    void willShowScreen(NavigationStack& stack, Screen& screen, bool animated) override;
+
+    // Whether this is an internal build, read from its marker by getSaveButtonPref().
+    bool allowSaveButton() const { return _allowSaveButton; }
+    void getSaveButtonPref();
+    bool offersSaveButton() const override { return _allowSaveButton && _saveScreenFactory; }
+    // Opens the snapshot screen over everything, unless it is open.
+    void showSaveView() override;
+    void closeSaveView();
+    // Null while it is not shown.
+    Screen* saveViewController() const { return _window ? _window->modalScreen() : nullptr; }
+
+    void setGSMRSSI(bool shown);
+
+    const std::optional<std::string>& updateMessage() const { return _updateMessage; }
+    // All three null before launch and after termination.
+    Window* window() const { return _window.get(); }
+    NavigationStack* navigationStack() const { return _navController; }
+    OrvexModel* model() const { return _model.get(); }
+
+private:
+    explicit OrvexApp(const AppPlatform& platform);
+
+    AppPlatform _platform;
+    SaveScreenFactory _saveScreenFactory;
+    std::unique_ptr<Window> _window;
+    NavigationStack* _navController = nullptr; // the window's
+    std::shared_ptr<OrvexModel> _model;
+    std::optional<std::string> _updateMessage;
+    bool _allowSaveButton = false;
+    bool _hasTerminated = false;
+};
+
+} // namespace orvex

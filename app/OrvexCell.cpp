@@ -1,0 +1,94 @@
+#include "OrvexCell.h"
+
+#include "OrvexCellLayout.h"
+
+#include "SidewaysScrollView.h"
+#include "TextLabel.h"
+#include "Theme.h"
+
+namespace orvex {
+
+namespace {
+constexpr int kFontSize = 15;
+} // namespace
+
+OrvexCell::OrvexCell(Kind kind, std::string reuseIdentifier)
+    : TableCell(std::move(reuseIdentifier))
+    , _layout(kind)
+{
+    QWidget* parent = contentView();
+    if (kind == Kind::leaf) {
+        _view = new SidewaysScrollView(contentView());
+        parent = _view->content();
+    }
+    _key = new TextLabel(Theme::boldSystemFont(kFontSize), parent);
+    if (kind == Kind::leaf) {
+        _value = new TextLabel(Theme::systemFont(kFontSize), parent);
+        QPalette palette = _value->palette();
+        palette.setColor(QPalette::WindowText, Theme::current().secondaryText);
+        _value->setPalette(palette);
+    }
+}
+
+void OrvexCell::setKey(const QString& text)
+{
+    _key->setLine(text);
+    nameForAssistiveTechnology();
+}
+
+void OrvexCell::setValue(const QString& text)
+{
+    if (!_value)
+        return;
+    _value->setLine(text);
+    nameForAssistiveTechnology();
+}
+
+void OrvexCell::nameForAssistiveTechnology()
+{
+    const bool hasValue = _value && !_value->text().isEmpty();
+    setAccessibleName(hasValue ? _key->text() + QStringLiteral(", ") + _value->text() : _key->text());
+}
+
+void OrvexCell::setLayoutKey()
+{
+    _layout = Kind::branch;
+    layoutSubviews();
+}
+
+void OrvexCell::setLayout()
+{
+    _layout = Kind::leaf;
+    layoutSubviews();
+}
+
+void OrvexCell::layoutSubviews()
+{
+    TableCell::layoutSubviews();
+    if (_layout == Kind::branch)
+        layoutAsBranch();
+    else
+        layoutAsLeaf();
+}
+
+void OrvexCell::layoutAsBranch()
+{
+    const QSizeF keySize = sizeOfLine(_key->text(), _key->font());
+    _key->setGeometry(branchCellKeyFrame(contentView()->rect(), keySize).toRect());
+}
+
+void OrvexCell::layoutAsLeaf()
+{
+    const QFont& bold = _key->font();
+    const QSizeF keySize = sizeOfLine(_key->text(), bold);
+    const QSizeF valueSize = _value ? QSizeF(sizeOfLine(_value->text(), bold)) : QSizeF();
+    const LeafCellLayout layout = leafCellLayout(contentView()->rect(), keySize, valueSize);
+    _key->setGeometry(layout.key.toRect());
+    if (!_view)
+        return;
+    _value->setGeometry(layout.value.toRect());
+    _view->setGeometry(layout.view.toRect());
+    _view->setContentSize(layout.contentSize.toSize());
+}
+
+} // namespace orvex

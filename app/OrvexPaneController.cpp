@@ -1,0 +1,142 @@
+#include "OrvexPaneController.h"
+
+#include "OrvexCell.h"
+
+#include "ActivityIndicator.h"
+#include "NavigationStack.h"
+#include "TextLabel.h"
+#include "Theme.h"
+
+namespace orvex {
+
+namespace {
+// One identifier for branches and leaves. A cell keeps the kind it was made as, so in a list of both kinds a
+// reused cell may be of the other kind than its row.
+constexpr const char* kCellIdentifier = "OrvexPaneControllerCell";
+constexpr int kStatusFontSize = 14;
+} // namespace
+
+OrvexPaneController::OrvexPaneController(PaneHost& host, OrvexModelNodeRef node, std::string path)
+    : _host(host)
+    , _nodes(std::move(node))
+    , _keyPath(std::move(path))
+    , _list(new TableList(*this, this))
+{
+    setFocusProxy(_list);
+    updateTitle();
+    _list->reloadData();
+}
+
+void OrvexPaneController::updateTitle()
+{
+    const QString title = _nodes ? QString::fromStdString(_nodes->displayName()) : QStringLiteral("Orvex");
+    setTitle(title);
+    _list->setAccessibleName(title);
+}
+
+void OrvexPaneController::setStatus(const std::optional<std::string>& status, bool isLoading)
+{
+    _status = status.value_or("");
+    _isLoading = isLoading;
+    createToolbarItems();
+}
+
+void OrvexPaneController::reloadWithNode(OrvexModelNodeRef node)
+{
+    _nodes = std::move(node);
+    updateTitle();
+    _list->reloadData();
+    createToolbarItems();
+}
+
+void OrvexPaneController::viewWillAppear(bool animated)
+{
+    Screen::viewWillAppear(animated);
+    updateTitle();
+    if (navigationStack())
+        navigationStack()->setToolbarHidden(false);
+    createToolbarItems();
+}
+
+void OrvexPaneController::viewWillDisappear(bool)
+{
+    _list->clearFocus();
+}
+
+void OrvexPaneController::resizeEvent(QResizeEvent*)
+{
+    _list->setGeometry(rect());
+}
+
+int OrvexPaneController::numberOfRows(const TableList&) const
+{
+    const auto* const children = _nodes ? _nodes->childNodes() : nullptr;
+    return children ? static_cast<int>(children->size()) : 0;
+}
+
+const OrvexModelNode& OrvexPaneController::childAtRow(int row) const
+{
+    return *_nodes->childNodes()->at(static_cast<std::size_t>(row));
+}
+
+std::unique_ptr<TableCell> OrvexPaneController::cellForRow(TableList& list, int row)
+{
+    const OrvexModelNode& child = childAtRow(row);
+    const bool isBranch = child.childNodes() != nullptr;
+    std::unique_ptr<TableCell> reused = list.dequeueReusableCell(kCellIdentifier);
+    if (!reused)
+        reused = std::make_unique<OrvexCell>(
+            isBranch ? OrvexCell::Kind::branch : OrvexCell::Kind::leaf, kCellIdentifier);
+
+    auto& cell = static_cast<OrvexCell&>(*reused); // this screen makes no others
+    cell.setKey(QString::fromStdString(child.displayName()));
+    if (isBranch) {
+        cell.setAccessory(TableCell::Accessory::disclosureIndicator);
+        cell.setValue({});
+        cell.setLayoutKey();
+    } else {
+        cell.setAccessory(TableCell::Accessory::none);
+        cell.setValue(child.value() ? QString::fromStdString(*child.value()) : QString());
+        cell.setLayout();
+    }
+    return reused;
+}
+
+void OrvexPaneController::didSelectRow(TableList& list, std::optional<int> row)
+{
+    if (!row)
+        return;
+    const OrvexModelNodeRef child = _nodes->childNodes()->at(static_cast<std::size_t>(*row));
+    if (!child->childNodes())
+        return list.deselectRow();
+    auto screen =
+        std::make_unique<OrvexPaneController>(_host, child, pathByAppending(_keyPath, child->displayName()));
+    screen->setStatus(_status, _isLoading);
+    if (navigationStack())
+        navigationStack()->push(std::move(screen), true);
+}
+
+void OrvexPaneController::createToolbarItems()
+{
+    auto indicator = std::make_unique<ActivityIndicator>();
+    if (_isLoading)
+        indicator->startAnimating();
+    else
+        indicator->stopAnimating();
+
+    auto label = std::make_unique<TextLabel>(Theme::systemFont(kStatusFontSize));
+    label->setLine(QString::fromStdString(_status));
+    label->setAccessibleDescription(QStringLiteral("Status"));
+    label->adjustSize();
+
+    std::vector<ToolbarItem> items;
+    items.push_back(ToolbarItem::view(std::move(indicator)));
+    items.push_back(ToolbarItem::view(std::move(label)));
+    items.push_back(ToolbarItem::flexibleSpace());
+    if (_host.offersSaveButton())
+        items.push_back(
+            ToolbarItem::button(QStringLiteral("Save"), [host = &_host] { host->showSaveView(); }));
+    setToolbarItems(std::move(items), true);
+}
+
+} // namespace orvex
