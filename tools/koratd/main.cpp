@@ -1,0 +1,54 @@
+#include "Options.h"
+#include "SignalWatcher.h"
+
+#include "service/KoratService.h"
+#include "service/Report.h"
+
+#include "FatalErrors.h"
+#include "LinuxSystemLog.h"
+#include "QtRunLoop.h"
+#include "SocketMessagePorts.h"
+
+#include <QCoreApplication>
+
+#include <cstdio>
+
+namespace {
+constexpr int kWrongUsage = 2;
+
+int serve(const orvex::korat::Options& options, orvex::korat::SignalWatcher& stopSignals)
+{
+    using namespace orvex;
+    QtRunLoop runLoop;
+    SocketMessagePorts ports;
+    korat::KoratService service({runLoop, ports}, options);
+    stopSignals.watch([&service] {
+        service.stop();
+        korat::report("sent %llu messages", static_cast<unsigned long long>(service.sent()));
+        QCoreApplication::exit(0);
+    });
+    return service.start() ? QCoreApplication::exec() : EXIT_FAILURE;
+}
+} // namespace
+
+int main(int argc, char** argv)
+{
+    const QCoreApplication application(argc, argv);
+    orvex::korat::SignalWatcher stopSignals;
+    const auto log = orvex::makeLinuxSystemLog("koratd");
+    orvex::SystemLog::install(log.get());
+
+    const auto result = orvex::korat::optionsFromArguments({argv, argv + argc});
+    int status = EXIT_SUCCESS;
+    if (result.options) {
+        status = serve(*result.options, stopSignals);
+    } else if (result.error.empty()) {
+        std::fputs(result.text.c_str(), stdout);
+    } else {
+        orvex::korat::report("%s", result.error.c_str());
+        std::fputs(result.text.c_str(), stderr);
+        status = kWrongUsage;
+    }
+    orvex::SystemLog::install(nullptr);
+    return status;
+}

@@ -1,0 +1,121 @@
+#include "KoratService.h"
+
+#include "Report.h"
+
+#include "Dictionary.h"
+#include "PropertyList.h"
+#include "TelephonyConstants.h"
+#include "TextFormat.h"
+
+#include <cerrno>
+#include <unistd.h>
+
+namespace orvex::korat {
+
+namespace {
+constexpr std::chrono::milliseconds kWatchPeriod{100};
+constexpr const char* kChannelPortPrefix = "org.orvex.Korat.LogChannel.";
+
+// Errors are errno values, which is the error domain 0.
+Bytes channelReply(int errorCode, const std::string& channelPortName = {})
+{
+    return propertyListXML(Dictionary::make({
+                               {telephony::kErrorDomain, 0},
+                               {telephony::kErrorCode, errorCode},
+                               {telephony::kRemotePortName, channelPortName},
+                           }))
+        .value_or(Bytes{});
+}
+} // namespace
+
+KoratService::KoratService(const LogChannel::Platform& platform, const Options& options)
+    : _platform(platform)
+    , _options(options)
+{
+}
+
+KoratService::~KoratService()
+{
+    stop();
+}
+
+bool KoratService::start()
+{
+    auto local = _platform.ports.createLocalPort(telephony::kServicePortName,
+        [this](std::int32_t messageId, ByteView data) { return receive(messageId, data); });
+    if (!local.port || local.alreadyExisted) {
+        report(local.alreadyExisted ? "another service is running already" : "the port %s cannot be created",
+            telephony::kServicePortName);
+        return false;
+    }
+    _port = std::move(local.port);
+    _watch = _platform.runLoop.startTimer(kWatchPeriod, [this] {
+        if (_channel && !_channel->isClientThere())
+            closeChannel();
+    });
+    return true;
+}
+
+void KoratService::stop()
+{
+    _watch.reset();
+    closeChannel();
+    if (_port)
+        _port->invalidate();
+    _port.reset();
+}
+
+std::optional<Bytes> KoratService::receive(std::int32_t messageId, ByteView data)
+{
+    if (messageId != telephony::kCreateLogChannelMessageId)
+        return std::nullopt;
+    const auto parsed = propertyListFromData(data);
+    const DictionaryRef request = parsed.value ? parsed.value->dictionary() : nullptr;
+    if (!request || (*request)[telephony::kRequest] != Value(telephony::kCreateLogChannelRequest))
+        return channelReply(EINVAL);
+    const std::string* clientPortName = (*request)[telephony::kPortName].string();
+    return clientPortName ? openChannel(*clientPortName) : channelReply(EINVAL);
+}
+
+Bytes KoratService::openChannel(const std::string& clientPortName)
+{
+    if (_options.faults.refuseChannel)
+        return channelReply(*_options.faults.refuseChannel);
+    if (_options.faults.nullPort)
+        return channelReply(0);
+    if (_channel && !_channel->doesClientListen())
+        closeChannel();
+    if (_channel) {
+        report("refused %s: %s is being served", clientPortName.c_str(), _channel->clientPortName().c_str());
+        return channelReply(EBUSY);
+    }
+    const std::string channelPortName = kChannelPortPrefix + std::to_string(++_channelNumber);
+    _channel = LogChannel::open(_platform, _options, clientPortName, channelPortName);
+    if (!_channel)
+        return channelReply(ENOENT);
+    report("serving %s", clientPortName.c_str());
+    armDeath();
+    return channelReply(0, channelPortName);
+}
+
+void KoratService::closeChannel()
+{
+    if (!_channel)
+        return;
+    report("%s has left; sent %llu messages to it", _channel->clientPortName().c_str(),
+        static_cast<unsigned long long>(_channel->sent()));
+    _sentBefore += _channel->sent();
+    _channel.reset();
+}
+
+void KoratService::armDeath()
+{
+    if (!_options.faults.dieAfter || _channelNumber != 1)
+        return;
+    _platform.runLoop.postAfter(*_options.faults.dieAfter, [] {
+        report("dying, as asked");
+        ::_exit(1);
+    });
+}
+
+} // namespace orvex::korat

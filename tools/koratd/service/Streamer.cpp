@@ -1,0 +1,89 @@
+#include "Streamer.h"
+
+#include <algorithm>
+
+namespace orvex::korat {
+
+namespace {
+using namespace std::chrono_literals;
+
+constexpr std::int32_t kLogMessageId = 0;
+constexpr auto kTick = 10ms;
+// The run loop has other work; what a tick does not manage is left to the next.
+constexpr auto kLongestTick = 20ms;
+constexpr std::size_t kLargestBacklog = std::size_t{4} << 20; // bytes
+// After a stop of the whole process nobody wants the past in one burst.
+constexpr auto kLongestCatchUp = 1s;
+
+double seconds(std::chrono::duration<double> duration)
+{
+    return duration.count();
+}
+} // namespace
+
+Streamer::Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client, std::unique_ptr<Scenario> scenario,
+    Subscription subscription, GarbageSource garbage, Pace pace)
+    : _client(std::move(client))
+    , _scenario(std::move(scenario))
+    , _subscription(std::move(subscription))
+    , _garbage(garbage)
+    , _pace(pace)
+    , _lastTick(SteadyClock::now())
+{
+    if (_subscription.wantsAny(_scenario->codes()))
+        _timer = runLoop.startTimer(kTick, [this] { tick(); });
+}
+
+void Streamer::tick()
+{
+    const auto now = SteadyClock::now();
+    const auto passed = std::min<SteadyClock::duration>(now - _lastTick, kLongestCatchUp);
+    _lastTick = now;
+    if (_client->pendingBytes() > kLargestBacklog)
+        return;
+    _elapsed += std::chrono::duration_cast<Microseconds>(passed);
+    const double rate = _pace.rate.value_or(0);
+    _allowance = std::min(_allowance + rate * seconds(passed), 1 + rate * seconds(kLongestCatchUp));
+
+    const auto deadline = now + kLongestTick;
+    while (SteadyClock::now() < deadline && _client->pendingBytes() <= kLargestBacklog) {
+        if (_pace.count && _sent >= *_pace.count) {
+            _timer.reset();
+            return;
+        }
+        if (!_next)
+            findNext(deadline);
+        if (!_next || !isDue() || !sendNext())
+            return;
+    }
+}
+
+bool Streamer::isDue() const
+{
+    return _pace.rate ? _allowance >= 1 : _next->due <= _elapsed;
+}
+
+void Streamer::findNext(SteadyClock::time_point deadline)
+{
+    while (SteadyClock::now() < deadline) {
+        auto item = _scenario->next();
+        if (_subscription.wants(item.message.code)) {
+            item.message.bytes = _garbage.pass(std::move(item.message.bytes));
+            _next = std::move(item);
+            return;
+        }
+    }
+}
+
+bool Streamer::sendNext()
+{
+    // A message that the port does not take now stays the next one.
+    if (_client->send(kLogMessageId, _next->message.bytes, 0ms) != RemotePort::Status::success)
+        return false;
+    _next.reset();
+    _allowance -= 1;
+    ++_sent;
+    return true;
+}
+
+} // namespace orvex::korat
