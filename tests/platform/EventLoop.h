@@ -4,6 +4,7 @@
 #include <QElapsedTimer>
 
 #include <chrono>
+#include <thread>
 
 namespace orvex::test {
 
@@ -16,7 +17,8 @@ bool waitUntil(Condition condition, std::chrono::milliseconds longest = std::chr
     while (!condition()) {
         if (elapsed.elapsed() > longest.count())
             return false;
-        QCoreApplication::processEvents(QEventLoop::AllEvents, 10);
+        QCoreApplication::processEvents();
+        std::this_thread::sleep_for(std::chrono::microseconds(100));
     }
     return true;
 }

@@ -1,0 +1,49 @@
+#pragma once
+
+#include "MessagePort.h"
+#include "PortFrame.h"
+
+#include <QBasicTimer>
+#include <QObject>
+
+#include <functional>
+#include <memory>
+#include <string>
+
+class QLocalSocket;
+
+namespace orvex {
+
+// One peer of a local port: reads its messages, hands them to the receiver and sends the replies back.
+//
+// A turn of the event loop handles a bounded number of messages, and while a peer does not take its replies
+// no more of its messages are handled; the rest waits in the socket and slows the sender down. Messages are
+// handled from a timer and never from a signal of the socket, so a receiver may destroy the connection.
+class PortConnection final : public QObject {
+public:
+    using Receiver = std::shared_ptr<const MessagePorts::Receiver>;
+    // Tells the owner to destroy the connection, which has ended.
+    using EndHandler = std::function<void(PortConnection*)>;
+
+    PortConnection(
+        std::string portName, std::unique_ptr<QLocalSocket> socket, Receiver receiver, EndHandler onEnd);
+    ~PortConnection() override;
+
+private:
+    void timerEvent(QTimerEvent*) noexcept override;
+    void wake();
+    void handleMessages();
+    bool readMore();
+    bool isWaitingForPeer() const;
+    void reply(const Frame& request, const Bytes& payload);
+
+    std::string _portName;
+    std::unique_ptr<QLocalSocket> _socket;
+    std::shared_ptr<FrameReader> _reader; // shared with the call that is at work in it
+    Receiver _receiver;
+    EndHandler _onEnd;
+    QBasicTimer _turn;
+    bool _isHandling = false;
+};
+
+} // namespace orvex

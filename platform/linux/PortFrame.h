@@ -1,0 +1,53 @@
+#pragma once
+
+#include "MessagePort.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <optional>
+
+namespace orvex {
+
+// What travels on the sockets of message ports, little-endian:
+//
+//    0  u32  length of the payload
+//    4  i32  message id
+//    8  u32  kind
+//   12  u32  correlation number: chosen by the requester, echoed in the reply, 0 in one-way messages
+//   16       payload
+enum class FrameKind : std::uint32_t { oneWay = 0, request = 1, reply = 2 };
+
+inline constexpr std::size_t kFrameHeaderSize = 16;
+inline constexpr std::size_t kLargestPayload = std::size_t{16} << 20;
+
+struct Frame {
+    std::int32_t messageId = 0;
+    FrameKind kind = FrameKind::oneWay;
+    std::uint32_t correlation = 0;
+    ByteView payload;
+};
+
+// The bytes of a whole frame. The payload must not be longer than kLargestPayload.
+Bytes encodedFrame(const Frame& frame);
+
+// Cuts a byte stream into frames.
+class FrameReader {
+public:
+    // Takes bytes in the order of the stream. Payloads handed out before are gone.
+    void append(ByteView bytes);
+
+    // The next whole frame; none when it is not complete yet or the stream is broken.
+    std::optional<Frame> take();
+
+    // Why nothing more can be read, as a header made no sense; null while all is well.
+    const char* fault() const { return _fault; }
+    // True when the stream ends inside a frame.
+    bool isInsideFrame() const { return _taken < _bytes.size(); }
+
+private:
+    Bytes _bytes;
+    std::size_t _taken = 0; // bytes at the front that were handed out
+    const char* _fault = nullptr;
+};
+
+} // namespace orvex

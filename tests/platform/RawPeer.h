@@ -1,0 +1,100 @@
+#pragma once
+
+#include "PortFrame.h"
+
+#include <QCoreApplication>
+
+#include <cerrno>
+#include <string>
+
+#include <poll.h>
+#include <sys/socket.h>
+#include <sys/un.h>
+#include <unistd.h>
+
+namespace orvex::test {
+
+inline sockaddr_un socketAddress(const std::string& path)
+{
+    sockaddr_un address{};
+    address.sun_family = AF_UNIX;
+    path.copy(address.sun_path, sizeof address.sun_path - 1);
+    return address;
+}
+
+// A socket that speaks to message ports byte by byte, with no help of the code under test.
+class RawPeer {
+public:
+    RawPeer()
+        : _socket(::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0))
+    {
+    }
+    explicit RawPeer(int socket)
+        : _socket(socket)
+    {
+    }
+    ~RawPeer() { leave(); }
+    RawPeer(const RawPeer&) = delete;
+    RawPeer& operator=(const RawPeer&) = delete;
+
+    bool connectTo(const std::string& path)
+    {
+        const auto address = socketAddress(path);
+        return ::connect(_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0;
+    }
+
+    // Listens without ever serving anybody by itself.
+    bool listenAt(const std::string& path)
+    {
+        const auto address = socketAddress(path);
+        return ::bind(_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0
+            && ::listen(_socket, 10) == 0;
+    }
+    int acceptOne() { return ::accept4(_socket, nullptr, nullptr, SOCK_CLOEXEC); }
+
+    // Turns the event loop, and so the port at the other end, while the socket is full.
+    bool write(ByteView bytes)
+    {
+        while (!bytes.empty()) {
+            const auto count = ::send(_socket, bytes.data(), bytes.size(), MSG_NOSIGNAL | MSG_DONTWAIT);
+            if (count < 0 && errno == EAGAIN) {
+                QCoreApplication::processEvents();
+                continue;
+            }
+            if (count <= 0)
+                return false;
+            bytes = bytes.subspan(static_cast<std::size_t>(count));
+        }
+        return true;
+    }
+    bool write(const Frame& frame) { return write(encodedFrame(frame)); }
+
+    // What is there to be read at this moment.
+    Bytes read()
+    {
+        Bytes bytes(1 << 20);
+        const auto count = ::recv(_socket, bytes.data(), bytes.size(), MSG_DONTWAIT);
+        bytes.resize(count > 0 ? static_cast<std::size_t>(count) : 0);
+        return bytes;
+    }
+
+    // True once the other side has closed and all that it wrote is read.
+    bool isClosedByOther()
+    {
+        std::uint8_t byte = 0;
+        const auto count = ::recv(_socket, &byte, 1, MSG_DONTWAIT | MSG_PEEK);
+        return count == 0 || (count < 0 && errno != EAGAIN);
+    }
+
+    void leave()
+    {
+        if (_socket >= 0)
+            ::close(_socket);
+        _socket = -1;
+    }
+
+private:
+    int _socket;
+};
+
+} // namespace orvex::test
