@@ -8,7 +8,7 @@ namespace orvex {
 DictionaryRef LogCode_0xFF0000::files() const
 {
     const auto list = propertyListFromData(_packet.from(kPacketHeaderLength).bytes());
-    if (const auto files = list.value ? list.value->dictionary() : nullptr)
+    if (auto files = list.value ? list.value->dictionary() : nullptr)
         return files;
     systemLog(Priority::error, "SIM File dictionary data could not be constructed");
     throw UnknownDataException();

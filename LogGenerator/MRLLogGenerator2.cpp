@@ -68,7 +68,7 @@ void MRLLogGenerator2::updateWithData(ByteView data)
 
 Value MRLLogGenerator2::generateLogUsingState(Dictionary& state)
 {
-    const Value display = getDisplayFromState(state);
+    Value display = getDisplayFromState(state);
     handOverBinData(state);
     updateHistoryInState(state, environment().clock);
     return display;

@@ -20,6 +20,7 @@ void formatInto(std::string& result, const char* format, std::va_list arguments)
     std::va_list again; // NOLINT(cppcoreguidelines-init-variables): va_copy initialises it
     va_copy(again, arguments);
     std::array<char, 128> buffer; // NOLINT(cppcoreguidelines-pro-type-member-init): filled by vsnprintf
+    // NOLINTNEXTLINE(clang-analyzer-valist.Uninitialized): the caller started it
     const int length = std::vsnprintf(buffer.data(), buffer.size(), format, arguments);
     if (length < 0) {
         result.clear(); // an encoding error of the C library: nothing sensible was written
