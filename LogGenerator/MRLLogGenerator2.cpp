@@ -109,7 +109,7 @@ DictionaryRef MRLLogGenerator2::templateFromState(Dictionary& state) const
 {
     if (auto skeleton = state["Template"].dictionary())
         return skeleton;
-    const auto skeleton = _pListName.empty() ? nullptr : environment().resources.dictionaryNamed(_pListName);
+    auto skeleton = _pListName.empty() ? nullptr : environment().resources.dictionaryNamed(_pListName);
     if (!skeleton) {
         systemLog(Priority::error, "Cannot load template for display");
         return nullptr;

@@ -1,6 +1,7 @@
 #include "TextLabel.h"
 
 #include <QFontMetrics>
+#include <QPainter>
 
 #include <algorithm>
 
@@ -31,6 +32,17 @@ TextLabel::TextLabel(const QFont& font, QWidget* parent)
 void TextLabel::setLine(const QString& text)
 {
     setText(inOneLine(text));
+}
+
+void TextLabel::paintEvent(QPaintEvent*)
+{
+    const int room = parentWidget() ? std::min(width(), parentWidget()->width() - x()) : width();
+    QPainter painter(this);
+    painter.setPen(palette().color(foregroundRole()));
+    painter.drawText(QRect(0, 0, room, height()), Qt::AlignLeft | Qt::AlignVCenter | Qt::TextSingleLine,
+        room < width() || room < sizeOfLine(text(), font()).width()
+            ? fontMetrics().elidedText(text(), Qt::ElideRight, room)
+            : text());
 }
 
 QSize sizeOfLine(const QString& text, const QFont& font)

@@ -37,6 +37,7 @@ int main(int argc, char** argv)
     orvex::korat::SignalWatcher stopSignals;
     const auto log = orvex::makeLinuxSystemLog("koratd");
     orvex::SystemLog::install(log.get());
+    orvex::installFatalErrorHandler();
 
     const auto result = orvex::korat::optionsFromArguments({argv, argv + argc});
     int status = EXIT_SUCCESS;
@@ -50,5 +51,6 @@ int main(int argc, char** argv)
         status = kWrongUsage;
     }
     orvex::SystemLog::install(nullptr);
+    log->flush();
     return status;
 }
