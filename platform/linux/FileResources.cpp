@@ -1,0 +1,82 @@
+#include "FileResources.h"
+
+#include "PropertyList.h"
+#include "SystemLog.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <cstdlib>
+#include <cstring>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+
+namespace orvex {
+
+namespace {
+namespace fs = std::filesystem;
+
+bool isInside(const fs::path& path, const fs::path& directory)
+{
+    const auto [inPath, inDirectory] =
+        std::mismatch(path.begin(), path.end(), directory.begin(), directory.end());
+    return inDirectory == directory.end();
+}
+
+DictionaryRef refuse(const std::string& path, const std::string& why)
+{
+    systemLog(Priority::error, "Resource %s: %s", path.c_str(), why.c_str());
+    return nullptr;
+}
+} // namespace
+
+std::string FileResources::defaultDirectory()
+{
+    if (const char* chosen = std::getenv("ORVEX_RESOURCES"); chosen && *chosen)
+        return chosen;
+    std::error_code error;
+    const fs::path program = fs::read_symlink("/proc/self/exe", error);
+    // An installed program lies elsewhere and knows nothing of the source tree.
+    if (!error && isInside(program, ORVEX_BUILD_DIRECTORY)) {
+        const fs::path sources = fs::path(ORVEX_SOURCE_DIRECTORY) / "resources";
+        if (fs::is_directory(sources, error))
+            return sources.string();
+    }
+    return ORVEX_DATA_DIRECTORY;
+}
+
+std::vector<std::string> FileResources::propertyListPaths() const
+{
+    std::vector<std::string> paths;
+    std::error_code error;
+    fs::directory_iterator entry(_directory, error);
+    for (; !error && entry != fs::directory_iterator(); entry.increment(error)) {
+        if (entry->path().extension() == ".plist")
+            paths.push_back(entry->path().string());
+    }
+    if (error)
+        systemLog(Priority::error, "Resources %s: %s", _directory.c_str(), error.message().c_str());
+    std::sort(paths.begin(), paths.end());
+    return paths;
+}
+
+DictionaryRef FileResources::dictionaryNamed(const std::string& baseName) const
+{
+    const std::string path = _directory + '/' + baseName + ".plist";
+    std::error_code error;
+    if (fs::is_directory(path, error))
+        return refuse(path, "it is a directory");
+    std::ifstream file(path, std::ios::binary);
+    if (!file)
+        return refuse(path, std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
+    const Bytes data{std::istreambuf_iterator<char>(file), {}};
+    const auto list = propertyListFromData(data);
+    if (!list.value)
+        return refuse(path, list.error);
+    const auto dictionary = list.value->dictionary();
+    return dictionary
+        ? dictionary
+        : refuse(path, std::string("it holds no dictionary but: ") + nameOf(list.value->kind()));
+}
+
+} // namespace orvex

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "Resources.h"
+
+#include <string>
+
+namespace orvex {
+
+// The plist files of one directory, read anew at every call.
+class FileResources final : public Resources {
+public:
+    explicit FileResources(std::string directory)
+        : _directory(std::move(directory))
+    {
+    }
+
+    // $ORVEX_RESOURCES; else, for a program that runs from the build tree, the source tree's resources; else
+    // the installed data directory.
+    static std::string defaultDirectory();
+
+    std::vector<std::string> propertyListPaths() const override;
+    DictionaryRef dictionaryNamed(const std::string& baseName) const override;
+
+private:
+    std::string _directory;
+};
+
+} // namespace orvex
