@@ -1,0 +1,77 @@
+#include "CaptureReader.h"
+
+#include "TextFormat.h"
+
+#include <pcap/pcap.h>
+
+#include <array>
+#include <cerrno>
+#include <cstring>
+
+namespace orvex {
+
+struct CaptureReader::Pcap {
+    explicit Pcap(pcap_t* opened)
+        : handle(opened)
+    {
+    }
+    ~Pcap() { pcap_close(handle); }
+    Pcap(const Pcap&) = delete;
+    Pcap& operator=(const Pcap&) = delete;
+
+    pcap_t* handle;
+};
+
+CaptureReader::CaptureReader(const std::string& path)
+    : _path(path)
+{
+    // Opened here, since libpcap takes "-" for the standard input and says less of what went wrong.
+    std::FILE* file = std::fopen(path.c_str(), "rbe");
+    if (!file) {
+        breakOff(std::strerror(errno));
+        return;
+    }
+    std::array<char, PCAP_ERRBUF_SIZE> reason{};
+    pcap_t* opened = pcap_fopen_offline(file, reason.data());
+    if (!opened) {
+        std::fclose(file);
+        breakOff(std::string("not a pcap file: ") + reason.data());
+        return;
+    }
+    _pcap = std::make_unique<Pcap>(opened);
+    if (pcap_datalink(opened) != DLT_USER0) {
+        breakOff(text("its link type is %d; log messages have %d (USER0)", pcap_datalink(opened), DLT_USER0));
+        _pcap.reset();
+    }
+}
+
+CaptureReader::~CaptureReader() = default;
+
+CaptureReader::Status CaptureReader::next()
+{
+    if (!_pcap)
+        return Status::broken;
+    for (;;) {
+        pcap_pkthdr* header = nullptr;
+        const u_char* bytes = nullptr;
+        const int result = pcap_next_ex(_pcap->handle, &header, &bytes);
+        if (result == PCAP_ERROR_BREAK)
+            return Status::end;
+        if (result != 1)
+            return breakOff(pcap_geterr(_pcap->handle));
+        if (header->caplen < header->len) {
+            ++_incompletePackets;
+            continue;
+        }
+        _message = ByteView(bytes, header->caplen);
+        return Status::message;
+    }
+}
+
+CaptureReader::Status CaptureReader::breakOff(const std::string& reason)
+{
+    _error = _path + ": " + reason;
+    return Status::broken;
+}
+
+} // namespace orvex

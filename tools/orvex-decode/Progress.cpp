@@ -1,0 +1,47 @@
+#include "Progress.h"
+
+#include <cstdio>
+#include <filesystem>
+
+#include <unistd.h>
+
+namespace orvex {
+
+namespace {
+constexpr std::uintmax_t kLargeJob = std::uintmax_t{64} << 20;
+constexpr std::uintmax_t kStep = std::uintmax_t{8} << 20;
+constexpr std::size_t kPcapRecordHeader = 16;
+} // namespace
+
+Progress::Progress(const std::vector<std::string>& captures)
+{
+    for (const std::string& capture : captures) {
+        std::error_code unreadable;
+        const std::uintmax_t size = std::filesystem::file_size(capture, unreadable);
+        _totalBytes += unreadable ? 0 : size;
+    }
+    _isShown = _totalBytes >= kLargeJob && isatty(STDERR_FILENO) == 1;
+}
+
+Progress::~Progress()
+{
+    if (_isShown)
+        std::fputs("\r\x1b[K", stderr);
+}
+
+void Progress::advance(std::size_t messageLength)
+{
+    _bytes += messageLength + kPcapRecordHeader;
+    if (!_isShown || _bytes < _nextShown)
+        return;
+    _nextShown = _bytes + kStep;
+    show();
+}
+
+void Progress::show() const
+{
+    const double part = 100.0 * static_cast<double>(_bytes) / static_cast<double>(_totalBytes);
+    std::fprintf(stderr, "\rorvex-decode: %.0f %% of %ju MiB", part, _totalBytes >> 20);
+}
+
+} // namespace orvex
