@@ -2,6 +2,7 @@
 
 #include "BarButton.h"
 #include "NavigationBar.h"
+#include "Theme.h"
 #include "Toolbar.h"
 
 #include <QKeyEvent>
@@ -17,8 +18,14 @@ NavigationStack::NavigationStack(std::unique_ptr<Screen> root, QWidget* parent)
     : QWidget(parent)
     , _bar(new NavigationBar(this))
     , _pages(new QWidget(this))
+    , _edge(new QWidget(_pages))
     , _toolbar(new Toolbar(this))
 {
+    QPalette edgePalette;
+    edgePalette.setColor(QPalette::Window, Theme::current().barSeparator);
+    _edge->setPalette(edgePalette);
+    _edge->setAutoFillBackground(true);
+    _edge->hide();
     connect(&_bar->backButton(), &QAbstractButton::clicked, this, [this] { pop(true); });
     adopt(std::move(root));
     setFocusProxy(&topScreen());
@@ -76,6 +83,8 @@ void NavigationStack::slide(Screen& leaving, Direction direction, bool animated)
     arriving.setGeometry(_pages->rect());
     arriving.show();
     (isPush ? arriving : leaving).raise();
+    _edge->raise();
+    _edge->show();
     setFocusProxy(&arriving);
     arriving.setFocus();
     // A second tap that was meant for the screen below must not fall upon the one that slides in.
@@ -86,11 +95,13 @@ void NavigationStack::slide(Screen& leaving, Direction direction, bool animated)
             isPush ? progress : 1 - progress; // share of the width that the upper one covers
         const int upper = qRound((1 - covered) * _pages->width());
         const int lower = qRound(-covered * kParallax * _pages->width());
+        _edge->setGeometry(upper - 1, 0, 1, _pages->height());
         leaving.move(isPush ? lower : upper, 0);
         arriving.move(isPush ? upper : lower, 0);
     };
     const auto end = [this, &leaving, isPush] {
         _pages->setAttribute(Qt::WA_TransparentForMouseEvents, false);
+        _edge->hide();
         leaving.hide();
         if (!isPush)
             leaving.deleteLater();

@@ -62,6 +62,7 @@ private:
 
     NavigationBar* _bar;
     QWidget* _pages;
+    QWidget* _edge; // between the two screens of a slide, child of _pages
     Toolbar* _toolbar;
     std::vector<Screen*> _screens; // children of _pages
     Delegate* _delegate = nullptr;

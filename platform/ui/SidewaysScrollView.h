@@ -16,6 +16,8 @@ public:
 
     int offset() const { return _offset; }
     int maximumOffset() const { return qMax(0, _content->width() - width()); }
+    // Whether something stands to the right of what is seen.
+    bool hidesContentAtRight() const;
     // Kept within the content. The overshoot is how far a finger has pulled beyond the end, for show only.
     void setOffset(int offset, int overshoot = 0);
 

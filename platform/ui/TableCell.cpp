@@ -1,6 +1,7 @@
 #include "TableCell.h"
 
 #include "Chevron.h"
+#include "SidewaysScrollView.h"
 #include "Theme.h"
 
 #include <QPainter>
@@ -15,6 +16,8 @@ constexpr int kSeparatorLeft = 10;
 constexpr double kChevronWidth = 6.5;
 constexpr double kChevronHeight = 12;
 constexpr double kChevronRight = 14; // from the chevron's tip to the edge
+constexpr double kDotRadius = 1;
+constexpr double kDotDistance = 3.2;
 constexpr int kDisclosureWidth = 20; // what the chevron takes from the content view
 } // namespace
 
@@ -65,6 +68,19 @@ void TableCell::paintEvent(QPaintEvent*)
             kChevronWidth, kChevronHeight);
         drawChevron(painter, chevron, ChevronDirection::right, theme.accessory, 2);
     }
+    if (sidewaysScrollView() && sidewaysScrollView()->hidesContentAtRight())
+        drawMoreMark(painter);
+}
+
+// Three dots beside the content: a value may be wholly out of sight, and nobody would look for it.
+void TableCell::drawMoreMark(QPainter& painter) const
+{
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(Theme::current().accessory);
+    const QPointF middle(_contentView->geometry().right() + kRightInset * 0.5 - 1, height() * 0.5 + 4);
+    for (const int dot : {-1, 0, 1})
+        painter.drawEllipse(middle + QPointF(dot * kDotDistance, 0), kDotRadius, kDotRadius);
 }
 
 } // namespace orvex

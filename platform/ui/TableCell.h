@@ -4,6 +4,8 @@
 
 #include <string>
 
+class QPainter;
+
 namespace orvex {
 
 class SidewaysScrollView;
@@ -42,6 +44,8 @@ protected:
 
 private:
     friend class TableList;
+
+    void drawMoreMark(QPainter& painter) const;
 
     std::string _reuseIdentifier;
     QWidget* _contentView;

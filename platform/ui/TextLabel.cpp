@@ -8,6 +8,8 @@
 namespace orvex {
 
 namespace {
+constexpr int kFadeLength = 22;
+
 QString inOneLine(QString text)
 {
     const auto breaksLine = [](QChar character) {
@@ -34,11 +36,20 @@ void TextLabel::setLine(const QString& text)
     setText(inOneLine(text));
 }
 
+// Text that a view cuts off fades away at the edge.
 void TextLabel::paintEvent(QPaintEvent*)
 {
     const int room = parentWidget() ? std::min(width(), parentWidget()->width() - x()) : width();
     QPainter painter(this);
-    painter.setPen(palette().color(foregroundRole()));
+    const QColor color = palette().color(foregroundRole());
+    painter.setPen(color);
+    const QRect seen = visibleRegion().boundingRect();
+    if (room == width() && !seen.isEmpty() && seen.right() < width() - 1) {
+        QLinearGradient fading(seen.right() - kFadeLength, 0, seen.right(), 0);
+        fading.setColorAt(0, color);
+        fading.setColorAt(1, QColor(color.red(), color.green(), color.blue(), 0));
+        painter.setPen(QPen(fading, 1));
+    }
     painter.drawText(QRect(0, 0, room, height()), Qt::AlignLeft | Qt::AlignVCenter | Qt::TextSingleLine,
         room < width() || room < sizeOfLine(text(), font()).width()
             ? fontMetrics().elidedText(text(), Qt::ElideRight, room)

@@ -1,0 +1,153 @@
+// orvex: the window, or with --console the terminal, on the handset's baseband.
+
+#include "CommandLine.h"
+#include "OrvexApp.h"
+#include "OrvexConsole.h"
+#include "StandardOutput.h"
+#include "TerminationSignals.h"
+
+#include "Accessibility.h"
+#include "FatalErrors.h"
+#include "FileResources.h"
+#include "IniPreferences.h"
+#include "KoratTelephonyService.h"
+#include "LinuxSystemLog.h"
+#include "QtRunLoop.h"
+#include "SocketMessagePorts.h"
+#include "SystemClock.h"
+
+#include "Console.h"
+#include "SystemLog.h"
+
+#include <QApplication>
+
+#include <algorithm>
+#include <csignal>
+#include <cstdio>
+#include <cstdlib>
+
+namespace {
+
+using namespace orvex;
+
+constexpr int kExitFailure = 1;
+constexpr int kExitWrongUsage = 2;
+
+// The platform's implementations, in the order in which they need each other.
+struct LinuxPlatform {
+    explicit LinuxPlatform(const std::string& resourceDirectory)
+        : resources(resourceDirectory)
+    {
+    }
+
+    AppPlatform forApp()
+    {
+        return {.session = {.runLoop = runLoop,
+                    .ports = ports,
+                    .telephony = telephony,
+                    .generators = {.resources = resources, .clock = clock, .buildVersion = ORVEX_VERSION}},
+            .preferences = preferences};
+    }
+
+    QtRunLoop runLoop;
+    SocketMessagePorts ports;
+    KoratTelephonyService telephony{ports};
+    FileResources resources;
+    SystemClock clock;
+    IniPreferences preferences;
+};
+
+void complainOfNoDisplay()
+{
+    std::fputs("orvex: There is no display to connect to. Try 'orvex --console'.\n", stderr);
+}
+
+bool displayIsNamed()
+{
+    constexpr const char* kNames[] = {"DISPLAY", "WAYLAND_DISPLAY", "QT_QPA_PLATFORM"};
+    return std::ranges::any_of(kNames, [](const char* name) {
+        const char* const value = std::getenv(name);
+        return value && *value != '\0';
+    });
+}
+
+// While the application object comes into being, Qt's only fatal message is that no display can be opened;
+// it would abort the process after it. The warnings before it say the same at length.
+void endWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString&)
+{
+    if (type != QtFatalMsg)
+        return;
+    complainOfNoDisplay();
+    std::_Exit(kExitFailure);
+}
+
+int runConsole(int argc, char** argv, const std::string& resourceDirectory)
+{
+    const QCoreApplication application(argc, argv);
+    // Standard output is the tree's.
+    installConsole([](std::string_view line) {
+        std::fprintf(stderr, "%.*s\n", static_cast<int>(line.size()), line.data());
+    });
+    LinuxPlatform platform(resourceDirectory);
+    StandardOutput output([] { QCoreApplication::quit(); });
+    OrvexConsole console(platform.forApp(), output);
+    const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
+    console.start();
+    const int status = QCoreApplication::exec();
+    console.applicationWillTerminate();
+    return status;
+}
+
+int runWindow(int argc, char** argv, const std::string& resourceDirectory, Theme::Mode theme)
+{
+    if (!displayIsNamed()) {
+        complainOfNoDisplay();
+        return kExitFailure;
+    }
+    const QtMessageHandler usualHandler = qInstallMessageHandler(endWithoutDisplay);
+    const QApplication application(argc, argv);
+    qInstallMessageHandler(usualHandler);
+    QApplication::setApplicationName(QStringLiteral("orvex"));
+    QApplication::setApplicationDisplayName(QStringLiteral("Orvex"));
+    Theme::use(theme);
+    installAccessibility();
+
+    LinuxPlatform platform(resourceDirectory);
+    const auto app = OrvexApp::create(platform.forApp());
+    const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
+    app->applicationDidFinishLaunching();
+    const int status = QApplication::exec();
+    app->applicationWillTerminate();
+    return status;
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    QStringList arguments;
+    for (int i = 0; i < argc; ++i)
+        arguments << QString::fromLocal8Bit(argv[i]);
+    const CommandLine commandLine = CommandLine::parse(arguments);
+    switch (commandLine.action) {
+    case CommandLine::Action::wrongUsage:
+        std::fprintf(stderr, "orvex: %s\n%s", commandLine.error.c_str(), CommandLine::usage().c_str());
+        return kExitWrongUsage;
+    case CommandLine::Action::help: std::fputs(CommandLine::usage().c_str(), stdout); return EXIT_SUCCESS;
+    case CommandLine::Action::version: std::puts("orvex " ORVEX_VERSION); return EXIT_SUCCESS;
+    case CommandLine::Action::window:
+    case CommandLine::Action::console: break;
+    }
+
+    std::signal(SIGPIPE, SIG_IGN); // a reader that goes is told by the write that fails
+    const auto log = makeLinuxSystemLog("orvex");
+    SystemLog::install(log.get());
+    installFatalErrorHandler();
+    const std::string directory = commandLine.resources.value_or(FileResources::defaultDirectory());
+    const int status = commandLine.action == CommandLine::Action::console
+        ? runConsole(argc, argv, directory)
+        : runWindow(argc, argv, directory, commandLine.theme);
+    SystemLog::install(nullptr);
+    log->flush();
+    return status;
+}

@@ -1,0 +1,42 @@
+#include "CommandLine.h"
+
+#include <gtest/gtest.h>
+
+namespace orvex::test {
+namespace {
+
+TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
+{
+    using Action = CommandLine::Action;
+    using Mode = Theme::Mode;
+    const struct {
+        QStringList arguments;
+        Action action;
+        Mode theme = Mode::system;
+        std::optional<std::string> resources = {};
+    } cases[] = {
+        {{}, Action::window},
+        {{"--console"}, Action::console},
+        {{"--help"}, Action::help},
+        {{"-h"}, Action::help},
+        {{"--version", "--console"}, Action::version},
+        {{"--resources", "/a b", "--dark"}, Action::window, Mode::dark, "/a b"},
+        {{"--resources=x", "--light"}, Action::window, Mode::light, "x"},
+        {{"--resources"}, Action::wrongUsage},
+        {{"--no-such"}, Action::wrongUsage},
+        {{"--console=yes"}, Action::wrongUsage},
+        {{"file"}, Action::wrongUsage},
+        {{"--light", "--dark"}, Action::wrongUsage},
+    };
+    for (const auto& test : cases) {
+        SCOPED_TRACE(test.arguments.join(' ').toStdString());
+        const CommandLine result = CommandLine::parse(QStringList{"orvex"} + test.arguments);
+        EXPECT_EQ(result.action, test.action);
+        EXPECT_EQ(result.theme, test.theme);
+        EXPECT_EQ(result.resources, test.resources);
+        EXPECT_EQ(result.error.empty(), test.action != Action::wrongUsage);
+    }
+}
+
+} // namespace
+} // namespace orvex::test

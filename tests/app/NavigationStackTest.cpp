@@ -1,0 +1,169 @@
+#include "NavigationStack.h"
+
+#include "BarButton.h"
+#include "NavigationBar.h"
+#include "Toolbar.h"
+
+#include <QApplication>
+#include <QPointer>
+#include <QTest>
+
+#include <gtest/gtest.h>
+
+namespace orvex::test {
+namespace {
+
+class NamedScreen final : public Screen {
+public:
+    NamedScreen(const QString& title, std::vector<std::string>& calls)
+        : _calls(calls)
+    {
+        setTitle(title);
+        setFocusPolicy(Qt::StrongFocus);
+    }
+    void viewWillAppear(bool) override { _calls.push_back("+" + title().toStdString()); }
+    void viewWillDisappear(bool) override { _calls.push_back("-" + title().toStdString()); }
+
+private:
+    std::vector<std::string>& _calls;
+};
+
+class NavigationStackTest : public testing::Test, public NavigationStack::Delegate {
+protected:
+    NavigationStackTest()
+    {
+        stack.setDelegate(this);
+        stack.resize(300, 400);
+        stack.show();
+        QApplication::setActiveWindow(&stack);
+    }
+    ~NavigationStackTest() override { setAnimationsEnabled(false); }
+
+    void willShowScreen(NavigationStack&, Screen& screen, bool animated) override
+    {
+        calls.push_back((animated ? "show animated " : "show ") + screen.title().toStdString());
+    }
+    std::unique_ptr<Screen> screen(const char* title) { return std::make_unique<NamedScreen>(title, calls); }
+    std::vector<std::string> take() { return std::exchange(calls, {}); }
+    BarButton& back() const { return stack.navigationBar().backButton(); }
+
+    std::vector<std::string> calls;
+    NavigationStack stack{screen("Root")};
+};
+
+using Calls = std::vector<std::string>;
+
+TEST_F(NavigationStackTest, TellsTheScreensAndTheDelegateInOrder)
+{
+    EXPECT_EQ(take(), Calls{"+Root"});
+    stack.push(screen("A"), false);
+    EXPECT_EQ(take(), (Calls{"-Root", "+A", "show A"}));
+    stack.push(screen("B"), true);
+    stack.push(screen("C"), true);
+    take();
+    stack.popTo(1, true);
+    EXPECT_EQ(take(), (Calls{"-C", "+A", "show animated A"}));
+    EXPECT_EQ(stack.count(), 2);
+    for (const int index : {1, 2, -1})
+        stack.popTo(index, true);
+    EXPECT_EQ(take(), Calls());
+    stack.pop(true);
+    stack.pop(true);
+    EXPECT_EQ(stack.count(), 1);
+}
+
+TEST_F(NavigationStackTest, TheBackButtonBearsTheTitleOfTheScreenBelow)
+{
+    EXPECT_TRUE(back().isHidden());
+    stack.push(screen("A"), false);
+    stack.push(screen("B"), false);
+    EXPECT_EQ(stack.navigationBar().title(), "B");
+    EXPECT_EQ(back().text(), "A");
+    EXPECT_EQ(back().accessibleName(), "Back to A");
+    stack.screenAt(1).setTitle("A2");
+    EXPECT_EQ(back().text(), "A2");
+    QTest::mouseClick(&back(), Qt::LeftButton);
+    EXPECT_EQ(stack.navigationBar().title(), "A2");
+    EXPECT_EQ(back().text(), "Root");
+}
+
+TEST_F(NavigationStackTest, EscapeBackspaceAndTheBackKeyPop)
+{
+    for (const auto key : {Qt::Key_Escape, Qt::Key_Backspace, Qt::Key_Back}) {
+        stack.push(screen("A"), false);
+        QTest::keyClick(&stack.topScreen(), key);
+        EXPECT_EQ(stack.count(), 1);
+        QTest::keyClick(&stack.topScreen(), key);
+        EXPECT_EQ(stack.count(), 1);
+    }
+    QTest::keyClick(&stack.topScreen(), Qt::Key_Left);
+}
+
+TEST_F(NavigationStackTest, APushSlidesInAndTheNextOneFinishesItFirst)
+{
+    setAnimationsEnabled(true);
+    Screen& root = stack.topScreen();
+    stack.push(screen("A"), true);
+    Screen& a = stack.topScreen();
+    EXPECT_TRUE(stack.isAnimating());
+    EXPECT_EQ(a.x(), 300);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return a.x() < 280; }, 1000));
+    EXPECT_LT(root.x(), 0);
+    stack.push(screen("B"), true);
+    EXPECT_EQ(stack.topScreen().x(), 300);
+    EXPECT_FALSE(root.isVisible());
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !stack.isAnimating(); }, 1000));
+    EXPECT_EQ(stack.topScreen().geometry(), QRect(0, 0, 300, 400 - 44 - 44));
+    EXPECT_FALSE(a.isVisible());
+
+    const QPointer<Screen> b = &stack.topScreen();
+    stack.pop(true);
+    EXPECT_TRUE(b->isVisible()); // on its way out
+    stack.pop(true);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !stack.isAnimating() && !b; }, 1000));
+    EXPECT_EQ(stack.count(), 1);
+    EXPECT_EQ(root.x(), 0);
+    EXPECT_TRUE(root.isVisible());
+}
+
+TEST_F(NavigationStackTest, ResizingDuringASlideLeavesTheTopScreenInPlace)
+{
+    setAnimationsEnabled(true);
+    stack.push(screen("A"), true);
+    stack.resize(500, 700);
+    EXPECT_FALSE(stack.isAnimating());
+    EXPECT_EQ(stack.topScreen().geometry(), QRect(0, 0, 500, 700 - 44 - 44));
+    stack.setToolbarHidden(true);
+    EXPECT_EQ(stack.topScreen().geometry(), QRect(0, 0, 500, 700 - 44));
+}
+
+TEST_F(NavigationStackTest, AClickThatARefreshFallsIntoStillCounts)
+{
+    int clicks = 0;
+    const auto setItems = [&] {
+        std::vector<ToolbarItem> items;
+        items.push_back(ToolbarItem::flexibleSpace());
+        items.push_back(ToolbarItem::button("Save", [&clicks] { ++clicks; }));
+        stack.topScreen().setToolbarItems(std::move(items), true);
+    };
+    setItems();
+    const auto button = [&] { return stack.topScreen().toolbarRow()->items().back().widget; };
+    const QPointer<QWidget> pressed = button();
+    QTest::mousePress(pressed, Qt::LeftButton);
+    setItems();
+    setItems();
+    ASSERT_TRUE(pressed);
+    EXPECT_NE(button(), pressed);
+    QTest::mouseRelease(pressed, Qt::LeftButton);
+    EXPECT_EQ(clicks, 1);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !pressed; }, 1000));
+    QTest::mouseClick(button(), Qt::LeftButton);
+    EXPECT_EQ(clicks, 2);
+
+    button()->setFocus();
+    setItems();
+    EXPECT_TRUE(button()->hasFocus());
+}
+
+} // namespace
+} // namespace orvex::test

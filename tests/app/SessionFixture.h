@@ -1,0 +1,84 @@
+#pragma once
+
+#include "AppPlatform.h"
+
+#include "FakeTelephony.h"
+#include "FixedClock.h"
+#include "FixedResources.h"
+#include "LogPackets.h"
+#include "ManualRunLoop.h"
+
+#include "Array.h"
+#include "Dictionary.h"
+
+#include <string>
+#include <vector>
+
+namespace orvex::test {
+
+// Keeps what is done to the preferences, in order.
+class RecordingPreferences final : public Preferences {
+public:
+    void setValue(const std::string& domain, const std::string& key, const Value& value) override
+    {
+        const bool isFalse = value == Value(false);
+        done.push_back("set " + domain + " " + key + (isFalse ? " false" : " ?"));
+    }
+    void synchronize(const std::string& domain) override { done.push_back("synchronize " + domain); }
+    void postChanged(const std::string& domain, const std::string& key) override
+    {
+        done.push_back("changed " + domain + " " + key);
+    }
+
+    std::vector<std::string> done;
+};
+
+inline const std::vector<std::string> kHomeScreenWrite = {
+    "set org.orvex.HomeScreen HXShowGSMRSSI false",
+    "synchronize org.orvex.HomeScreen",
+    "changed org.orvex.HomeScreen HXShowGSMRSSI",
+};
+
+// A platform on which a real session decodes LTE packets.
+struct SessionFixture {
+    SessionFixture()
+    {
+        resources.templates["LTE"] = Dictionary::make({
+            {"Neighbor Measurements", Dictionary::make({{"Version", "-"}, {"E-ARFCN", "-"}})},
+            {"Neighbor Cells List", Array::make()},
+        });
+    }
+
+    AppPlatform platform()
+    {
+        return {.session = {.runLoop = runLoop,
+                    .ports = telephony,
+                    .telephony = telephony,
+                    .generators = {.resources = resources, .clock = clock, .buildVersion = {}}},
+            .preferences = preferences};
+    }
+
+    // An idle-mode neighbour report, on frequency 6300, with so many neighbours.
+    void deliverNeighbors(std::size_t count)
+    {
+        Bytes payload = {0x03, 0, 0, 0, 0x9C, 0x18, 0xC0, 0x07};
+        payload.resize(payload.size() + 20 * count, 0x55);
+        telephony.deliver(packet(0xB180, payload));
+    }
+    // One refresh of the session.
+    void refresh() { runLoop.advance(std::chrono::seconds(2)); }
+    // The service is gone, and is not there again when asked.
+    void loseService()
+    {
+        telephony.serviceIsAbsent = true;
+        telephony.remotePort->valid = false;
+    }
+
+    ManualRunLoop runLoop;
+    FakeTelephony telephony;
+    FixedResources resources;
+    FixedClock clock;
+    RecordingPreferences preferences;
+};
+
+} // namespace orvex::test

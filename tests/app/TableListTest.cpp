@@ -1,0 +1,282 @@
+#include "TableList.h"
+
+#include "SidewaysScrollView.h"
+
+#include <QApplication>
+#include <QElapsedTimer>
+#include <QPixmap>
+#include <QScroller>
+#include <QTest>
+#include <QWheelEvent>
+
+#include <gtest/gtest.h>
+#include <set>
+
+namespace orvex::test {
+namespace {
+
+// A cell whose rows are three times as wide as the list.
+class WideCell final : public TableCell {
+public:
+    explicit WideCell(std::string identifier)
+        : TableCell(std::move(identifier))
+        , _view(new SidewaysScrollView(contentView()))
+    {
+    }
+    void layoutSubviews() override
+    {
+        TableCell::layoutSubviews();
+        _view->setGeometry(contentView()->rect());
+        _view->setContentSize({_view->width() * 3, _view->height()});
+    }
+    SidewaysScrollView* sidewaysScrollView() const override { return _view; }
+
+private:
+    SidewaysScrollView* _view;
+};
+
+class Rows final : public TableList::DataSource {
+public:
+    int numberOfRows(const TableList&) const override { return count; }
+    std::unique_ptr<TableCell> cellForRow(TableList& list, int row) override
+    {
+        const std::string identifier = identifierOf ? identifierOf(row) : "cell";
+        auto cell = list.dequeueReusableCell(identifier);
+        if (!cell) {
+            ++made;
+            cell = std::make_unique<WideCell>(identifier);
+        }
+        return cell;
+    }
+    void didSelectRow(TableList&, std::optional<int> row) override { opened.push_back(row.value_or(-1)); }
+
+    int count = 100;
+    int made = 0;
+    std::function<std::string(int)> identifierOf;
+    std::vector<int> opened;
+};
+
+class TableListTest : public testing::Test {
+protected:
+    TableListTest()
+    {
+        list.resize(300, 440); // ten rows
+        list.reloadData();
+        list.show();
+    }
+
+    void drag(QPoint from, QPoint by, int steps = 10)
+    {
+        QTest::mousePress(&list, Qt::LeftButton, {}, from);
+        for (int step = 1; step <= steps; ++step)
+            QTest::mouseMove(&list, from + by * step / steps, 20);
+        // Standing still before the release, so that nothing is flung.
+        for (int i = 0; i < 10; ++i)
+            QTest::mouseMove(&list, from + by, 30);
+        QTest::qWait(50); // the scroller moves at the rate of frames
+        QTest::mouseRelease(&list, Qt::LeftButton, {}, from + by, 30);
+    }
+    void wheel(QPoint angle, QPoint at)
+    {
+        QWheelEvent event(
+            at, list.mapToGlobal(at), {}, angle, Qt::NoButton, Qt::NoModifier, Qt::NoScrollPhase, false);
+        QApplication::sendEvent(&list, &event);
+    }
+    int sidewaysAt(int row) const { return list.cellAtRow(row)->sidewaysScrollView()->offset(); }
+
+    Rows rows;
+    TableList list{rows, nullptr};
+};
+
+TEST_F(TableListTest, OnlyTheRowsInViewHaveCells)
+{
+    EXPECT_EQ(rows.made, 10);
+    EXPECT_EQ(list.cellAtRow(10), nullptr);
+    for (int offset = 0; offset <= list.maximumOffset(); offset += 30)
+        list.setContentOffset(offset);
+    EXPECT_EQ(rows.made, 11); // between two whole rows eleven are in view
+    EXPECT_EQ(list.contentOffset() / 44, 90);
+    EXPECT_EQ(list.cellAtRow(95)->geometry(), QRect(0, 95 * 44 - list.contentOffset(), 300, 44));
+}
+
+TEST_F(TableListTest, ReloadingHandsEachRowItsOwnCell)
+{
+    list.setContentOffset(20); // an eleventh cell
+    list.setContentOffset(0);  // which now waits for reuse
+    std::vector<TableCell*> before;
+    for (int row = 0; row < 10; ++row)
+        before.push_back(list.cellAtRow(row));
+    for (int time = 0; time < 3; ++time) {
+        list.reloadData();
+        for (int row = 0; row < 10; ++row)
+            EXPECT_EQ(list.cellAtRow(row), before[static_cast<std::size_t>(row)]) << row;
+    }
+    EXPECT_EQ(rows.made, 11);
+}
+
+TEST_F(TableListTest, ACellIsReusedUnderItsIdentifierOnlyAndInTheOrderInWhichItLeft)
+{
+    rows.identifierOf = [](int row) { return row % 2 == 0 ? "even" : "odd"; };
+    rows.made = 0;
+    list.reloadData();
+    EXPECT_EQ(rows.made, 10);
+    TableCell* const row0 = list.cellAtRow(0);
+    TableCell* const row1 = list.cellAtRow(1);
+    TableCell* const row2 = list.cellAtRow(2);
+    list.setContentOffset(4 * 44);
+    EXPECT_EQ(list.cellAtRow(10), row0);
+    EXPECT_EQ(list.cellAtRow(11), row1);
+    EXPECT_EQ(list.cellAtRow(12), row2);
+    EXPECT_EQ(rows.made, 10);
+}
+
+TEST_F(TableListTest, ReloadingKeepsThePlaceAsFarAsItExists)
+{
+    list.setContentOffset(1000);
+    list.selectRow(24);
+    list.reloadData();
+    EXPECT_EQ(list.contentOffset(), 1000);
+    EXPECT_TRUE(list.cellAtRow(24)->isHighlighted());
+    rows.count = 20;
+    list.reloadData();
+    EXPECT_EQ(list.contentOffset(), 20 * 44 - 440);
+    EXPECT_EQ(list.selectedRow(), std::nullopt);
+    rows.count = 0;
+    list.reloadData();
+    EXPECT_EQ(list.contentOffset(), 0);
+    EXPECT_EQ(list.cellAtRow(0), nullptr);
+    for (const int key : {Qt::Key_Down, Qt::Key_End, Qt::Key_Return})
+        QTest::keyClick(&list, static_cast<Qt::Key>(key));
+    EXPECT_EQ(list.selectedRow(), std::nullopt);
+}
+
+TEST_F(TableListTest, ATapOpensAndADragDoesNot)
+{
+    QTest::mouseClick(&list, Qt::LeftButton, {}, {50, 100});
+    EXPECT_EQ(rows.opened, std::vector{2});
+    EXPECT_EQ(list.selectedRow(), 2);
+    drag({50, 300}, {0, -200});
+    QTest::mouseClick(&list, Qt::RightButton, {}, {50, 100});
+    EXPECT_EQ(rows.opened, std::vector{2});
+
+    rows.count = 3;
+    list.reloadData();
+    QTest::mouseClick(&list, Qt::LeftButton, {}, {50, 400}); // below the last row
+    EXPECT_EQ(rows.opened, (std::vector{2, -1}));
+    EXPECT_EQ(list.selectedRow(), 2);
+}
+
+TEST_F(TableListTest, APressHighlightsUntilItBecomesADrag)
+{
+    QTest::mousePress(&list, Qt::LeftButton, {}, {50, 100});
+    EXPECT_TRUE(list.cellAtRow(2)->isHighlighted());
+    list.reloadData();
+    EXPECT_TRUE(list.cellAtRow(2)->isHighlighted());
+    QTest::mouseMove(&list, {50, 70}, 10);
+    EXPECT_FALSE(list.cellAtRow(2)->isHighlighted());
+    QTest::mouseRelease(&list, Qt::LeftButton, {}, {50, 70});
+    EXPECT_TRUE(rows.opened.empty());
+}
+
+TEST_F(TableListTest, AGestureKeepsToTheAxisInWhichItBegan)
+{
+    drag({150, 350}, {-30, -200});
+    EXPECT_NEAR(list.contentOffset(), 200, 15); // less the stretch that made it a drag
+    EXPECT_EQ(sidewaysAt(list.contentOffset() / 44 + 7), 0);
+
+    list.setContentOffset(0);
+    drag({250, 100}, {-150, 60});
+    EXPECT_EQ(list.contentOffset(), 0);
+    EXPECT_NEAR(sidewaysAt(2), 150, 15);
+    EXPECT_EQ(sidewaysAt(1), 0);
+    list.reloadData();
+    EXPECT_NEAR(sidewaysAt(2), 150, 15);
+}
+
+TEST_F(TableListTest, AFlingGoesOnAndAPressThatStopsItOpensNothing)
+{
+    QTest::mousePress(&list, Qt::LeftButton, {}, {150, 400});
+    for (int y = 380; y > 100; y -= 40)
+        QTest::mouseMove(&list, {150, y}, 10);
+    QTest::mouseRelease(&list, Qt::LeftButton, {}, {150, 80}, 10);
+    const int atRelease = list.contentOffset();
+    EXPECT_TRUE(QTest::qWaitFor([&] { return list.contentOffset() > atRelease + 50; }, 2000));
+    ASSERT_EQ(QScroller::scroller(&list)->state(), QScroller::Scrolling);
+    QTest::mouseClick(&list, Qt::LeftButton, {}, {150, 200});
+    const int stopped = list.contentOffset();
+    QTest::qWait(60);
+    EXPECT_EQ(list.contentOffset(), stopped);
+    EXPECT_TRUE(rows.opened.empty());
+}
+
+TEST_F(TableListTest, TheWheelScrollsTheListAndSidewaysTheRowBelowIt)
+{
+    wheel({0, -120}, {50, 100});
+    const int notch = list.contentOffset();
+    EXPECT_GT(notch, 0);
+    wheel({0, -240}, {50, 100});
+    EXPECT_EQ(list.contentOffset(), 3 * notch);
+    wheel({0, 12000}, {50, 100});
+    EXPECT_EQ(list.contentOffset(), 0);
+    wheel({-120, 10}, {50, 100});
+    EXPECT_GT(sidewaysAt(2), 0);
+    EXPECT_EQ(sidewaysAt(1), 0);
+    EXPECT_EQ(list.contentOffset(), 0);
+}
+
+TEST_F(TableListTest, KeysMoveTheSelectionThroughTheWholeList)
+{
+    const struct {
+        Qt::Key key;
+        int selected;
+    } cases[] = {
+        {Qt::Key_Down, 0},
+        {Qt::Key_Down, 1},
+        {Qt::Key_PageDown, 10},
+        {Qt::Key_Up, 9},
+        {Qt::Key_End, 99},
+        {Qt::Key_Down, 99},
+        {Qt::Key_PageUp, 90},
+        {Qt::Key_Home, 0},
+        {Qt::Key_Up, 0},
+    };
+    for (const auto& test : cases) {
+        QTest::keyClick(&list, test.key);
+        ASSERT_EQ(list.selectedRow(), test.selected);
+        const TableCell* const cell = list.cellAtRow(test.selected);
+        ASSERT_NE(cell, nullptr);
+        EXPECT_TRUE(list.rect().contains(cell->geometry()));
+        EXPECT_TRUE(cell->isHighlighted());
+    }
+    EXPECT_FALSE(list.cellAtRow(1)->isHighlighted());
+    QTest::keyClick(&list, Qt::Key_Right);
+    EXPECT_EQ(sidewaysAt(0), 40);
+    QTest::keyClick(&list, Qt::Key_Left);
+    EXPECT_EQ(sidewaysAt(0), 0);
+    QTest::keyClick(&list, Qt::Key_Return);
+    EXPECT_EQ(rows.opened, std::vector{0});
+    list.deselectRow();
+    QTest::keyClick(&list, Qt::Key_Down);
+    EXPECT_EQ(list.selectedRow(), 1); // goes on from the row that was deselected
+}
+
+TEST_F(TableListTest, ARowThatTakesOverACellDoesNotTakeOverItsSidewaysPlace)
+{
+    list.cellAtRow(0)->sidewaysScrollView()->setOffset(70);
+    TableCell* const cell = list.cellAtRow(0);
+    list.setContentOffset(44);
+    ASSERT_EQ(list.cellAtRow(10), cell);
+    EXPECT_EQ(sidewaysAt(10), 0);
+}
+
+TEST_F(TableListTest, ResizingGivesAllRowsTheNewWidth)
+{
+    list.setContentOffset(list.maximumOffset());
+    list.resize(500, 660);
+    EXPECT_EQ(list.contentOffset(), 100 * 44 - 660);
+    for (int row = 85; row < 100; ++row)
+        EXPECT_EQ(list.cellAtRow(row)->width(), 500);
+}
+
+} // namespace
+} // namespace orvex::test

@@ -1,0 +1,17 @@
+#include "Animation.h"
+#include "Theme.h"
+
+#include <QApplication>
+
+#include <gtest/gtest.h>
+
+int main(int argc, char** argv)
+{
+    testing::InitGoogleTest(&argc, argv);
+    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    const QApplication application(argc, argv);
+    orvex::Theme::use(orvex::Theme::Mode::light);
+    orvex::setAnimationsEnabled(false);
+    return RUN_ALL_TESTS();
+}
