@@ -125,7 +125,8 @@ OptionsResult optionsFromArguments(const std::vector<std::string>& arguments)
     parser.addOptions({
         {{"h", "help"}, "Shows this help."},
         {{"v", "version"}, "Shows the version."},
-        {"technology", QString::fromStdString("Log technology (default: MRL_LTE): " + knownTechnologies() + "."), "T",
+        {"technology",
+            QString::fromStdString("Log technology (default: MRL_LTE): " + knownTechnologies() + "."), "T",
             "MRL_LTE"},
         {"scenario", "What happens to the handset (default: the technology's first).", "NAME"},
         {"rate", "Streams as many packets per second, instead of the scenario's own pace.",

@@ -1,0 +1,194 @@
+// koratd as a program, with clients inside the test.
+
+#include "KoratClient.h"
+#include "KoratProgram.h"
+
+#include "Array.h"
+
+#include <gmock/gmock.h>
+
+#include <cerrno>
+
+namespace orvex::test {
+namespace {
+
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::Key;
+
+DictionaryRef everything()
+{
+    return Dictionary::make({{"SetState", "Streaming"}});
+}
+
+TEST(KoratProcess, WrongOptionsEndWithTheUsage)
+{
+    const struct {
+        const char* complaint;
+        QStringList arguments;
+    } cases[] = {
+        {"known are: MRL_LTE, MRL_UTRAN2", {"--technology", "MRL_GSM"}},
+        {"MRL_LTE has no scenario \"sea\"; known are: town", {"--scenario", "sea"}},
+        {"--rate", {"--rate", "0"}},
+        {"--rate", {"--rate", "fast"}},
+        {"--count", {"--count", "-1"}},
+        {"--seed", {"--seed", ""}},
+        {"no such fault: garbage=101", {"--fault", "garbage=101"}},
+        {"no such fault: die-after", {"--fault", "die-after"}},
+        {"no such fault: refuse-channel=0", {"--fault", "refuse-channel=0"}},
+        {"no such fault: null-port=1", {"--fault", "null-port=1"}},
+        {"unexpected argument: town", {"town"}},
+        {"bogus", {"--bogus"}},
+    };
+    const ProgramFolder folder;
+    for (const auto& [complaint, arguments] : cases) {
+        Program korat(folder, KORATD_PATH, arguments);
+        EXPECT_EQ(korat.waitForEnd(), 2) << complaint;
+        EXPECT_THAT(korat.errors(), testing::AllOf(HasSubstr(complaint), HasSubstr("Usage:")));
+        EXPECT_EQ(korat.output(), "");
+    }
+}
+
+TEST(KoratProcess, HelpAndVersionGoToStandardOutput)
+{
+    const ProgramFolder folder;
+    for (const auto& [option, text] : {std::pair("--help", "--fault"), std::pair("--version", "koratd ")}) {
+        Program korat(folder, KORATD_PATH, {option});
+        EXPECT_EQ(korat.waitForEnd(), 0);
+        EXPECT_THAT(korat.output(), HasSubstr(text));
+    }
+}
+
+TEST(KoratProcess, StreamsWhatWasAskedForAfterTheStartCommand)
+{
+    const ProgramFolder folder;
+    KoratProgram korat(folder, {"--rate", "2000"});
+    KoratClient client(folder.ports());
+    ASSERT_EQ(client.open(), 0);
+    EXPECT_EQ(client.technology(), Value("MRL_LTE"));
+    turnFor(std::chrono::milliseconds(300));
+    EXPECT_EQ(client.messages.size(), 0U);
+
+    client.send(Dictionary::make({{"SetState", "Streaming"},
+        {"SetMarlinLogCodes", Array::make({0xB17F, 0x4711})}, {"SetKoratExtraCodes", Array::make({1})}}));
+    ASSERT_TRUE(waitUntil([&] { return client.codes().size() >= 2; }));
+    client.send(Dictionary::make({{"SetState", "Streaming"}, {"SetMarlinLogCodes", Array::make({0xB179})},
+        {"SetKoratExtraCodes", Array::make()}}));
+    ASSERT_TRUE(waitUntil([&] { return client.codes().contains(0xB179); }));
+    EXPECT_THAT(client.codes(), ElementsAre(Key(0xB179U), Key(0xB17FU), Key(0xFF0001U)));
+
+    client.send(everything());
+    EXPECT_TRUE(waitUntil([&] { return client.codes().size() == 9; }));
+}
+
+TEST(KoratProcess, KeepsItsPace)
+{
+    const ProgramFolder folder;
+    KoratProgram korat(folder, {"--technology", "MRL_UTRAN2", "--rate", "500", "--count", "1000"});
+    KoratClient client(folder.ports());
+    ASSERT_EQ(client.open(), 0);
+    EXPECT_EQ(client.technology(), Value("MRL_UTRAN2"));
+    QElapsedTimer elapsed;
+    elapsed.start();
+    client.send(everything());
+    ASSERT_TRUE(waitUntil([&] { return client.messages.size() == 1000; }));
+    EXPECT_GE(elapsed.elapsed(), 1900);
+    turnFor(std::chrono::milliseconds(200));
+    EXPECT_EQ(client.messages.size(), 1000U);
+    EXPECT_TRUE(client.isServed());
+    EXPECT_EQ(korat.terminateAndCount(), 1000);
+}
+
+TEST(KoratProcess, ServesOneClientAtATime)
+{
+    const ProgramFolder folder;
+    KoratProgram korat(folder, {"--count", "1"});
+    KoratClient second(folder.ports(), "org.orvex.Test.Second");
+    {
+        KoratClient first(folder.ports());
+        ASSERT_EQ(first.open(), 0);
+        EXPECT_EQ(second.open(), EBUSY);
+        first.send(everything());
+        ASSERT_TRUE(waitUntil([&] { return !first.messages.empty(); }));
+    }
+    // At once: the request is on its way before koratd can have seen that the first one has gone.
+    ASSERT_EQ(second.open(), 0);
+    EXPECT_EQ(second.technology(), Value("MRL_LTE"));
+    EXPECT_TRUE(korat.waitForError("org.orvex.Test.Client has left; sent 1 messages"));
+}
+
+TEST(KoratProcess, RequestsThatMakeNoSenseAreRefused)
+{
+    const ProgramFolder folder;
+    const KoratProgram korat(folder);
+    SocketMessagePorts ports(folder.ports());
+    const auto service = ports.createRemotePort(telephony::kServicePortName);
+    ASSERT_TRUE(service);
+    const struct {
+        const char* name;
+        Value request;
+        int error;
+    } cases[] = {
+        {"no dictionary", Array::make({"Request"}), EINVAL},
+        {"another request", Dictionary::make({{"Request", "Dial"}, {"PortName", "a"}}), EINVAL},
+        {"no port name", Dictionary::make({{"Request", telephony::kCreateLogChannelRequest}}), EINVAL},
+        {"a port that is not there",
+            Dictionary::make(
+                {{"Request", telephony::kCreateLogChannelRequest}, {"PortName", "org.orvex.Test.Nobody"}}),
+            ENOENT},
+    };
+    for (const auto& [name, request, error] : cases) {
+        const auto result = service->request(telephony::kCreateLogChannelMessageId, *propertyListXML(request),
+            std::chrono::seconds(1), std::chrono::seconds(5));
+        ASSERT_TRUE(result.reply) << name;
+        EXPECT_EQ((*propertyListFromData(*result.reply).value->dictionary())["ErrorCode"], Value(error))
+            << name;
+    }
+}
+
+TEST(KoratProcess, SlowClientHoldsUpNobodyAndLosesNothing)
+{
+    const ProgramFolder folder;
+    KoratProgram korat(folder, {"--rate", "20000"});
+    KoratClient client(folder.ports());
+    ASSERT_EQ(client.open(), 0);
+    client.send(everything());
+    ASSERT_TRUE(waitUntil([&] { return client.messages.size() > 100; }));
+
+    // The test's event loop stands still for longer than the backlog takes to fill.
+    std::this_thread::sleep_for(std::chrono::milliseconds(2500));
+    EXPECT_EQ(KoratClient(folder.ports(), "org.orvex.Test.Second").open(), EBUSY);
+
+    const std::size_t before = client.messages.size();
+    EXPECT_TRUE(waitUntil([&] { return client.messages.size() > before + 20'000; }));
+    const Bytes& last = client.messages.back();
+    EXPECT_EQ(last.size(), last[1] + last[2] * 256U + 1U);
+}
+
+TEST(KoratProcess, DiesWhenAsked)
+{
+    const ProgramFolder folder;
+    KoratProgram korat(folder, {"--fault", "die-after=0.3"});
+    turnFor(std::chrono::milliseconds(500));
+    EXPECT_TRUE(korat.isRunning()); // the time counts from the first channel on
+    KoratClient client(folder.ports());
+    ASSERT_EQ(client.open(), 0);
+    EXPECT_EQ(korat.waitForEnd(), 1);
+    EXPECT_THAT(korat.errors(), HasSubstr("dying"));
+    EXPECT_TRUE(waitUntil([&] { return !client.isServed(); }));
+}
+
+TEST(KoratProcess, ASecondServiceFindsThePlaceTaken)
+{
+    const ProgramFolder folder;
+    KoratProgram first(folder);
+    Program second(folder, KORATD_PATH, {});
+    EXPECT_EQ(second.waitForEnd(), 1);
+    EXPECT_THAT(second.errors(), HasSubstr("another service is running already"));
+    EXPECT_EQ(first.terminateAndCount(), 0);
+    KoratProgram third(folder); // nothing was left behind
+    EXPECT_EQ(third.terminateAndCount(), 0);
+}
+
+} // namespace
+} // namespace orvex::test

@@ -1,0 +1,109 @@
+#pragma once
+
+#include "EventLoop.h"
+
+#include <QProcess>
+#include <QRegularExpression>
+#include <QTemporaryDir>
+
+#include <chrono>
+#include <string>
+#include <vector>
+
+namespace orvex::test {
+
+// A folder in which programs find each other and keep what they keep, apart from the user's.
+class ProgramFolder {
+public:
+    std::string ports() const { return path("ports"); }
+    std::string path(const char* name) const { return _folder.filePath(name).toStdString(); }
+
+    QProcessEnvironment environment() const
+    {
+        auto result = QProcessEnvironment::systemEnvironment();
+        result.insert("ORVEX_PORT_DIR", QString::fromStdString(ports()));
+        result.insert("ORVEX_LOG", "stderr");
+        result.insert("XDG_CONFIG_HOME", _folder.filePath("config"));
+        result.insert("XDG_STATE_HOME", _folder.filePath("state"));
+        result.remove("DBUS_SESSION_BUS_ADDRESS");
+        return result;
+    }
+
+private:
+    QTemporaryDir _folder;
+};
+
+// A real program that runs beside the test, and all that it has written so far.
+class Program {
+public:
+    Program(const ProgramFolder& folder, const char* path, const QStringList& arguments)
+    {
+        QObject::connect(&_process, &QProcess::readyReadStandardOutput, &_process,
+            [this] { _output += _process.readAllStandardOutput(); });
+        QObject::connect(&_process, &QProcess::readyReadStandardError, &_process,
+            [this] { _errors += _process.readAllStandardError(); });
+        _process.setProcessEnvironment(folder.environment());
+        _process.start(QString::fromLocal8Bit(path), arguments);
+        _process.waitForStarted();
+    }
+    ~Program() { kill(); }
+    Program(const Program&) = delete;
+    Program& operator=(const Program&) = delete;
+
+    std::string output() const { return _output.toStdString(); }
+    // Standard error: log lines, for the monitor.
+    std::string errors() const { return _errors.toStdString(); }
+    bool isRunning() const { return _process.state() == QProcess::Running; }
+
+    // Wait until the text was written so many times.
+    bool waitForOutput(const char* text, int times = 1, std::chrono::milliseconds longest = kLongest)
+    {
+        return waitUntil([&] { return _output.count(text) >= times; }, longest);
+    }
+    bool waitForError(const char* text, int times = 1, std::chrono::milliseconds longest = kLongest)
+    {
+        return waitUntil([&] { return _errors.count(text) >= times; }, longest);
+    }
+    // The different values that a row of the tree has shown, in the order of their coming.
+    std::vector<std::string> valuesOf(const char* row) const
+    {
+        const QRegularExpression line(QString("^ *%1: (.*)$").arg(QRegularExpression::escape(row)),
+            QRegularExpression::MultilineOption);
+        std::vector<std::string> values;
+        for (const auto& match : line.globalMatch(QString::fromUtf8(_output))) {
+            const std::string value = match.captured(1).toStdString();
+            if (std::find(values.begin(), values.end(), value) == values.end())
+                values.push_back(value);
+        }
+        return values;
+    }
+
+    void kill()
+    {
+        _process.kill();
+        _process.waitForFinished();
+    }
+    // Asks it to end. Its exit status; -1 when it did not end, or crashed.
+    int terminate()
+    {
+        _process.terminate();
+        return waitForEnd();
+    }
+    int waitForEnd()
+    {
+        if (!waitUntil([this] { return _process.state() == QProcess::NotRunning; }, kLongest))
+            return -1;
+        _output += _process.readAllStandardOutput();
+        _errors += _process.readAllStandardError();
+        return _process.exitStatus() == QProcess::NormalExit ? _process.exitCode() : -1;
+    }
+
+private:
+    static constexpr std::chrono::milliseconds kLongest{30'000};
+
+    QProcess _process;
+    QByteArray _output;
+    QByteArray _errors;
+};
+
+} // namespace orvex::test

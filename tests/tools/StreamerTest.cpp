@@ -1,0 +1,122 @@
+#include "service/Streamer.h"
+
+#include "scenarios/ScenarioTable.h"
+
+#include "FakeTelephony.h"
+#include "ManualRunLoop.h"
+
+#include "Array.h"
+
+#include <gtest/gtest.h>
+
+#include <thread>
+
+namespace orvex::korat {
+namespace {
+
+using namespace std::chrono_literals;
+
+// A client that takes what it is sent only when the test says so.
+struct SlowClient final : test::FakePort<RemotePort> {
+    Status send(std::int32_t, ByteView data, std::chrono::milliseconds) override
+    {
+        if (refusals > 0) {
+            --refusals;
+            return Status::sendTimeout;
+        }
+        pending += data.size();
+        received.emplace_back(data.begin(), data.end());
+        return Status::success;
+    }
+    SendResult request(std::int32_t, ByteView, std::chrono::milliseconds, std::chrono::milliseconds) override
+    {
+        return {};
+    }
+    std::size_t pendingBytes() const override { return pending; }
+
+    std::size_t pending = 0;
+    int refusals = 0;
+    std::vector<Bytes> received;
+};
+
+class StreamerTest : public testing::Test {
+protected:
+    void stream(const DictionaryRef& command, const Streamer::Pace& pace)
+    {
+        streamer = std::make_unique<Streamer>(runLoop, client, findScenario("MRL_LTE", "")->make({}),
+            Subscription(*command), GarbageSource(0, 1), pace);
+    }
+    // Lets the run loop tick while real time goes on.
+    void tick(int times)
+    {
+        for (int i = 0; i < times; ++i) {
+            std::this_thread::sleep_for(2ms);
+            runLoop.advance(10ms);
+        }
+    }
+    template <typename Condition>
+    bool tickUntil(Condition condition)
+    {
+        for (int i = 0; i < 2000 && !condition(); ++i)
+            tick(1);
+        return condition();
+    }
+
+    DictionaryRef everything = Dictionary::make();
+    test::ManualRunLoop runLoop;
+    std::shared_ptr<SlowClient> client = std::make_shared<SlowClient>();
+    std::unique_ptr<Streamer> streamer;
+};
+
+TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
+{
+    constexpr std::size_t kBacklog = std::size_t{4} << 20;
+    constexpr std::size_t kLargestMessage = 1 << 16;
+    client->refusals = 3;
+    stream(everything, {1e6, std::nullopt});
+    ASSERT_TRUE(tickUntil([&] { return client->pending > kBacklog; }));
+    const std::size_t sent = client->received.size();
+    tick(5);
+    EXPECT_EQ(client->received.size(), sent);
+    EXPECT_LE(client->pending, kBacklog + kLargestMessage);
+
+    client->pending = 0;
+    ASSERT_TRUE(tickUntil([&] { return client->received.size() > sent + 100; }));
+    EXPECT_EQ(streamer->sent(), client->received.size());
+    const auto scenario = findScenario("MRL_LTE", "")->make({});
+    for (const Bytes& message : client->received)
+        ASSERT_EQ(message, scenario->next().message.bytes);
+}
+
+TEST_F(StreamerTest, NaturalPaceIsThatOfTheScenario)
+{
+    stream(everything, {});
+    const auto start = std::chrono::steady_clock::now();
+    ASSERT_TRUE(tickUntil([&] { return std::chrono::steady_clock::now() - start > 1500ms; }));
+    const auto scenario = findScenario("MRL_LTE", "")->make({});
+    std::size_t due = 0;
+    while (scenario->next().due <= 1500ms)
+        ++due;
+    EXPECT_NEAR(static_cast<double>(client->received.size()), static_cast<double>(due), 6);
+}
+
+TEST_F(StreamerTest, OnlyMessagesThatTheClientWantsCount)
+{
+    const auto command = Dictionary::make({{"SetMarlinLogCodes", Array::make({0xB0C1})}});
+    stream(command, {2000, 30});
+    ASSERT_TRUE(tickUntil([&] { return client->received.size() >= 30; }));
+    tick(20);
+    EXPECT_EQ(client->received.size(), 30U);
+    for (const Bytes& message : client->received)
+        EXPECT_EQ(message.at(3), 0xC1);
+    EXPECT_EQ(runLoop.timerCount(), 0U); // it rests
+}
+
+TEST_F(StreamerTest, RestsWhenNothingWantedCanCome)
+{
+    stream(Dictionary::make({{"SetMarlinLogCodes", Array::make({0x1234})}}), {2000, std::nullopt});
+    EXPECT_EQ(runLoop.timerCount(), 0U);
+}
+
+} // namespace
+} // namespace orvex::korat
