@@ -14,7 +14,6 @@ using test::viewOf;
 using test::waitUntil;
 using testing::ElementsAre;
 using testing::HasSubstr;
-using testing::IsEmpty;
 
 class HostilePeerTest : public test::PortTest { };
 

@@ -37,23 +37,23 @@ public:
     RawPeer(const RawPeer&) = delete;
     RawPeer& operator=(const RawPeer&) = delete;
 
-    bool connectTo(const std::string& path)
+    bool connectTo(const std::string& path) const
     {
         const auto address = socketAddress(path);
         return ::connect(_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0;
     }
 
     // Listens without ever serving anybody by itself.
-    bool listenAt(const std::string& path)
+    bool listenAt(const std::string& path) const
     {
         const auto address = socketAddress(path);
         return ::bind(_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0
             && ::listen(_socket, 10) == 0;
     }
-    int acceptOne() { return ::accept4(_socket, nullptr, nullptr, SOCK_CLOEXEC); }
+    int acceptOne() const { return ::accept4(_socket, nullptr, nullptr, SOCK_CLOEXEC); }
 
     // Turns the event loop, and so the port at the other end, while the socket is full.
-    bool write(ByteView bytes)
+    bool write(ByteView bytes) const
     {
         while (!bytes.empty()) {
             const auto count = ::send(_socket, bytes.data(), bytes.size(), MSG_NOSIGNAL | MSG_DONTWAIT);
@@ -67,10 +67,10 @@ public:
         }
         return true;
     }
-    bool write(const Frame& frame) { return write(encodedFrame(frame)); }
+    bool write(const Frame& frame) const { return write(encodedFrame(frame)); }
 
     // What is there to be read at this moment.
-    Bytes read()
+    Bytes read() const
     {
         Bytes bytes(1 << 20);
         const auto count = ::recv(_socket, bytes.data(), bytes.size(), MSG_DONTWAIT);
@@ -79,7 +79,7 @@ public:
     }
 
     // True once the other side has closed and all that it wrote is read.
-    bool isClosedByOther()
+    bool isClosedByOther() const
     {
         std::uint8_t byte = 0;
         const auto count = ::recv(_socket, &byte, 1, MSG_DONTWAIT | MSG_PEEK);

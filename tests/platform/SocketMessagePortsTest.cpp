@@ -13,8 +13,6 @@ using test::textOf;
 using test::turnFor;
 using test::viewOf;
 using test::waitUntil;
-using testing::ElementsAre;
-using testing::HasSubstr;
 using testing::IsEmpty;
 using Status = RemotePort::Status;
 
@@ -150,6 +148,7 @@ TEST_F(SocketMessagePortsTest, StaleSocketIsTakenOverByOneStarter)
                 std::this_thread::yield();
         };
         std::vector<std::thread> starters;
+        starters.reserve(4);
         for (int i = 0; i < 4; ++i)
             starters.emplace_back(start);
         for (std::thread& starter : starters)

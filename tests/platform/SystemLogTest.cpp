@@ -13,7 +13,6 @@
 #include <future>
 #include <stdexcept>
 
-#include <syslog.h>
 #include <unistd.h>
 
 namespace {
@@ -21,6 +20,8 @@ std::vector<std::string> theSyslog;
 }
 
 // In the place of the C library's, to see what reaches it.
+extern "C" void syslog(int priority, const char* format, ...);
+
 void syslog(int priority, const char* format, ...)
 {
     std::string line;
