@@ -25,6 +25,7 @@
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
+#include <unistd.h>
 
 namespace {
 
@@ -84,9 +85,11 @@ void endWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString&
 int runConsole(int argc, char** argv, const std::string& resourceDirectory)
 {
     const QCoreApplication application(argc, argv);
-    // Standard output is the tree's.
-    installConsole([](std::string_view line) {
-        std::fprintf(stderr, "%.*s\n", static_cast<int>(line.size()), line.data());
+    // Standard output is the tree's. A terminal that is redrawn in place has no room for other lines at all.
+    const bool wouldDisturb = ::isatty(STDOUT_FILENO) && ::isatty(STDERR_FILENO);
+    installConsole([wouldDisturb](std::string_view line) {
+        if (!wouldDisturb)
+            std::fprintf(stderr, "%.*s\n", static_cast<int>(line.size()), line.data());
     });
     LinuxPlatform platform(resourceDirectory);
     StandardOutput output([] { QCoreApplication::quit(); });

@@ -13,7 +13,7 @@ namespace orvex {
 namespace {
 constexpr int kSideMargin = 4;
 constexpr int kTitleMargin = 10;
-constexpr double kBackButtonShare = 0.4; // of the width at most
+constexpr double kBackButtonShare = 0.4; // of the width, which it may have even if the title must give way
 } // namespace
 
 NavigationBar::NavigationBar(QWidget* parent)
@@ -40,7 +40,9 @@ void NavigationBar::layoutTitle()
 {
     int left = kTitleMargin;
     if (!_backButton->isHidden()) {
-        const int widest = static_cast<int>(width() * kBackButtonShare);
+        const int besideTitle =
+            (width() - sizeOfLine(_title, _titleLabel->font()).width()) / 2 - kTitleMargin - kSideMargin;
+        const int widest = std::max(besideTitle, static_cast<int>(width() * kBackButtonShare));
         const QSize size = _backButton->sizeHint();
         _backButton->setGeometry(
             kSideMargin, (height() - size.height()) / 2, std::min(size.width(), widest), size.height());

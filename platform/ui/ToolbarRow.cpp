@@ -11,14 +11,15 @@ namespace orvex {
 
 namespace {
 constexpr int kDissolveMilliseconds = 180;
-constexpr int kSideMargin = 12;
+constexpr int kLeftMargin = 10; // in line with the rows
+constexpr int kRightMargin = 4; // a button brings its own padding
 constexpr int kSpacing = 8;
 } // namespace
 
 ToolbarRow::ToolbarRow(std::vector<ToolbarItem> items)
 {
     auto* layout = new QHBoxLayout(this);
-    layout->setContentsMargins(kSideMargin, 0, kSideMargin, 0);
+    layout->setContentsMargins(kLeftMargin, 0, kRightMargin, 0);
     layout->setSpacing(kSpacing);
     for (ToolbarItem& item : items) {
         QWidget* widget = item.takeWidget().release(); // the layout makes it a child
