@@ -20,7 +20,7 @@ std::vector<std::string> theSyslog;
 }
 
 // In the place of the C library's, to see what reaches it.
-extern "C" void syslog(int priority, const char* format, ...);
+extern "C" [[gnu::format(printf, 2, 3)]] void syslog(int priority, const char* format, ...);
 
 void syslog(int priority, const char* format, ...)
 {
