@@ -53,7 +53,7 @@ TEST_F(SystemFilesTest, ResourcesAreReadFromTheirDirectoryEachTime)
     write("a.plist", test::xmlList("<dict/>"));
     write("c.txt", "");
     const FileResources resources(_directory.path().toStdString());
-    EXPECT_THAT(resources.propertyListPaths(), ElementsAre(path("a.plist"), path("b.plist")));
+    EXPECT_THAT(resources.propertyListPaths(), ElementsAre("a.plist", "b.plist"));
     EXPECT_TRUE(*resources.dictionaryNamed("b") == Dictionary({{"k", 1}}));
     write("b.plist", test::xmlList("<dict><key>k</key><integer>2</integer></dict>"));
     EXPECT_TRUE(*resources.dictionaryNamed("b") == Dictionary({{"k", 2}}));
