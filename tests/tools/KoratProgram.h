@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include <QFileInfo>
+#include <QRegularExpression>
 
 namespace orvex::test {
 

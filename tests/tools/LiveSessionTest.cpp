@@ -5,10 +5,15 @@
 
 #include <gmock/gmock.h>
 
+#include <QRegularExpression>
+
+#include <set>
+
 namespace orvex::test {
 namespace {
 
 using namespace std::chrono_literals;
+using testing::Contains;
 using testing::HasSubstr;
 using testing::Not;
 
@@ -21,24 +26,43 @@ public:
     }
 };
 
-TEST(LiveSession, ShowsChangingValues)
+// What a row of a section has shown, each value once.
+std::set<std::string> shown(const Program& monitor, const char* section, const char* row)
 {
-    const struct {
-        const char* technology;
-        const char* row;
-    } cases[] = {{"MRL_LTE", "Measured RSRP"}, {"MRL_UTRAN2", "Filter RSCP"}};
-    for (const auto& [technology, row] : cases) {
-        const ProgramFolder folder;
-        const KoratProgram korat(folder, {"--technology", technology});
-        ConsoleProgram monitor(folder);
-        EXPECT_TRUE(waitUntil([&, row = row] { return monitor.valuesOf(row).size() >= 3; }, 20s))
-            << technology;
-        EXPECT_THAT(monitor.output(), HasSubstr("Updated 2"));
-        EXPECT_THAT(monitor.valuesOf("EF-MSISDN"), testing::Contains("+0010155550142"));
-        EXPECT_THAT(monitor.valuesOf("APN"), testing::Contains("internet.example"));
-        EXPECT_THAT(monitor.output(), Not(HasSubstr("(unknown)")));
-        EXPECT_EQ(monitor.terminate(), 0);
-    }
+    const auto values = monitor.valuesOf(section, row);
+    return {values.begin(), values.end()};
+}
+
+struct LiveCase {
+    const char* technology;
+    const char* section;
+    const char* row;
+};
+
+void PrintTo(const LiveCase& each, std::ostream* stream)
+{
+    *stream << each.row;
+}
+
+class Live : public testing::TestWithParam<LiveCase> { };
+
+INSTANTIATE_TEST_SUITE_P(LiveSession, Live,
+    testing::Values(LiveCase{"MRL_LTE", "Serving Cell Measurements", "Measured RSRP"},
+        LiveCase{"MRL_UTRAN2", "Neighbor Cell List", "Filter RSCP"}),
+    [](const auto& each) { return std::string(each.param.technology); });
+
+TEST_P(Live, ValuesChange)
+{
+    const auto& [technology, section, row] = GetParam();
+    const ProgramFolder folder;
+    const KoratProgram korat(folder, {"--technology", technology});
+    ConsoleProgram monitor(folder);
+    EXPECT_TRUE(waitUntil([&, s = section, r = row] { return shown(monitor, s, r).size() >= 3; }, 20s));
+    EXPECT_THAT(monitor.output(), HasSubstr("Updated 2"));
+    EXPECT_THAT(monitor.valuesOf("SIM Info", "EF-MSISDN"), Contains("+0010155550142"));
+    EXPECT_THAT(monitor.valuesOf("PDP Context Info", "APN"), Contains("internet.example"));
+    EXPECT_THAT(monitor.output(), Not(HasSubstr("(unknown)")));
+    EXPECT_EQ(monitor.terminate(), 0);
 }
 
 TEST(LiveSession, AbsentServiceIsTriedAgainAfterFiveSeconds)
@@ -75,23 +99,35 @@ TEST(LiveSession, ComesBackAfterTheServiceWasKilled)
     EXPECT_LE(elapsed.elapsed(), 1000); // at once
     EXPECT_TRUE(monitor.waitForOutput("Connecting...", 2));
 
+    const auto before = shown(monitor, "Serving Cell Measurements", "Measured RSRP").size();
     korat = std::make_unique<KoratProgram>(folder, QStringList{"--seed", "99"});
-    const auto before = monitor.valuesOf("Measured RSRP").size();
-    EXPECT_TRUE(waitUntil([&] { return monitor.valuesOf("Measured RSRP").size() > before + 1; }, 20s));
+    EXPECT_TRUE(waitUntil(
+        [&] { return shown(monitor, "Serving Cell Measurements", "Measured RSRP").size() >= before + 2; },
+        20s));
     EXPECT_THAT(monitor.errors(), Not(HasSubstr("already exists")));
 }
 
-class Fault : public testing::TestWithParam<std::pair<const char*, const char*>> { };
+struct FaultCase {
+    const char* fault;
+    const char* line;
+};
+
+void PrintTo(const FaultCase& each, std::ostream* stream)
+{
+    *stream << each.fault;
+}
+
+class Fault : public testing::TestWithParam<FaultCase> { };
 
 INSTANTIATE_TEST_SUITE_P(LiveSession, Fault,
-    testing::Values(std::pair("refuse-channel=35",
-                        "_KoratServerConnectionNetworkMonitorCreateLogChannel returns error: 35!"),
-        std::pair("null-port", "Could not create a log channel (Korat returned null port)!"),
-        std::pair("no-reply", " ***** No response to GetTechnology; cannot configure"),
-        std::pair("bad-reply", " ***** Could not parse reply to GetTechnology; cannot configure"),
-        std::pair("unknown-technology", "No log generator technology works")),
+    testing::Values(FaultCase{"refuse-channel=35",
+                        "_KoratServerConnectionNetworkMonitorCreateLogChannel returns error: 35!"},
+        FaultCase{"null-port", "Could not create a log channel (Korat returned null port)!"},
+        FaultCase{"no-reply", " ***** No response to GetTechnology; cannot configure"},
+        FaultCase{"bad-reply", " ***** Could not parse reply to GetTechnology; cannot configure"},
+        FaultCase{"unknown-technology", "No log generator technology works"}),
     [](const auto& each) {
-        QString name = each.param.first;
+        QString name = each.param.fault;
         return name.replace(QRegularExpression("[^a-z]"), "").toStdString();
     });
 

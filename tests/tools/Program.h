@@ -3,7 +3,6 @@
 #include "EventLoop.h"
 
 #include <QProcess>
-#include <QRegularExpression>
 #include <QTemporaryDir>
 
 #include <chrono>
@@ -64,16 +63,20 @@ public:
     {
         return waitUntil([&] { return _errors.count(text) >= times; }, longest);
     }
-    // The different values that a row of the tree has shown, in the order of their coming.
-    std::vector<std::string> valuesOf(const char* row) const
+    // The first such row of a section, tree after tree.
+    std::vector<std::string> valuesOf(const char* section, const char* row) const
     {
-        const QRegularExpression line(QString("^ *%1: (.*)$").arg(QRegularExpression::escape(row)),
-            QRegularExpression::MultilineOption);
         std::vector<std::string> values;
-        for (const auto& match : line.globalMatch(QString::fromUtf8(_output))) {
-            const std::string value = match.captured(1).toStdString();
-            if (std::find(values.begin(), values.end(), value) == values.end())
-                values.push_back(value);
+        const QString start = QString("%1: ").arg(row);
+        bool isInside = false;
+        for (const QString& line : QString::fromUtf8(_output).split('\n')) {
+            const QString text = line.trimmed();
+            if (isInside && text.startsWith(start)) {
+                values.push_back(text.mid(start.size()).toStdString());
+                isInside = false;
+            } else if (text == section) {
+                isInside = true;
+            }
         }
         return values;
     }

@@ -20,6 +20,12 @@
 #include <set>
 
 namespace orvex::korat {
+
+void PrintTo(const ScenarioEntry& entry, std::ostream* stream)
+{
+    *stream << entry.technology << ' ' << entry.name;
+}
+
 namespace {
 
 using namespace std::chrono_literals;

@@ -12,7 +12,8 @@ constexpr double kWeakestRSRP = -140; // dBm
 constexpr double kStrongestRSRP = -44;
 constexpr double kWeakestRSRQ = -20; // dB
 constexpr double kStrongestRSRQ = -3;
-constexpr double kNoise = -125;   // dBm in 15 kHz, receiver included
+constexpr double kNoise = -125; // dBm in 15 kHz, receiver included
+constexpr double kAverageStep = 0.1;
 constexpr double kCellLoad = 0.5; // share of a cell's resource elements in use
 
 const RadioField::Underpass kUnderpass{2650, 2900};
@@ -72,7 +73,7 @@ struct LTETown::Plan {
             RadioField::Transmitter transmitter;
             transmitter.position = kMarketPlace - 160 + 8 * i;
             transmitter.offset = 60;
-            transmitter.levelAt20m = -70;
+            transmitter.levelAt20m = -75;
             transmitter.slope = 45;
             add(enodeB + i / 10, i % 10 + 1, carrier, transmitter);
         }
@@ -85,20 +86,21 @@ LTETown::LTETown()
         const LTECarrier& town = carriers()[1];
         const LTECarrier& fast = carriers()[2];
         Plan plan;
-        plan.addSite(40321, 100, wide, -50);
-        plan.addSite(40322, 600, wide, -50);
-        plan.addSite(40322, 600, town, -55);
-        plan.addSite(40323, 1150, town, -55);
-        plan.addSite(40324, 1650, town, -55);
-        plan.addSite(40325, 2250, town, -55);
-        plan.addSite(40326, 3150, town, -57);
-        plan.addSite(40326, 3150, fast, -54);
-        plan.addSite(40327, 3600, fast, -56);
-        plan.addSite(40327, 3600, wide, -52);
-        plan.addSite(40328, 4150, wide, -50);
+        plan.addSite(40321, 100, wide, -58);
+        plan.addSite(40322, 600, wide, -58);
+        plan.addSite(40322, 600, town, -63);
+        plan.addSite(40323, 1150, town, -63);
+        plan.addSite(40324, 1650, town, -63);
+        plan.addSite(40325, 2250, town, -63);
+        plan.addSite(40326, 3150, town, -64);
+        plan.addSite(40326, 3150, fast, -61);
+        plan.addSite(40327, 3600, fast, -62);
+        plan.addSite(40327, 3600, wide, -59);
+        plan.addSite(40328, 4150, wide, -58);
         plan.addSmallCells(40410, town);
         RadioField::Transmitter underground;
         underground.position = (kUnderpass.from + kUnderpass.to) / 2;
+        underground.levelAt20m = -63;
         underground.isUnderground = true;
         plan.add(40330, 1, town, underground);
         return plan;
@@ -127,13 +129,19 @@ void LTETown::listen()
         const auto carrier = static_cast<std::size_t>(_cells[i].carrier - carriers().data());
         _received[carrier] += kCellLoad * milliwatts(_field.level(i));
     }
+    for (std::size_t i = 0; i < _cells.size(); ++i) {
+        if (_averageRSRQ.size() == i)
+            _averageRSRQ.push_back(rsrq(i));
+        _averageRSRQ[i] += (rsrq(i) - _averageRSRQ[i]) * kAverageStep;
+    }
 }
 
-double LTETown::rsrq(const LTECell& cell, double rsrp) const
+double LTETown::rsrq(std::size_t cell) const
 {
     // RSRQ = N RSRP / RSSI, and the RSSI sums the 12 resource elements of each of the N resource blocks.
-    const auto carrier = static_cast<std::size_t>(cell.carrier - carriers().data());
-    return std::clamp(rsrp - decibels(12 * _received[carrier]), kWeakestRSRQ, kStrongestRSRQ);
+    const auto carrier = static_cast<std::size_t>(_cells[cell].carrier - carriers().data());
+    const double rsrq = _field.level(cell) - decibels(12 * _received[carrier]);
+    return std::clamp(rsrq, kWeakestRSRQ, kStrongestRSRQ);
 }
 
 LTETown::Heard LTETown::heard(std::size_t cell) const
@@ -142,8 +150,8 @@ LTETown::Heard LTETown::heard(std::size_t cell) const
     result.cell = &_cells[cell];
     result.rsrp = _field.level(cell);
     result.averageRSRP = _field.average(cell);
-    result.rsrq = rsrq(_cells[cell], result.rsrp);
-    result.averageRSRQ = rsrq(_cells[cell], result.averageRSRP);
+    result.rsrq = rsrq(cell);
+    result.averageRSRQ = _averageRSRQ[cell];
     result.rssi = result.rsrp + decibels(result.cell->carrier->resourceBlocks) - result.rsrq;
     return result;
 }

@@ -60,13 +60,14 @@ private:
     explicit LTETown(Plan plan);
 
     Heard heard(std::size_t cell) const;
-    double rsrq(const LTECell& cell, double rsrp) const;
+    double rsrq(std::size_t cell) const;
     void listen();
 
     std::vector<LTECell> _cells;
     RadioField _field; // a transmitter for each cell
     CellSelector _selector;
-    std::vector<double> _received; // by carrier: power of all its cells together, mW in a resource element
+    std::vector<double> _received;    // by carrier: power of all its cells together, mW in a resource element
+    std::vector<double> _averageRSRQ; // by cell, dB
 };
 
 } // namespace orvex::korat
