@@ -65,7 +65,7 @@ std::int16_t Base::lookUpECNO(std::uint32_t ratio)
         std::uint32_t lowest;
         std::int16_t decibel;
     };
-    // About 1 dB apart at the top, drifting further down: the bounds are measured ones, not computed.
+    // About 1 dB apart at the top, drifting further down: no formula yields these bounds.
     static constexpr Band kBands[] = {{524288, 0}, {417648, -1}, {331809, -2}, {263625, -3}, {209464, -4},
         {166442, -5}, {132269, -6}, {105124, -7}, {83563, -8}, {66436, -9}, {52831, -10}, {42024, -11},
         {33441, -12}, {26622, -13}, {21206, -14}, {16904, -15}, {13487, -16}, {10772, -17}, {8616, -18},

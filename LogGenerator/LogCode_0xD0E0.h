@@ -19,7 +19,11 @@ public:
     {
     }
 
-    int state() const { return _packet.u8(13) == 1 ? _packet.u8(14) : kInvalidState; }
+    // kInvalidState unless the packet holds a state and says that it is valid.
+    int state() const
+    {
+        return _packet.u8(13) == 1 && _packet.contains(14, 1) ? _packet.u8(14) : kInvalidState;
+    }
 
 private:
     PacketReader _packet;

@@ -5,6 +5,7 @@
 #include "TelephonyConstants.h"
 #include "TextFormat.h"
 
+#include <algorithm>
 #include <charconv>
 
 namespace orvex {
@@ -79,18 +80,17 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
     const DictionaryRef display = state["Display"].dictionary();
     if (display && display == _boundDisplay.lock())
         return display;
-    const Value& templateName = state["TemplateName"];
-    if (display && (templateName.isNull() || templateName == Value(_pListName))) {
+
+    DictionaryRef skeleton = templateInState(state);
+    if (display && skeleton) {
         // The session went on with a new generator, after the service came back say: the display stays, and
         // the new sections take over where the old ones stopped writing.
-        bindToDisplay(state["Template"], display);
+        bindToDisplay(skeleton, display);
         _boundDisplay = display;
         return display;
     }
-    if (display)
-        state.remove("Template"); // another technology's
-
-    const DictionaryRef skeleton = templateFromState(state);
+    if (!skeleton)
+        skeleton = loadTemplate(state);
     if (!skeleton)
         return {};
     systemLog(Priority::warning, "Initialized class index: %p, Self: %p",
@@ -105,10 +105,15 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
     return {}; // deliberately: only the next call gets it
 }
 
-DictionaryRef MRLLogGenerator2::templateFromState(Dictionary& state) const
+DictionaryRef MRLLogGenerator2::templateInState(const Dictionary& state) const
 {
-    if (auto skeleton = state["Template"].dictionary())
-        return skeleton;
+    const Value& name = state["TemplateName"];
+    const bool isOwn = name.isNull() || name == Value(_pListName);
+    return isOwn ? state["Template"].dictionary() : nullptr;
+}
+
+DictionaryRef MRLLogGenerator2::loadTemplate(Dictionary& state) const
+{
     auto skeleton = _pListName.empty() ? nullptr : environment().resources.dictionaryNamed(_pListName);
     if (!skeleton) {
         systemLog(Priority::error, "Cannot load template for display");
@@ -146,6 +151,13 @@ Value MRLLogGenerator2::processTemplate(const Value& object)
 
 void MRLLogGenerator2::bindToDisplay(const Value& templateObject, const Value& display)
 {
+    const auto elements = templateObject.array();
+    const auto shownElements = display.array();
+    if (elements && shownElements) {
+        for (std::size_t i = 0; i < std::min(elements->size(), shownElements->size()); ++i)
+            bindToDisplay((*elements)[i], (*shownElements)[i]);
+        return;
+    }
     const auto skeleton = templateObject.dictionary();
     const auto shown = display.dictionary();
     if (!skeleton || !shown)

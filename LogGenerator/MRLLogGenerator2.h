@@ -42,7 +42,9 @@ public:
     // dictionary throws InvalidTemplateException.
     Value processTemplate(const Value& object);
 
-    // The state's display. The call that has to build it first returns null; the next one returns it.
+    // The state's display. The call that has to build it first returns null; the next one returns it. A
+    // display that a predecessor built from the same template is taken over, one of another technology is
+    // replaced.
     Value getDisplayFromState(Dictionary& state);
 
 protected:
@@ -56,8 +58,10 @@ private:
     void printDict(const Value& object) const;
     void bindToDisplay(const Value& templateObject, const Value& display);
     void bindSection(std::string_view name, const Value& container);
-    // Null, with a log line, when there is no template.
-    DictionaryRef templateFromState(Dictionary& state) const;
+    // The state's template; null when it has none, or another technology's.
+    DictionaryRef templateInState(const Dictionary& state) const;
+    // The template of the resource, put into the state. Null, with a log line, when there is none.
+    DictionaryRef loadTemplate(Dictionary& state) const;
 
     std::string _pListName;
     std::unique_ptr<ClassIndex> _cIndex;     // null in a generator that was never set up

@@ -4,6 +4,8 @@ add_library(orvex_build_flags INTERFACE)
 target_compile_options(orvex_build_flags INTERFACE
     -Wall -Wextra -Wpedantic -Werror -Wshadow -Wconversion -Wsign-conversion -Wnon-virtual-dtor
     -Woverloaded-virtual -Wformat=2 -Wimplicit-fallthrough -Wundef -Wcast-align)
+# g++ 12 takes the inactive string of a variant for an uninitialised one when it optimises.
+target_compile_options(orvex_build_flags INTERFACE $<$<CXX_COMPILER_ID:GNU>:-Wno-maybe-uninitialized>)
 if(ORVEX_SANITIZE)
     target_compile_options(orvex_build_flags INTERFACE
         -fsanitize=address,undefined -fno-sanitize-recover=all)

@@ -4,7 +4,7 @@
 
 namespace orvex {
 
-// LTE master information block.
+// LTE antennas.
 //
 //   20  u8  number of transmit antennas
 class LogCode_0xB0C1 {

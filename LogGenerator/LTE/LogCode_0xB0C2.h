@@ -4,7 +4,7 @@
 
 namespace orvex {
 
-// LTE serving cell (RRC).
+// LTE serving cell.
 //
 //   14  u16  physical cell identity
 //   16  u16  downlink EARFCN

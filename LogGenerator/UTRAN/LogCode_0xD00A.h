@@ -17,10 +17,10 @@ public:
     // A bit string of 16 bytes, of which the first 32 bits are read:
     //
     //   0-13   UARFCN
-    //   14-20  cell parameters identity
+    //   14-20  cell identity
     //   21-28  filtered RSCP, 1/256
     //   29-30  set the cell belongs to
-    //   31     in the joint detection cell set
+    //   31     in JDCS
     class Neighbor {
     public:
         explicit Neighbor(PacketReader record)

@@ -99,13 +99,11 @@ OrvexModelNodeRef OrvexModelNode::makeTreeFromObject(const Value& object, NodesB
 
 std::string pathByAppending(const std::string& path, const std::string& component)
 {
-    if (component.empty())
+    const auto first = component.find_first_not_of('/');
+    if (first == std::string::npos)
         return path;
-    std::string result = path;
-    if (!result.ends_with('/'))
-        result += '/';
-    result += component.starts_with('/') ? component.substr(1) : component;
-    return result;
+    const auto last = component.find_last_not_of('/');
+    return path + (path.ends_with('/') ? "" : "/") + component.substr(first, last - first + 1);
 }
 
 } // namespace orvex

@@ -3,7 +3,6 @@
 #include "Value.h"
 
 #include <memory>
-#include <optional>
 #include <string>
 #include <unordered_map>
 #include <vector>
@@ -45,7 +44,8 @@ private:
     std::string _name;
 };
 
-// Appends a display name to a path: exactly one "/" between the two. An empty name leaves the path as it is.
+// Appends a display name to a path: exactly one "/" between the two, none at the end. A name without
+// anything but "/" leaves the path as it is.
 std::string pathByAppending(const std::string& path, const std::string& component);
 
 } // namespace orvex

@@ -23,7 +23,7 @@ public:
 // that the next reader rebuilds it. A start that fails is tried again after five seconds, without limit; a
 // channel that breaks is reopened at once. Failures go to the system log.
 //
-// Everything runs on the run loop's thread. Tasks that wait on the run loop hold the model.
+// Everything runs on the run loop's thread. A retry that waits on the run loop holds the model.
 class OrvexModel : public std::enable_shared_from_this<OrvexModel> {
 public:
     struct Platform {

@@ -52,7 +52,7 @@ std::vector<std::string> FileResources::propertyListPaths() const
     fs::directory_iterator entry(_directory, error);
     for (; !error && entry != fs::directory_iterator(); entry.increment(error)) {
         if (entry->path().extension() == ".plist")
-            paths.push_back(entry->path().string());
+            paths.push_back(entry->path().filename().string());
     }
     if (error)
         systemLog(Priority::error, "Resources %s: %s", _directory.c_str(), error.message().c_str());

@@ -48,8 +48,10 @@ TEST(Base, WritesOnlyIntoAContainerThatIsBoundAlive)
     const LogCode code = 16662;
     index.first.updateWithData({}, code); // nothing is bound
 
+    RecordingLog log;
     auto array = Array::make({"old"});
     index.first.updateSectionRef(array);
+    EXPECT_EQ(log.take(), std::vector<std::string>{"<4>One"});
     index.first.updateWithData({}, code);
     EXPECT_EQ(*array, Array({"new"}));
 
@@ -66,16 +68,24 @@ TEST(Base, WritesOnlyIntoAContainerThatIsBoundAlive)
 
 TEST(Base, LooksUpEcNoInTheMeasuredBands)
 {
+    // The lowest ratio of each band, what it yields, and what the ratio below it yields.
     const struct {
-        std::uint32_t ratio;
+        std::uint32_t lowest;
         int decibel;
-    } cases[] = {{4294967295, 0}, {524288, 0}, {524287, -1}, {417648, -1}, {417647, -2}, {331808, -3},
-        {209464, -4}, {166441, -6}, {105124, -7}, {66435, -10}, {42024, -11}, {33440, -13}, {21206, -14},
-        {16903, -16}, {10772, -17}, {8615, -19}, {5543, -20}, {4461, -22}, {2922, -23}, {2921, -24},
-        {2241, -24}, {2240, -25}, {1950, -25}, {1607, -27}, {1121, -28}, {949, -30}, {814, -30}, {813, -31},
-        {757, -31}, {756, -31}, {706, -31}, {705, 0}, {0, 0}};
-    for (const auto& [ratio, decibel] : cases)
-        EXPECT_EQ(Base::lookUpECNO(ratio), decibel) << ratio;
+        int below;
+    } bands[] = {{524288, 0, -1}, {417648, -1, -2}, {331809, -2, -3}, {263625, -3, -4}, {209464, -4, -5},
+        {166442, -5, -6}, {132269, -6, -7}, {105124, -7, -8}, {83563, -8, -9}, {66436, -9, -10},
+        {52831, -10, -11}, {42024, -11, -12}, {33441, -12, -13}, {26622, -13, -14}, {21206, -14, -15},
+        {16904, -15, -16}, {13487, -16, -17}, {10772, -17, -18}, {8616, -18, -19}, {6903, -19, -20},
+        {5543, -20, -21}, {4462, -21, -22}, {3604, -22, -23}, {2922, -23, -24}, {2241, -24, -25},
+        {1950, -25, -26}, {1608, -26, -27}, {1337, -27, -28}, {1121, -28, -29}, {950, -29, -30},
+        {814, -30, -31}, {757, -31, -31}, {706, -31, 0}};
+    for (const auto& [lowest, decibel, below] : bands) {
+        EXPECT_EQ(Base::lookUpECNO(lowest), decibel) << lowest;
+        EXPECT_EQ(Base::lookUpECNO(lowest - 1), below) << lowest - 1;
+    }
+    EXPECT_EQ(Base::lookUpECNO(4294967295), 0);
+    EXPECT_EQ(Base::lookUpECNO(0), 0);
 }
 
 TEST(PacketReader, ReadsStayInsideThePacket)

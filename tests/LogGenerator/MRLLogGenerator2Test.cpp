@@ -210,6 +210,34 @@ TEST_F(MRLLogGenerator2Test, SuccessorOfAnotherTechnologyLaysOutItsOwnDisplay)
     EXPECT_EQ(shown("Second"), "16662: 13 bytes");
 }
 
+TEST_F(MRLLogGenerator2Test, SuccessorWithoutItsTemplateLeavesTheDisplayToTheNext)
+{
+    makeGenerator()->updateState(state, packet(0x4116, {}));
+    const auto display = state["Display"].dictionary();
+    EXPECT_TRUE(makeGenerator("Other")->generateLogUsingState(state).isNull());
+    makeGenerator()->updateState(state, packet(0x4116, {1, 2}));
+    EXPECT_EQ(state["Display"].dictionary(), display);
+    EXPECT_EQ(shown("First"), "16662: 15 bytes");
+}
+
+TEST_F(MRLLogGenerator2Test, DisplayWithoutATemplateIsNotItsOwn)
+{
+    state.set("Display", Dictionary::make({{"Foreign", "x"}}));
+    makeGenerator()->updateState(state, packet(0x4116, {}));
+    EXPECT_EQ(shown("First"), "16662: 13 bytes");
+}
+
+TEST_F(MRLLogGenerator2Test, TellsOfTheDisplayThatItBuilds)
+{
+    const auto generator = makeGenerator();
+    RecordingLog log;
+    generator->getDisplayFromState(state);
+    EXPECT_THAT(log.take(),
+        testing::ElementsAre(
+            testing::MatchesRegex("<4>Initialized class index: 0x[0-9a-f]+, Self: 0x[0-9a-f]+"),
+            "<4>Dictionary = 1", "<4>String = 0", "<4>First", "<4>Second"));
+}
+
 TEST_F(MRLLogGenerator2Test, TellsOfItsBirthAndItsEnd)
 {
     RecordingLog log;

@@ -81,14 +81,15 @@ TEST_F(MRLLogGeneratorTest, SaveContentsAreTheHistoryAndTheDLF)
     EXPECT_EQ((*(*alone)[0].dictionary())["Description"], Value("DLF binary (161 bytes)"));
     EXPECT_EQ((*(*alone)[0].dictionary())["DLF"].data()->size(), 161U);
 
-    const auto history = Array::make({Dictionary::make({{"DisplayState", "not bytes"}})});
+    const auto history = Array::make({Dictionary::make({{"DisplayState", std::make_shared<Bytes>(5)}}),
+        Dictionary::make({{"DisplayState", "not bytes"}})});
     RecordingLog log;
     const auto broken = generator.getSaveContentsFromState({{"History", history}});
     EXPECT_EQ(*broken, *history) << "no partial DLF";
     EXPECT_EQ(log.take(),
         std::vector<std::string>{
             "<16>Got wrong class writing history to DLF; aborting writing the DLF file"});
-    EXPECT_EQ(history->size(), 1U) << "the history itself is left alone";
+    EXPECT_EQ(history->size(), 2U) << "the history itself is left alone";
 }
 
 TEST(MTLDLFAddVersionReport, NeedsRoomForAllOfIt)

@@ -7,8 +7,6 @@
 
 #include "Dictionary.h"
 
-#include <map>
-
 namespace orvex::test {
 
 // A port that is just there until it is invalidated.

@@ -33,7 +33,17 @@ inline RowTexts rowsOf(const DictionaryRef& dictionary)
     return result;
 }
 
-// One section on its own, bound to an empty dictionary and in turn to an empty array.
+// The text of one row; "(absent)" when there is no such row.
+inline std::string textOf(const RowTexts& rows, const char* name)
+{
+    for (const auto& [row, text] : rows) {
+        if (row == name)
+            return text;
+    }
+    return "(absent)";
+}
+
+// One section on its own, bound to an empty dictionary, or to an array with a stale element.
 template <typename Section>
 class SectionFixture {
 public:

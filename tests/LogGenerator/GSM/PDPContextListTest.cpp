@@ -15,7 +15,8 @@ TEST(PDPContextList, BecomesTheArrayAsItStands)
                   0xFF0002),
         (std::vector<RowTexts>{{{"APN", "internet"}}, {{"", "text"}}}));
     EXPECT_EQ(fixture.log.take(), std::vector<std::string>{"<4>PDPContextList"});
-    EXPECT_EQ(fixture.listAfter(propertyListPacket(0xFF0002, "<array/>"), 0xFF0002), std::vector<RowTexts>{});
+    EXPECT_EQ(fixture.listAfter(propertyListPacket(0xFF0007, "<array/>"), 0xFF0007), std::vector<RowTexts>{})
+        << "whatever the code";
 }
 
 TEST(PDPContextList, DropsAnotherKindAndEndsTheProcessWithoutAList)

@@ -8,6 +8,8 @@
 #include "LogPackets.h"
 #include "SectionFixture.h"
 
+#include <gmock/gmock.h>
+
 namespace orvex::test {
 namespace {
 
@@ -32,12 +34,7 @@ TEST(NeighborMeasurementMisc, ReadsItsHeader)
     EXPECT_EQ(fixture.rowsAfter(neighborPacket(5, 0, {}), 0xB180),
         (RowTexts{{"Version", "3"}, {"E-ARFCN", "6300"}, {"Qrxlevmin", "-130 dBm"}}));
     EXPECT_EQ(fixture.log.take(), Lines{"<4>Neighbor Measurements"});
-    EXPECT_EQ(fixture.rowsAfter(neighborPacket(63, 0, {}), 0xB180)[2].second, "-14 dBm");
-    Bytes shortPacket = neighborPacket(0, 0, {});
-    shortPacket.pop_back();
-    EXPECT_EQ(fixture.rowsAfter(shortPacket, 0xB180), RowTexts{});
-    EXPECT_EQ(fixture.rowsAfter(neighborPacket(0, 0, {}), 0xB186), RowTexts{});
-    EXPECT_EQ(fixture.log.take()[1], "<3>Received an unknown log message: 45446");
+    EXPECT_EQ(textOf(fixture.rowsAfter(neighborPacket(63, 0, {}), 0xB180), "Qrxlevmin"), "-14 dBm");
 }
 
 TEST(NeighborCellsList, ReadsEachFieldOfARecordFromItsOwnBits)
@@ -115,7 +112,7 @@ TEST(NeighborCellsList, ListsOneToThirtyTwoCellsAsFarAsTheyFit)
     for (const auto& [name, bytes, cells] : cases)
         EXPECT_EQ(fixture.listAfter(bytes, 0xB180).size(), cells) << name;
     fixture.listAfter(neighborPacket(0, 31, {record}), 0xB180);
-    EXPECT_EQ(fixture.log.take()[1], "<4>Number of neighboring cells being reported: 32\n");
+    EXPECT_THAT(fixture.log.take(), testing::Contains("<4>Number of neighboring cells being reported: 32\n"));
 }
 
 Bytes reselectionPacket(std::uint16_t count, const Bytes& records)
@@ -132,9 +129,6 @@ TEST(ReselectionCandidatesMisc, ReadsItsHeader)
     EXPECT_EQ(fixture.rowsAfter(reselectionPacket(0, {}), 0xB186),
         (RowTexts{{"Version", "2"}, {"Serving EARFCN", "6300"}, {"Serving Cell ID", "513"}}));
     EXPECT_EQ(fixture.log.take(), Lines{"<4>Reselection Candidates"});
-    Bytes shortPacket = reselectionPacket(0, {});
-    shortPacket.pop_back();
-    EXPECT_EQ(fixture.rowsAfter(shortPacket, 0xB186), RowTexts{});
 }
 
 TEST(ReselectionCandidatesList, ReadsTheFieldsOfEachTechnology)
@@ -142,7 +136,7 @@ TEST(ReselectionCandidatesList, ReadsTheFieldsOfEachTechnology)
     const Bytes fields = {0x01, 0x02, 0x80, 0x43, 0x05, 0x06, 0x07, 0x08};
     const struct {
         const char* name;
-        std::uint8_t technology;
+        std::uint16_t technology;
         RowTexts rows;
     } cases[] = {
         {"LTE", 0, {{"Candidate RAT Type", "LTE"}, {"E ARFCN", "513"}, {"Cell ID", "135"}}},
@@ -153,10 +147,12 @@ TEST(ReselectionCandidatesList, ReadsTheFieldsOfEachTechnology)
         {"HRPD", 4,
             {{"Candidate RAT Type", "CDMAHRPD"}, {"Band", "1"}, {"Channel", "1541"}, {"Pilot", "2055"}}},
         {"unknown", 7, {{"Candidate RAT Type", "??"}}},
+        {"unknown by its high byte", 0x0100, {{"Candidate RAT Type", "??"}}},
     };
     SectionFixture<ReselectionCandidatesList> fixture;
     for (const auto& [name, technology, rows] : cases) {
-        Bytes records = {0x05, 0x01, technology, 0x00};
+        Bytes records = {
+            0x05, 0x01, static_cast<std::uint8_t>(technology), static_cast<std::uint8_t>(technology >> 8)};
         records.insert(records.end(), fields.begin(), fields.end());
         RowTexts expected = {{"Candidate Priority", "261"}};
         expected.insert(expected.end(), rows.begin(), rows.end());
@@ -176,6 +172,9 @@ TEST(ReselectionCandidatesList, CandidatesOverlapAndEndWithThePacket)
         {"Candidate Priority", "2"}, {"Candidate RAT Type", "LTE"}, {"E ARFCN", "6300"}, {"Cell ID", "1"}};
     const Bytes cut(two.begin(), two.end() - 1);
     const Bytes cdmaWithoutItsLastByte = {0x01, 0x00, 0x03, 0x00, 1, 2, 3, 4, 5, 6, 7};
+    const Bytes hrpdWithoutItsLastByte = {0x01, 0x00, 0x04, 0x00, 1, 2, 3, 4, 5, 6, 7};
+    const std::vector<RowTexts> zeros(256,
+        {{"Candidate Priority", "0"}, {"Candidate RAT Type", "LTE"}, {"E ARFCN", "0"}, {"Cell ID", "0"}});
     const struct {
         const char* name;
         Bytes packet;
@@ -186,6 +185,8 @@ TEST(ReselectionCandidatesList, CandidatesOverlapAndEndWithThePacket)
         {"more than fit, the last fields taken for a header too", reselectionPacket(65535, two),
             {first, second, {{"Candidate Priority", "6300"}, {"Candidate RAT Type", "??"}}}},
         {"fields of 8 bytes are cut", reselectionPacket(1, cdmaWithoutItsLastByte), {}},
+        {"fields of 8 bytes are cut, HRPD", reselectionPacket(1, hrpdWithoutItsLastByte), {}},
+        {"a count of two bytes", reselectionPacket(256, Bytes(2000)), zeros},
         {"unknown technology needs no fields", reselectionPacket(1, {9, 0, 9, 0}),
             {{{"Candidate Priority", "9"}, {"Candidate RAT Type", "??"}}}},
         {"none", reselectionPacket(0, two), {}},

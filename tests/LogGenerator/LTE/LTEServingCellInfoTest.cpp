@@ -55,7 +55,7 @@ TEST(LTEServingCellInfo, NamesBandwidthsAndShowsIdentitiesSigned)
 TEST(LTEServingCellInfo, ReportsEveryAntennaPacketAlthoughItIsDecoded)
 {
     Fixture fixture;
-    const Bytes payload = {0, 1, 2, 3, 4, 5, 6, 4, 8};
+    const Bytes payload = {0, 1, 2, 3, 9, 5, 6, 4, 8};
     EXPECT_EQ(fixture.rowsAfter(packet(0xB0C1, payload), 0xB0C1), (RowTexts{{"Num Tx Antennas", "4"}}));
     EXPECT_EQ(fixture.log.take(), (Lines{kEntryLine, "<3>Received an unknown log message: 45249"}));
 

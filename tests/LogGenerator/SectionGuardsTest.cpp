@@ -1,0 +1,90 @@
+// What every section does with a packet that is not for it: too short, or of another code.
+
+#include "LTE/LTEClassIndex.h"
+#include "UTRAN/UTRANClassIndex.h"
+
+#include "LogPackets.h"
+#include "RecordingLog.h"
+
+#include <gtest/gtest.h>
+
+namespace orvex::test {
+namespace {
+
+enum class OtherCode { isReported, isIgnored };
+
+struct Guard {
+    const char* section;
+    LogCode code;
+    std::size_t minimumLength;
+    const char* entryLine;
+    OtherCode otherCode;
+};
+
+const std::vector<Guard> kLTE = {
+    {"Serving Cell Info", 0xB0C1, 22, "<4>LTE Serving Cell Info", OtherCode::isReported},
+    {"Serving Cell Info", 0xB0C2, 38, "<4>LTE Serving Cell Info", OtherCode::isReported},
+    {"Connected mode LTE Intra-frequency Measurement", 0xB179, 29,
+        "<4>Connected mode LTE Intra-frequency Measurement", OtherCode::isReported},
+    {"Measured Neighbor Cells", 0xB179, 29, "<4>Measured Neighbor Cells", OtherCode::isReported},
+    {"Detected Cells", 0xB179, 29, "<4>Detected Cells", OtherCode::isReported},
+    {"Serving Cell Measurements", 0xB17F, 33, "<4>Serving Cell Measurements", OtherCode::isReported},
+    {"Neighbor Measurements", 0xB180, 21, "<4>Neighbor Measurements", OtherCode::isReported},
+    {"Neighbor Cells List", 0xB180, 21, "<4>Neighbor Cells List", OtherCode::isReported},
+    {"Reselection Candidates", 0xB186, 21, "<4>Reselection Candidates", OtherCode::isReported},
+    {"Reselection Candidates List", 0xB186, 21, "<4>Reselection Candidates List", OtherCode::isReported},
+};
+
+const std::vector<Guard> kUTRAN = {
+    {"RRC Info", 0xD0E0, 0, "<4>RRC Info", OtherCode::isIgnored},
+    {"Serving Cell Info", 0xD0E2, 26, "<4>Serving Cell Info", OtherCode::isIgnored},
+    {"Neighbor Cell List", 0xD00A, 21, "<4>NeighbhorMeasurements List", OtherCode::isIgnored},
+    {"GSM Neighbor Cell List", 0xD00E, 17, "<4>GSM Neighbor Cell List", OtherCode::isIgnored},
+    {"TRCH BLER", 0xD00C, 17, "<5>TRCH BLER Measurement", OtherCode::isIgnored},
+    {"CCTRCH SIR", 0xD00C, 17, "<4>CCTRCH SIR Measurement", OtherCode::isIgnored},
+    {"SIM Info", kExtraCodeSimFiles, 0, "<4>SimInfo", OtherCode::isIgnored},
+};
+
+using Lines = std::vector<std::string>;
+
+// The log lines of one packet, which must leave dictionary and array alone.
+Lines linesOfRefusal(Base& section, const Bytes& packet, LogCode code)
+{
+    Lines lines;
+    for (const Value& container :
+        {Value(Dictionary::make({{"row", "kept"}})), Value(Array::make({"kept"}))}) {
+        const Value before = container.shallowCopy();
+        section.updateSectionRef(container);
+        RecordingLog log;
+        section.updateWithData(packet, code);
+        EXPECT_TRUE(container == before) << section.getSectionName();
+        lines = log.take();
+    }
+    return lines;
+}
+
+void expectGuards(const ClassIndex& index, const std::vector<Guard>& guards)
+{
+    for (const auto& [name, code, minimumLength, entryLine, otherCode] : guards) {
+        Base* section = index.getClass(name);
+        ASSERT_NE(section, nullptr) << name;
+        for (std::size_t length = 0; length < minimumLength; ++length)
+            EXPECT_EQ(linesOfRefusal(*section, Bytes(length, 0xFF), code), Lines{entryLine})
+                << name << length;
+
+        const LogCode foreign = 0x1234;
+        Lines expected = {entryLine};
+        if (otherCode == OtherCode::isReported)
+            expected.emplace_back("<3>Received an unknown log message: 4660");
+        EXPECT_EQ(linesOfRefusal(*section, Bytes(400, 0xFF), foreign), expected) << name;
+    }
+}
+
+TEST(Section, RefusesPacketsThatAreNotForIt)
+{
+    expectGuards(LTEClassIndex(), kLTE);
+    expectGuards(UTRANClassIndex(), kUTRAN);
+}
+
+} // namespace
+} // namespace orvex::test
