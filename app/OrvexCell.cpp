@@ -84,7 +84,7 @@ void OrvexCell::layoutAsLeaf()
     const QSizeF valueSize = _value ? QSizeF(sizeOfLine(_value->text(), bold)) : QSizeF();
     const LeafCellLayout layout = leafCellLayout(contentView()->rect(), keySize, valueSize);
     _key->setGeometry(layout.key.toRect());
-    if (!_view)
+    if (!_view || !_value)
         return;
     _value->setGeometry(layout.value.toRect());
     _view->setGeometry(layout.view.toRect());

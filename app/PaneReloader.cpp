@@ -6,7 +6,7 @@
 
 namespace orvex {
 
-void reloadPanes(NavigationStack& stack, OrvexModelNodeRef root,
+void reloadPanes(NavigationStack& stack, const OrvexModelNodeRef& root,
     const std::function<OrvexModelNodeRef(const std::string& path)>& nodeAtPath)
 {
     for (int index = 0; index < stack.count(); ++index) {

@@ -6,7 +6,7 @@
 #include <QString>
 
 #include <algorithm>
-#include <wchar.h>
+#include <cwchar>
 
 namespace orvex {
 

@@ -16,7 +16,7 @@ public:
 
     static ToolbarItem view(std::unique_ptr<QWidget> widget);
     static ToolbarItem button(const QString& title, std::function<void()> action);
-    static ToolbarItem flexibleSpace() { return ToolbarItem(Kind::flexibleSpace, nullptr); }
+    static ToolbarItem flexibleSpace() { return {Kind::flexibleSpace, nullptr}; }
 
     Kind kind() const { return _kind; }
     // The view or the button; null for a space. Hands over the ownership.

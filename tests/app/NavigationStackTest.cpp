@@ -152,6 +152,7 @@ TEST_F(NavigationStackTest, AClickThatARefreshFallsIntoStillCounts)
     QTest::mousePress(pressed, Qt::LeftButton);
     setItems();
     setItems();
+    QTest::qWait(20);
     ASSERT_TRUE(pressed);
     EXPECT_NE(button(), pressed);
     QTest::mouseRelease(pressed, Qt::LeftButton);

@@ -184,13 +184,13 @@ TEST_F(TableListTest, AGestureKeepsToTheAxisInWhichItBegan)
     EXPECT_NEAR(list.contentOffset(), 200, 15); // less the stretch that made it a drag
     EXPECT_EQ(sidewaysAt(list.contentOffset() / 44 + 7), 0);
 
-    list.setContentOffset(0);
+    list.setContentOffset(440);
     drag({250, 100}, {-150, 60});
-    EXPECT_EQ(list.contentOffset(), 0);
-    EXPECT_NEAR(sidewaysAt(2), 150, 15);
-    EXPECT_EQ(sidewaysAt(1), 0);
+    EXPECT_EQ(list.contentOffset(), 440);
+    EXPECT_NEAR(sidewaysAt(12), 150, 15);
+    EXPECT_EQ(sidewaysAt(11), 0);
     list.reloadData();
-    EXPECT_NEAR(sidewaysAt(2), 150, 15);
+    EXPECT_NEAR(sidewaysAt(12), 150, 15);
 }
 
 TEST_F(TableListTest, AFlingGoesOnAndAPressThatStopsItOpensNothing)
