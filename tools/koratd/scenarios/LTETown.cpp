@@ -12,7 +12,8 @@ constexpr double kWeakestRSRP = -140; // dBm
 constexpr double kStrongestRSRP = -44;
 constexpr double kWeakestRSRQ = -20; // dB
 constexpr double kStrongestRSRQ = -3;
-constexpr double kNoise = -125; // dBm in 15 kHz, receiver included
+constexpr double kNoise = -125;             // dBm in 15 kHz, receiver included
+constexpr double kElementsPerBlock = 10.79; // 12, in dB
 constexpr double kAverageStep = 0.1;
 constexpr double kCellLoad = 0.5; // share of a cell's resource elements in use
 
@@ -127,8 +128,11 @@ void LTETown::listen()
     _received.assign(carriers().size(), milliwatts(kNoise));
     for (std::size_t i = 0; i < _cells.size(); ++i) {
         const auto carrier = static_cast<std::size_t>(_cells[i].carrier - carriers().data());
-        _received[carrier] += kCellLoad * milliwatts(_field.level(i));
+        if (_field.level(i) > kWeakestRSRP)
+            _received[carrier] += kCellLoad * milliwatts(_field.level(i));
     }
+    for (double& power : _received)
+        power = decibels(power);
     for (std::size_t i = 0; i < _cells.size(); ++i) {
         if (_averageRSRQ.size() == i)
             _averageRSRQ.push_back(rsrq(i));
@@ -140,7 +144,7 @@ double LTETown::rsrq(std::size_t cell) const
 {
     // RSRQ = N RSRP / RSSI, and the RSSI sums the 12 resource elements of each of the N resource blocks.
     const auto carrier = static_cast<std::size_t>(_cells[cell].carrier - carriers().data());
-    const double rsrq = _field.level(cell) - decibels(12 * _received[carrier]);
+    const double rsrq = _field.level(cell) - _received[carrier] - kElementsPerBlock;
     return std::clamp(rsrq, kWeakestRSRQ, kStrongestRSRQ);
 }
 

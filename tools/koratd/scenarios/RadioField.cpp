@@ -14,6 +14,10 @@ constexpr double kShadowingMemory = 0.98;
 constexpr double kShadowingStep = 0.8; // dB
 
 constexpr double kAverageStep = 0.1;
+
+// Distances change slowly, and logarithms are what a step spends its time on: each is taken anew only in
+// every fifth step.
+constexpr std::size_t kTurns = 5;
 } // namespace
 
 RadioField::RadioField(
@@ -29,9 +33,14 @@ RadioField::RadioField(
 
 void RadioField::step(double position, Randomness& randomness)
 {
+    const bool isFirst = _losses.empty();
+    _losses.resize(_transmitters.size());
+    for (std::size_t i = isFirst ? 0 : _turn; i < _transmitters.size(); i += isFirst ? 1 : kTurns)
+        _losses[i] = loss(_transmitters[i], position);
+    _turn = (_turn + 1) % kTurns;
     for (std::size_t i = 0; i < _transmitters.size(); ++i) {
         _shadowing[i] = _shadowing[i] * kShadowingMemory + randomness.normal() * kShadowingStep;
-        const double level = _transmitters[i].levelAt20m - loss(_transmitters[i], position) + _shadowing[i];
+        const double level = _transmitters[i].levelAt20m - _losses[i] + _shadowing[i];
         _levels[i] = std::clamp(level, _weakest, _strongest);
     }
     if (_averages.empty())
@@ -43,8 +52,9 @@ void RadioField::step(double position, Randomness& randomness)
 double RadioField::loss(const Transmitter& transmitter, double position) const
 {
     const double ahead = position - transmitter.position;
-    const double distance = std::max(20.0, std::hypot(ahead, transmitter.offset));
-    double loss = transmitter.slope * std::log10(distance / 20);
+    // Squares, as a root and a logarithm cost more than the rest together.
+    const double square = std::max(20.0 * 20.0, ahead * ahead + transmitter.offset * transmitter.offset);
+    double loss = transmitter.slope / 2 * std::log10(square / (20.0 * 20.0));
     if (transmitter.direction * ahead < 0)
         loss += kBehindTheBeam;
     const bool isBelow = position >= _underpass.from && position <= _underpass.to;

@@ -43,6 +43,8 @@ private:
     Underpass _underpass;
     double _weakest;
     double _strongest;
+    std::vector<double> _losses; // by distance, dB
+    std::size_t _turn = 0;       // whose losses are computed next
     std::vector<double> _shadowing;
     std::vector<double> _levels;
     std::vector<double> _averages;
