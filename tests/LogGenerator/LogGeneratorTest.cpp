@@ -3,11 +3,13 @@
 #include "UTRAN/UTRANLogGenerator.h"
 
 #include "Array.h"
+#include "Console.h"
 #include "FixedClock.h"
 #include "FixedResources.h"
+#include "RecordingLog.h"
 #include "TelephonyConstants.h"
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 namespace orvex::test {
 namespace {
@@ -23,6 +25,26 @@ TEST(LogGenerator, ChoosesByTheTextOfTheTechnology)
     EXPECT_NE(dynamic_cast<UTRANLogGenerator*>(utran.get()), nullptr);
     for (const Value& unknown : {Value("MRL_LTE "), Value("mrl_lte"), Value(""), Value(), Value(1)})
         EXPECT_EQ(LogGenerator::generatorFromTechnology(unknown, environment), nullptr);
+}
+
+TEST(LTELogGenerator, TellsOfItsBirthAndItsEnd)
+{
+    const FixedResources resources;
+    const FixedClock clock;
+    RecordingLog log;
+    std::vector<std::string> console;
+    installConsole([&console](std::string_view line) { console.emplace_back(line); });
+    LTELogGenerator::generator({resources, clock, {}});
+    installConsole({});
+    const auto lines = log.take();
+    ASSERT_EQ(lines.size(), 17U);
+    EXPECT_EQ(lines[0], "<3>Creating LTELogGenerator object");
+    EXPECT_EQ(lines[1], "<4>Array Count: 3");
+    EXPECT_THAT(lines[12], testing::StartsWith("<3>Creating MRLLogGenerator2 object with 0x"));
+    EXPECT_EQ(lines[14], "<3>Class Index: 1");
+    EXPECT_THAT(lines[15], testing::StartsWith("<4>LTELogGenerator is destructed 0x"));
+    EXPECT_THAT(lines[16], testing::StartsWith("<4>MRL_GSMLogGenerator is destructed 0x"));
+    EXPECT_EQ(console, (std::vector<std::string>{"Deallocing LTEClassIndex", "Deallocing ClassIndex"}));
 }
 
 TEST(LogGenerator, HistoryKeepsTheNewestFive)

@@ -1,12 +1,16 @@
 #include "LTE/LTEClassIndex.h"
 #include "UTRAN/UTRANClassIndex.h"
 
+#include "Console.h"
+#include "LogPackets.h"
 #include "PropertyList.h"
+#include "TextFormat.h"
 
 #include <gtest/gtest.h>
 
 #include <fstream>
 #include <iterator>
+#include <set>
 
 namespace orvex::test {
 namespace {
@@ -84,6 +88,69 @@ TEST(Template, ClassIndexAndTemplateNameTheSameSections)
 {
     expectPlan<LTEClassIndex>(kLTE, "LTE");
     expectPlan<UTRANClassIndex>(kUTRAN, "MRL_UTRAN2");
+}
+
+// The smallest packet of every code, with every key that a property list may have.
+Bytes fullPacket(LogCode code)
+{
+    std::string numbers;
+    for (const char* key : {"TAC", "LAC", "CellID", "PhysicalCellID", "BandInfo", "UARFCN", "ScramblingCode"})
+        numbers += text("<key>%s</key><integer>1</integer>", key);
+    std::string files;
+    for (const char* key : {"ICCID", "MSISDN", "MBDN", "HPPLMN", "LOCI", "PSLOCI", "ACC", "AD", "FPLMN",
+             "AHPLMN", "RATMODE", "PNN", "OPL", "OPLMNAcT"})
+        files += text("<key>kSimFile_%s</key><string>x</string>", key);
+    const auto cell = [&numbers](const char* radio) {
+        return text("<dict><key>RadioAccessTechnology</key><string>%s</string><key>CellType</key>"
+                    "<string>Serving</string>%s</dict>",
+            radio, numbers.c_str());
+    };
+    switch (code) {
+    case kExtraCodeSimFiles: return propertyListPacket(code, "<dict>" + files + "</dict>");
+    case kExtraCodeCellMonitorList:
+        return propertyListPacket(code, "<array>" + cell("LTE") + cell("UTRAN") + "</array>");
+    case kExtraCodePDPContexts: return propertyListPacket(code, "<array/>");
+    default: return packet(code, Bytes(40));
+    }
+}
+
+std::set<std::string> rowNames(const Dictionary& rows)
+{
+    std::set<std::string> names;
+    for (const auto& entry : rows)
+        names.insert(entry.key);
+    return names;
+}
+
+// Every row that a template lays out is one that its section writes, and the other way round.
+template <typename Index>
+void expectRows(
+    const char* templateName, const std::map<std::string, std::set<std::string>>& rowsThatComeAndGo)
+{
+    installConsole([](std::string_view) {});
+    const Index index;
+    const auto display = readTemplate(templateName);
+    for (const auto& [name, entry] : *display) {
+        Base* section = index.getClass(name);
+        ASSERT_NE(section, nullptr) << name;
+        const auto written = Dictionary::make();
+        section->updateSectionRef(written);
+        for (const LogCode code : section->getLogCodeArray())
+            section->updateWithData(fullPacket(code), code);
+        std::set<std::string> laidOut =
+            entry.dictionary() ? rowNames(*entry.dictionary()) : std::set<std::string>();
+        if (const auto extra = rowsThatComeAndGo.find(name); extra != rowsThatComeAndGo.end())
+            laidOut.insert(extra->second.begin(), extra->second.end());
+        EXPECT_EQ(rowNames(*written), laidOut) << name;
+    }
+    installConsole({});
+}
+
+TEST(Template, LaysOutTheRowsThatItsSectionsWrite)
+{
+    // The UARFCN of the cell-monitor list is taken away by the next serving cell packet.
+    expectRows<LTEClassIndex>("LTE", {{"Serving Cell Info", {"UARFCN"}}});
+    expectRows<UTRANClassIndex>("MRL_UTRAN2", {});
 }
 
 } // namespace

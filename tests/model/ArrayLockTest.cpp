@@ -1,8 +1,13 @@
 #include "ArrayLock.h"
 
+#include "Array.h"
+#include "Base.h"
+#include "OrvexModelNode.h"
+
 #include <gtest/gtest.h>
 
 #include <cstdlib>
+#include <functional>
 #include <future>
 #include <thread>
 
@@ -35,6 +40,28 @@ TEST(ArrayLock, NestedHoldsAreUnlockedOnceAtTheLastUnlock)
     GTEST_FLAG_SET(death_test_style, "threadsafe");
     EXPECT_EXIT(lockAndUnlock(1), testing::ExitedWithCode(10), "");
     EXPECT_EXIT(lockAndUnlock(2), testing::ExitedWithCode(20), "");
+}
+
+TEST(ArrayLock, IsTakenByWhoeverWalksOrChangesAPublishedArray)
+{
+    const auto array = Array::make({"old"});
+    const std::pair<const char*, std::function<void()>> users[] = {
+        {"tree builder",
+            [&array] {
+                NodesByPath nodes;
+                OrvexModelNode::makeTreeFromObject(array, nodes);
+            }},
+        {"clear", [&array] { Base::clearElementsInArray(*array); }},
+        {"replace", [&array] { Base::replaceArray(*array, Array({"new"})); }},
+    };
+    for (const auto& [name, use] : users) {
+        ArrayLock::lockArray();
+        auto used = std::async(std::launch::async, use);
+        EXPECT_EQ(used.wait_for(std::chrono::milliseconds(50)), std::future_status::timeout) << name;
+        ArrayLock::unlockArray();
+        EXPECT_EQ(used.wait_for(std::chrono::seconds(10)), std::future_status::ready) << name;
+    }
+    EXPECT_EQ(*array, Array({"new"}));
 }
 
 } // namespace

@@ -54,11 +54,14 @@ TEST_F(OrvexModelTest, StartsTheStreamAndFollowsIt)
         telephony.requests, ElementsAre(Value(Dictionary::make({{"GetTechnology", "GetTechnology"}}))));
     ASSERT_EQ(telephony.commands.size(), 1U);
     EXPECT_EQ((*telephony.commands[0].dictionary())["SetState"], Value("Streaming"));
+    EXPECT_THAT(telephony.portNames, testing::Each("org.orvex.BasebandStateReport.LogChannel"));
+    EXPECT_THAT(telephony.messageIds, ElementsAre(0, 0));
+    EXPECT_THAT(telephony.timeouts, ElementsAre(1s, 1s, 1s)) << "query out, query back, command out";
     EXPECT_THAT(log.lines, Contains(StartsWith("<3> ***** Created ports (send=0x")));
     EXPECT_THAT(log.lines, Contains(StartsWith("<3>Got log generated: 0x")));
     EXPECT_EQ(log.lines.back(), "<3>Starting the display update timer");
 
-    telephony.deliver(kAntennaPacket);
+    EXPECT_EQ(telephony.deliver(kAntennaPacket), std::nullopt) << "messages have no reply";
     EXPECT_EQ(updates, 0);
     runLoop.advance(2s);
     EXPECT_EQ(updates, 1);
@@ -85,6 +88,24 @@ TEST_F(OrvexModelTest, RebuildsTheTreeOnlyAfterSomethingArrived)
     runLoop.advance(2s);
     EXPECT_NE(model->topLevelNodes(), tree);
     EXPECT_EQ(updates, 2);
+}
+
+TEST_F(OrvexModelTest, NoticeOfTheServiceRefreshesAtOnce)
+{
+    model->restartMonitor();
+    telephony.deliver(kAntennaPacket);
+    telephony.notifyConnection();
+    runLoop.runPosted();
+    EXPECT_EQ(updates, 1);
+}
+
+TEST_F(OrvexModelTest, RestartThatMeetsAnUnknownTechnologyLosesItsGenerator)
+{
+    model->restartMonitor();
+    telephony.technology = "none of ours";
+    model->restartMonitor();
+    EXPECT_THAT(log.lines, Contains("<3>No log generator technology works"));
+    EXPECT_EQ(model->topLevelNodes(), nullptr);
 }
 
 TEST_F(OrvexModelTest, StartingTwiceDoesNothing)
@@ -222,9 +243,9 @@ TEST_F(OrvexModelTest, InvalidatedLocalPortRestartsAtOnce)
 TEST_F(OrvexModelTest, DeliberateShutdownRestartsNothing)
 {
     model->restartMonitor();
-    const auto port = telephony.localPort;
     model.reset();
-    EXPECT_FALSE(port->valid);
+    EXPECT_FALSE(telephony.localPort->valid);
+    EXPECT_FALSE(telephony.remotePort->valid);
     EXPECT_EQ(telephony.localPortsCreated, 1);
     EXPECT_EQ(runLoop.timerCount(), 0U);
     EXPECT_THAT(log.lines, Not(Contains(HasSubstr("INVALIDATED"))));

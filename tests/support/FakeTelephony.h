@@ -52,11 +52,20 @@ public:
     std::shared_ptr<FakePort<LocalPort>> localPort;
     std::shared_ptr<FakePort<RemotePort>> remotePort;
 
-    // Delivers a message to the local port.
-    void deliver(const Bytes& message, std::int32_t messageId = 0) { _receiver(messageId, message); }
+    std::vector<std::string> portNames; // of local ports, as asked for, and of channels
+    std::vector<std::int32_t> messageIds;
+    std::vector<std::chrono::milliseconds> timeouts;
+    std::function<void()> notifyConnection;
 
-    LocalPortResult createLocalPort(const std::string&, Receiver receiver) override
+    // Delivers a message to the local port and returns its reply.
+    std::optional<Bytes> deliver(const Bytes& message, std::int32_t messageId = 0)
     {
+        return _receiver(messageId, message);
+    }
+
+    LocalPortResult createLocalPort(const std::string& name, Receiver receiver) override
+    {
+        portNames.push_back(name);
         ++localPortsCreated;
         if (localPortFails)
             return {};
@@ -73,22 +82,24 @@ public:
         return remotePort;
     }
 
-    std::unique_ptr<TelephonyConnection> connect(std::function<void()>) override
+    std::unique_ptr<TelephonyConnection> connect(std::function<void()> onNotification) override
     {
+        notifyConnection = std::move(onNotification);
         return serviceIsAbsent ? nullptr : std::make_unique<FakeConnection>(*this);
     }
 
 private:
     struct FakeConnection final : TelephonyConnection {
-        explicit FakeConnection(const FakeTelephony& owner)
+        explicit FakeConnection(FakeTelephony& owner)
             : _owner(owner)
         {
         }
-        LogChannelReply createNetworkMonitorLogChannel(const std::string&) override
+        LogChannelReply createNetworkMonitorLogChannel(const std::string& name) override
         {
+            _owner.portNames.push_back(name);
             return {0, _owner.channelError, _owner.remotePortName};
         }
-        const FakeTelephony& _owner;
+        FakeTelephony& _owner;
     };
 
     struct FakeRemotePort final : FakePort<RemotePort> {
@@ -96,14 +107,18 @@ private:
             : _owner(owner)
         {
         }
-        Status send(std::int32_t, ByteView data, std::chrono::milliseconds) override
+        Status send(std::int32_t messageId, ByteView data, std::chrono::milliseconds timeout) override
         {
+            _owner.messageIds.push_back(messageId);
+            _owner.timeouts.push_back(timeout);
             _owner.commands.push_back(propertyListFromData(data).value.value_or(Value()));
             return _owner.commandStatus;
         }
-        SendResult request(
-            std::int32_t, ByteView data, std::chrono::milliseconds, std::chrono::milliseconds) override
+        SendResult request(std::int32_t messageId, ByteView data, std::chrono::milliseconds sendTimeout,
+            std::chrono::milliseconds receiveTimeout) override
         {
+            _owner.messageIds.push_back(messageId);
+            _owner.timeouts.insert(_owner.timeouts.end(), {sendTimeout, receiveTimeout});
             _owner.requests.push_back(propertyListFromData(data).value.value_or(Value()));
             if (_owner.requestStatus != Status::success)
                 return {_owner.requestStatus, std::nullopt};
