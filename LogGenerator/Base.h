@@ -55,6 +55,16 @@ protected:
     // The two array operations on the bound array, if there is one.
     void clearSection() const;
     void replaceSection(const Array& with) const;
+    // Empties the bound array and fills it anew with one row dictionary a record.
+    template <typename Records, typename RowMaker>
+    void refillSection(const Records& records, RowMaker rowsOf) const
+    {
+        clearSection();
+        Array list;
+        for (const auto& record : records)
+            list.append(rowsOf(record));
+        replaceSection(list);
+    }
 
     // "Received an unknown log message: %d"
     static void reportUnknown(LogCode logCode);

@@ -1,30 +1,20 @@
 #include "LTE/ConnectedModeMeasurementMisc.h"
 
-#include "LTE/LogCode_0xB179.h"
-
-#include "SystemLog.h"
-
 namespace orvex {
 
 ConnectedModeMeasurementMisc::ConnectedModeMeasurementMisc(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("Connected mode LTE Intra-frequency Measurement", {LogCode_0xB179::kCode}, dict, codeDict)
+    : SingleCodeSection("Connected mode LTE Intra-frequency Measurement", dict, codeDict)
 {
 }
 
-void ConnectedModeMeasurementMisc::updateWithData(Packet packet, LogCode logCode)
+void ConnectedModeMeasurementMisc::update(const LogCode_0xB179& report)
 {
-    systemLog(Priority::warning, "%s", getSectionName().c_str());
-    if (logCode != LogCode_0xB179::kCode)
-        return reportUnknown(logCode);
-    if (packet.size() < LogCode_0xB179::kMinimumLength)
-        return;
-    const LogCode_0xB179 measurement(packet);
     Rows row = rows();
-    row.print("E-ARFCN", "%d", measurement.earfcn());
-    row.print("Serving Physical Cell ID", "%d", measurement.servingPhysicalCellIdentity());
-    row.print("Subframe Number", "%d", measurement.subframeNumber());
-    row.print("Serving Filtered RSRP", "%4.2f dBm", measurement.servingFilteredRSRP());
-    row.print("Serving Filtered RSRQ", "%4.2f dB", measurement.servingFilteredRSRQ());
+    row.print("E-ARFCN", "%d", report.earfcn());
+    row.print("Serving Physical Cell ID", "%d", report.servingPhysicalCellIdentity());
+    row.print("Subframe Number", "%d", report.subframeNumber());
+    row.print("Serving Filtered RSRP", "%4.2f dBm", report.servingFilteredRSRP());
+    row.print("Serving Filtered RSRQ", "%4.2f dB", report.servingFilteredRSRQ());
 }
 
 } // namespace orvex

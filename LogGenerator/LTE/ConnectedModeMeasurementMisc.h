@@ -1,15 +1,17 @@
 #pragma once
 
-#include "Base.h"
+#include "LTE/LogCode_0xB179.h"
+#include "SingleCodeSection.h"
 
 namespace orvex {
 
 // "Connected mode LTE Intra-frequency Measurement": the serving cell as measured in connected mode.
-class ConnectedModeMeasurementMisc final : public Base {
+class ConnectedModeMeasurementMisc final : public SingleCodeSection<LogCode_0xB179> {
 public:
     ConnectedModeMeasurementMisc(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xB179& report) override;
 };
 
 } // namespace orvex

@@ -1,15 +1,17 @@
 #pragma once
 
-#include "Base.h"
+#include "LTE/LogCode_0xB179.h"
+#include "SingleCodeSection.h"
 
 namespace orvex {
 
 // "Detected Cells": cells found in connected mode but not measured, one row dictionary each.
-class DetectedCells final : public Base {
+class DetectedCells final : public SingleCodeSection<LogCode_0xB179> {
 public:
     DetectedCells(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xB179& report) override;
 };
 
 } // namespace orvex

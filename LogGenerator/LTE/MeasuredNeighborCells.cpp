@@ -1,36 +1,28 @@
 #include "LTE/MeasuredNeighborCells.h"
 
-#include "LTE/LogCode_0xB179.h"
-
-#include "SystemLog.h"
-
 namespace orvex {
 
+namespace {
+
+DictionaryRef rowsOf(const LogCode_0xB179::MeasuredNeighbor& neighbor)
+{
+    Rows row = Rows::make();
+    row.print("Physical Cell ID", "%d", neighbor.physicalCellIdentity());
+    row.print("Filtered RSRP", "%4.2f dBm", neighbor.filteredRSRP());
+    row.print("Filtered RSRQ", "%4.2f dB", neighbor.filteredRSRQ());
+    return row.dictionary();
+}
+
+} // namespace
+
 MeasuredNeighborCells::MeasuredNeighborCells(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("Measured Neighbor Cells", {LogCode_0xB179::kCode}, dict, codeDict)
+    : SingleCodeSection("Measured Neighbor Cells", dict, codeDict)
 {
 }
 
-void MeasuredNeighborCells::updateWithData(Packet packet, LogCode logCode)
+void MeasuredNeighborCells::update(const LogCode_0xB179& report)
 {
-    systemLog(Priority::warning, "%s", getSectionName().c_str());
-    if (logCode != LogCode_0xB179::kCode)
-        return reportUnknown(logCode);
-    if (packet.size() < LogCode_0xB179::kMinimumLength)
-        return;
-    clearSection();
-    const auto neighbors = LogCode_0xB179(packet).measuredNeighbors();
-    if (neighbors.count() == 0)
-        return;
-    Array cells;
-    for (const auto& neighbor : neighbors) {
-        Rows row = Rows::make();
-        row.print("Physical Cell ID", "%d", neighbor.physicalCellIdentity());
-        row.print("Filtered RSRP", "%4.2f dBm", neighbor.filteredRSRP());
-        row.print("Filtered RSRQ", "%4.2f dB", neighbor.filteredRSRQ());
-        cells.append(row.dictionary());
-    }
-    replaceSection(cells);
+    refillSection(report.measuredNeighbors(), rowsOf);
 }
 
 } // namespace orvex

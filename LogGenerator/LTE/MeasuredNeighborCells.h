@@ -1,16 +1,18 @@
 #pragma once
 
-#include "Base.h"
+#include "LTE/LogCode_0xB179.h"
+#include "SingleCodeSection.h"
 
 namespace orvex {
 
 // "Measured Neighbor Cells": the intra-frequency neighbours measured in connected mode, one row dictionary
 // each.
-class MeasuredNeighborCells final : public Base {
+class MeasuredNeighborCells final : public SingleCodeSection<LogCode_0xB179> {
 public:
     MeasuredNeighborCells(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xB179& report) override;
 };
 
 } // namespace orvex

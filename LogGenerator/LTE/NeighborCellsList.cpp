@@ -1,7 +1,5 @@
 #include "LTE/NeighborCellsList.h"
 
-#include "LTE/LogCode_0xB180.h"
-
 #include "SystemLog.h"
 
 namespace orvex {
@@ -38,25 +36,16 @@ DictionaryRef rowsOf(const LogCode_0xB180::NeighborCell& cell)
 } // namespace
 
 NeighborCellsList::NeighborCellsList(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("Neighbor Cells List", {LogCode_0xB180::kCode}, dict, codeDict)
+    : SingleCodeSection("Neighbor Cells List", dict, codeDict)
 {
 }
 
-void NeighborCellsList::updateWithData(Packet packet, LogCode logCode)
+void NeighborCellsList::update(const LogCode_0xB180& report)
 {
-    systemLog(Priority::warning, "%s", getSectionName().c_str());
-    if (logCode != LogCode_0xB180::kCode)
-        return reportUnknown(logCode);
-    if (packet.size() < LogCode_0xB180::kMinimumLength)
-        return;
-    clearSection();
-    const auto neighbors = LogCode_0xB180(packet).neighborCells();
+    const auto neighbors = report.neighborCells();
     systemLog(Priority::warning, "Number of neighboring cells being reported: %d\n",
         static_cast<int>(neighbors.count()));
-    Array cells;
-    for (const auto& neighbor : neighbors)
-        cells.append(rowsOf(neighbor));
-    replaceSection(cells);
+    refillSection(neighbors, rowsOf);
 }
 
 } // namespace orvex

@@ -1,15 +1,17 @@
 #pragma once
 
-#include "Base.h"
+#include "LTE/LogCode_0xB180.h"
+#include "SingleCodeSection.h"
 
 namespace orvex {
 
 // "Neighbor Cells List": the neighbours measured in idle mode, one row dictionary each.
-class NeighborCellsList final : public Base {
+class NeighborCellsList final : public SingleCodeSection<LogCode_0xB180> {
 public:
     NeighborCellsList(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xB180& report) override;
 };
 
 } // namespace orvex

@@ -1,15 +1,17 @@
 #pragma once
 
-#include "Base.h"
+#include "LTE/LogCode_0xB180.h"
+#include "SingleCodeSection.h"
 
 namespace orvex {
 
 // "Neighbor Measurements": what the idle-mode neighbour measurement says of its layer.
-class NeighborMeasurementMisc final : public Base {
+class NeighborMeasurementMisc final : public SingleCodeSection<LogCode_0xB180> {
 public:
     NeighborMeasurementMisc(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xB180& report) override;
 };
 
 } // namespace orvex

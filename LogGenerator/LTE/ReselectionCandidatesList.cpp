@@ -1,9 +1,6 @@
 #include "LTE/ReselectionCandidatesList.h"
 
 #include "EnumTable.h"
-#include "LTE/LogCode_0xB186.h"
-
-#include "SystemLog.h"
 
 namespace orvex {
 
@@ -63,23 +60,15 @@ DictionaryRef rowsOf(const LogCode_0xB186::Candidate& candidate)
 } // namespace
 
 ReselectionCandidatesList::ReselectionCandidatesList(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("Reselection Candidates List", {LogCode_0xB186::kCode}, dict, codeDict)
+    : SingleCodeSection("Reselection Candidates List", dict, codeDict)
 {
 }
 
-void ReselectionCandidatesList::updateWithData(Packet packet, LogCode logCode)
+void ReselectionCandidatesList::update(const LogCode_0xB186& report)
 {
-    systemLog(Priority::warning, "%s", getSectionName().c_str());
-    if (logCode != LogCode_0xB186::kCode)
-        return reportUnknown(logCode);
-    if (packet.size() < LogCode_0xB186::kMinimumLength)
-        return;
     clearSection();
-    const auto candidates = LogCode_0xB186(packet).candidates();
-    if (candidates.count() == 0)
-        return;
     Array cells;
-    for (const auto& candidate : candidates) {
+    for (const auto& candidate : report.candidates()) {
         if (!candidate.isComplete())
             break;
         cells.append(rowsOf(candidate));

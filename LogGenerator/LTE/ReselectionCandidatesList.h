@@ -1,16 +1,18 @@
 #pragma once
 
-#include "Base.h"
+#include "LTE/LogCode_0xB186.h"
+#include "SingleCodeSection.h"
 
 namespace orvex {
 
 // "Reselection Candidates List": the cells of any radio technology considered for reselection, one row
 // dictionary each.
-class ReselectionCandidatesList final : public Base {
+class ReselectionCandidatesList final : public SingleCodeSection<LogCode_0xB186> {
 public:
     ReselectionCandidatesList(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xB186& report) override;
 };
 
 } // namespace orvex

@@ -1,15 +1,17 @@
 #pragma once
 
-#include "Base.h"
+#include "LTE/LogCode_0xB186.h"
+#include "SingleCodeSection.h"
 
 namespace orvex {
 
 // "Reselection Candidates": the serving cell from which reselection is considered.
-class ReselectionCandidatesMisc final : public Base {
+class ReselectionCandidatesMisc final : public SingleCodeSection<LogCode_0xB186> {
 public:
     ReselectionCandidatesMisc(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xB186& report) override;
 };
 
 } // namespace orvex

@@ -1,9 +1,5 @@
 #include "LTE/ServingCellMeasurement.h"
 
-#include "LTE/LogCode_0xB17F.h"
-
-#include "SystemLog.h"
-
 namespace orvex {
 
 namespace {
@@ -27,39 +23,33 @@ void printSearch(Rows& row, const char* name, int raw, const char* unit)
 } // namespace
 
 ServingCellMeasurement::ServingCellMeasurement(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("Serving Cell Measurements", {LogCode_0xB17F::kCode}, dict, codeDict)
+    : SingleCodeSection("Serving Cell Measurements", dict, codeDict)
 {
 }
 
-void ServingCellMeasurement::updateWithData(Packet packet, LogCode logCode)
+void ServingCellMeasurement::update(const LogCode_0xB17F& report)
 {
-    systemLog(Priority::warning, "%s", getSectionName().c_str());
-    if (logCode != LogCode_0xB17F::kCode)
-        return reportUnknown(logCode);
-    if (packet.size() < LogCode_0xB17F::kMinimumLength)
-        return;
-    const LogCode_0xB17F measurement(packet);
     Rows row = rows();
-    row.print("Version", "%d", measurement.version());
-    row.print("E-ARFCN", "%d", measurement.earfcn());
-    row.print("Physical Cell ID", "%d", measurement.physicalCellIdentity());
-    row.print("Serving Layer Priority", "%d", measurement.servingLayerPriority());
-    row.print("Measured RSRP", "%4.2f dBm", measurement.measuredRSRP());
-    row.print("Average RSRP", "%4.2f dBm", measurement.averageRSRP());
-    row.print("Measured RSRQ", "%4.2f dB", measurement.measuredRSRQ());
-    row.print("Average RSRQ", "%4.2f dB", measurement.averageRSRQ());
-    row.print("Measured RSSI", "%4.2f dBm", measurement.measuredRSSI());
-    row.print("Qrxlevmin", "%d dBm", measurement.qRxLevMin());
-    printPower(row, "P_Max", measurement.pMax());
+    row.print("Version", "%d", report.version());
+    row.print("E-ARFCN", "%d", report.earfcn());
+    row.print("Physical Cell ID", "%d", report.physicalCellIdentity());
+    row.print("Serving Layer Priority", "%d", report.servingLayerPriority());
+    row.print("Measured RSRP", "%4.2f dBm", report.measuredRSRP());
+    row.print("Average RSRP", "%4.2f dBm", report.averageRSRP());
+    row.print("Measured RSRQ", "%4.2f dB", report.measuredRSRQ());
+    row.print("Average RSRQ", "%4.2f dB", report.averageRSRQ());
+    row.print("Measured RSSI", "%4.2f dBm", report.measuredRSSI());
+    row.print("Qrxlevmin", "%d dBm", report.qRxLevMin());
+    printPower(row, "P_Max", report.pMax());
     // The field has 6 bits and never reaches the value that stands for none; the test is the same all the
     // same.
-    printPower(row, "Max UE Tx Power", measurement.maximumTransmitPower());
-    row.print("Srxlev", "%d dBm", measurement.srxlev());
-    row.print("Num of Consecutive DRX Cycles of S < 0", "%d", measurement.drxCyclesBelowZero());
-    printSearch(row, "S Intra Search", measurement.sIntraSearch(), "dB");
-    printSearch(row, "S Non Intra Search", measurement.sNonIntraSearch(), "dBm"); // shown so, though it is dB
-    row.set("Measurement Rules Updated", measurement.measurementRulesUpdated() ? "True" : "False");
-    row.print("Measurement Rules", "%d", measurement.measurementRules());
+    printPower(row, "Max UE Tx Power", report.maximumTransmitPower());
+    row.print("Srxlev", "%d dBm", report.srxlev());
+    row.print("Num of Consecutive DRX Cycles of S < 0", "%d", report.drxCyclesBelowZero());
+    printSearch(row, "S Intra Search", report.sIntraSearch(), "dB");
+    printSearch(row, "S Non Intra Search", report.sNonIntraSearch(), "dBm"); // shown so, though it is dB
+    row.set("Measurement Rules Updated", report.measurementRulesUpdated() ? "True" : "False");
+    row.print("Measurement Rules", "%d", report.measurementRules());
 }
 
 } // namespace orvex

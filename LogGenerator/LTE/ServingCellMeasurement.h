@@ -1,15 +1,17 @@
 #pragma once
 
-#include "Base.h"
+#include "LTE/LogCode_0xB17F.h"
+#include "SingleCodeSection.h"
 
 namespace orvex {
 
 // "Serving Cell Measurements": the serving cell as measured in idle mode, and its cell selection values.
-class ServingCellMeasurement final : public Base {
+class ServingCellMeasurement final : public SingleCodeSection<LogCode_0xB17F> {
 public:
     ServingCellMeasurement(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xB17F& report) override;
 };
 
 } // namespace orvex

@@ -1,8 +1,5 @@
 #include "UTRAN/CCTRCHSIRMeasurement.h"
 
-#include "UTRAN/LogCode_0xD00C.h"
-
-#include "SystemLog.h"
 #include "TextFormat.h"
 
 namespace orvex {
@@ -24,20 +21,14 @@ DictionaryRef rowsOf(const LogCode_0xD00C::CompositeChannel& channel)
 } // namespace
 
 CCTRCHSIRMeasurement::CCTRCHSIRMeasurement(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("CCTRCH SIR", {LogCode_0xD00C::kCode}, dict, codeDict)
+    : SingleCodeSection(
+        "CCTRCH SIR", {Priority::warning, "CCTRCH SIR Measurement"}, OtherCodes::areIgnored, dict, codeDict)
 {
 }
 
-void CCTRCHSIRMeasurement::updateWithData(Packet packet, LogCode logCode)
+void CCTRCHSIRMeasurement::update(const LogCode_0xD00C& report)
 {
-    systemLog(Priority::warning, "CCTRCH SIR Measurement");
-    if (logCode != LogCode_0xD00C::kCode || packet.size() < LogCode_0xD00C::kMinimumLength)
-        return;
-    clearSection();
-    Array channels;
-    for (const auto& channel : LogCode_0xD00C(packet).compositeChannels())
-        channels.append(rowsOf(channel));
-    replaceSection(channels);
+    refillSection(report.compositeChannels(), rowsOf);
 }
 
 } // namespace orvex

@@ -1,16 +1,18 @@
 #pragma once
 
-#include "Base.h"
+#include "SingleCodeSection.h"
+#include "UTRAN/LogCode_0xD00C.h"
 
 namespace orvex {
 
 // "CCTRCH SIR": signal-to-interference ratios of the coded composite transport channels, one row dictionary
 // each.
-class CCTRCHSIRMeasurement final : public Base {
+class CCTRCHSIRMeasurement final : public SingleCodeSection<LogCode_0xD00C> {
 public:
     CCTRCHSIRMeasurement(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xD00C& report) override;
 };
 
 } // namespace orvex

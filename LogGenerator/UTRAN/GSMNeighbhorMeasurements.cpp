@@ -1,9 +1,5 @@
 #include "UTRAN/GSMNeighbhorMeasurements.h"
 
-#include "UTRAN/LogCode_0xD00E.h"
-
-#include "SystemLog.h"
-
 namespace orvex {
 
 namespace {
@@ -24,18 +20,16 @@ DictionaryRef rowsOf(const LogCode_0xD00E::GSMNeighbor& neighbor)
 } // namespace
 
 GSMNeighbhorMeasurements::GSMNeighbhorMeasurements(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("GSM Neighbor Cell List", {LogCode_0xD00E::kCode}, dict, codeDict)
+    : SingleCodeSection("GSM Neighbor Cell List", {Priority::warning, "GSM Neighbor Cell List"},
+        OtherCodes::areIgnored, dict, codeDict)
 {
 }
 
-void GSMNeighbhorMeasurements::updateWithData(Packet packet, LogCode logCode)
+void GSMNeighbhorMeasurements::update(const LogCode_0xD00E& report)
 {
-    systemLog(Priority::warning, "GSM Neighbor Cell List");
-    if (logCode != LogCode_0xD00E::kCode || packet.size() < LogCode_0xD00E::kMinimumLength)
-        return;
     clearSection();
     Array cells;
-    for (const auto& neighbor : LogCode_0xD00E(packet).neighbors())
+    for (const auto& neighbor : report.neighbors())
         cells.append(rowsOf(neighbor));
     // Not published: what one sees here has always been an empty list.
 }

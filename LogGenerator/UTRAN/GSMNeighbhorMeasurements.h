@@ -1,16 +1,18 @@
 #pragma once
 
-#include "Base.h"
+#include "SingleCodeSection.h"
+#include "UTRAN/LogCode_0xD00E.h"
 
 namespace orvex {
 
 // "GSM Neighbor Cell List": GSM neighbours seen from UTRAN. The list is built and never published: after
 // the first packet the section stays empty.
-class GSMNeighbhorMeasurements final : public Base {
+class GSMNeighbhorMeasurements final : public SingleCodeSection<LogCode_0xD00E> {
 public:
     GSMNeighbhorMeasurements(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xD00E& report) override;
 };
 
 } // namespace orvex

@@ -1,15 +1,17 @@
 #pragma once
 
-#include "Base.h"
+#include "SingleCodeSection.h"
+#include "UTRAN/LogCode_0xD00C.h"
 
 namespace orvex {
 
 // "TRCH BLER": block error rates of the transport channels, one row dictionary each.
-class TRCHBLERMeasurement final : public Base {
+class TRCHBLERMeasurement final : public SingleCodeSection<LogCode_0xD00C> {
 public:
     TRCHBLERMeasurement(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xD00C& report) override;
 };
 
 } // namespace orvex

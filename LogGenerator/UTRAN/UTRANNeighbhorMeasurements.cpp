@@ -1,9 +1,6 @@
 #include "UTRAN/UTRANNeighbhorMeasurements.h"
 
 #include "EnumTable.h"
-#include "UTRAN/LogCode_0xD00A.h"
-
-#include "SystemLog.h"
 
 namespace orvex {
 
@@ -26,20 +23,14 @@ DictionaryRef rowsOf(const LogCode_0xD00A::Neighbor& neighbor)
 } // namespace
 
 UTRANNeighbhorMeasurements::UTRANNeighbhorMeasurements(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("Neighbor Cell List", {LogCode_0xD00A::kCode}, dict, codeDict)
+    : SingleCodeSection("Neighbor Cell List", {Priority::warning, "NeighbhorMeasurements List"},
+        OtherCodes::areIgnored, dict, codeDict)
 {
 }
 
-void UTRANNeighbhorMeasurements::updateWithData(Packet packet, LogCode logCode)
+void UTRANNeighbhorMeasurements::update(const LogCode_0xD00A& report)
 {
-    systemLog(Priority::warning, "NeighbhorMeasurements List");
-    if (logCode != LogCode_0xD00A::kCode || packet.size() < LogCode_0xD00A::kMinimumLength)
-        return;
-    clearSection();
-    Array cells;
-    for (const auto& neighbor : LogCode_0xD00A(packet).neighbors())
-        cells.append(rowsOf(neighbor));
-    replaceSection(cells);
+    refillSection(report.neighbors(), rowsOf);
 }
 
 } // namespace orvex

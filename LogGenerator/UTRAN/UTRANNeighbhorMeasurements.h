@@ -1,15 +1,17 @@
 #pragma once
 
-#include "Base.h"
+#include "SingleCodeSection.h"
+#include "UTRAN/LogCode_0xD00A.h"
 
 namespace orvex {
 
 // "Neighbor Cell List": the intra-frequency neighbours, one row dictionary each.
-class UTRANNeighbhorMeasurements final : public Base {
+class UTRANNeighbhorMeasurements final : public SingleCodeSection<LogCode_0xD00A> {
 public:
     UTRANNeighbhorMeasurements(ClassDictionary& dict, CodeDictionary& codeDict);
 
-    void updateWithData(Packet packet, LogCode logCode) override;
+protected:
+    void update(const LogCode_0xD00A& report) override;
 };
 
 } // namespace orvex

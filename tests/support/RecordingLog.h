@@ -5,6 +5,7 @@
 #include "TextFormat.h"
 
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace orvex::test {
