@@ -66,6 +66,7 @@ TEST(KoratProcess, StreamsWhatWasAskedForAfterTheStartCommand)
     KoratClient client(folder.ports());
     ASSERT_EQ(client.open(), 0);
     EXPECT_EQ(client.technology(), Value("MRL_LTE"));
+    client.send(Dictionary::make({{"SetState", "Idle"}}));
     turnFor(std::chrono::milliseconds(300));
     EXPECT_EQ(client.messages.size(), 0U);
 
@@ -103,18 +104,27 @@ TEST(KoratProcess, ServesOneClientAtATime)
 {
     const ProgramFolder folder;
     KoratProgram korat(folder, {"--count", "1"});
+    auto first = std::make_unique<KoratClient>(folder.ports());
     KoratClient second(folder.ports(), "org.orvex.Test.Second");
-    {
-        KoratClient first(folder.ports());
-        ASSERT_EQ(first.open(), 0);
-        EXPECT_EQ(second.open(), EBUSY);
-        first.send(everything());
-        ASSERT_TRUE(waitUntil([&] { return !first.messages.empty(); }));
-    }
-    // At once: the request is on its way before koratd can have seen that the first one has gone.
+    ASSERT_EQ(first->open(), 0);
+    EXPECT_EQ(second.open(), EBUSY);
+    first->send(everything());
+    ASSERT_TRUE(waitUntil([&] { return !first->messages.empty(); }));
+
+    // koratd finds the request before it has looked whether the first client is still there.
+    const auto frozen = korat.freezeFor(std::chrono::milliseconds(100));
+    first.reset();
     ASSERT_EQ(second.open(), 0);
     EXPECT_EQ(second.technology(), Value("MRL_LTE"));
     EXPECT_TRUE(korat.waitForError("org.orvex.Test.Client has left; sent 1 messages"));
+}
+
+TEST(KoratProcess, SeesAClientLeave)
+{
+    const ProgramFolder folder;
+    KoratProgram korat(folder);
+    ASSERT_EQ(KoratClient(folder.ports()).open(), 0);
+    EXPECT_TRUE(korat.waitForError("org.orvex.Test.Client has left; sent 0 messages"));
 }
 
 TEST(KoratProcess, RequestsThatMakeNoSenseAreRefused)

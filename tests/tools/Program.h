@@ -6,7 +6,9 @@
 #include <QTemporaryDir>
 
 #include <chrono>
+#include <csignal>
 #include <string>
+#include <thread>
 #include <vector>
 
 namespace orvex::test {
@@ -79,6 +81,17 @@ public:
             }
         }
         return values;
+    }
+
+    // Stops it where it is, and lets it go on after a while, whatever the test does meanwhile.
+    std::jthread freezeFor(std::chrono::milliseconds time)
+    {
+        const auto process = static_cast<pid_t>(_process.processId());
+        ::kill(process, SIGSTOP);
+        return std::jthread([process, time] {
+            std::this_thread::sleep_for(time);
+            ::kill(process, SIGCONT);
+        });
     }
 
     void kill()

@@ -83,7 +83,8 @@ Bytes KoratService::openChannel(const std::string& clientPortName)
         return channelReply(*_options.faults.refuseChannel);
     if (_options.faults.nullPort)
         return channelReply(0);
-    if (_channel && !_channel->doesClientListen())
+    // It may have gone since the last look.
+    if (_channel && !_channel->isClientThere())
         closeChannel();
     if (_channel) {
         report("refused %s: %s is being served", clientPortName.c_str(), _channel->clientPortName().c_str());

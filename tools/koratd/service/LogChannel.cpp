@@ -10,8 +10,6 @@ namespace orvex::korat {
 
 namespace {
 constexpr std::int32_t kChannelMessageId = 0;
-constexpr std::int32_t kProbeMessageId =
-    -1; // clients pass over every message but those with the channel's id
 constexpr const char* kUnheardOfTechnology = "MRL_UNHEARD_OF";
 constexpr std::string_view kNoPropertyList = "\x01\x02 this is no property list";
 
@@ -52,12 +50,6 @@ LogChannel::~LogChannel()
         _client->invalidate();
     if (_port)
         _port->invalidate();
-}
-
-bool LogChannel::doesClientListen()
-{
-    _client->send(kProbeMessageId, {}, std::chrono::milliseconds(0));
-    return _client->isValid();
 }
 
 std::optional<Bytes> LogChannel::receive(std::int32_t messageId, ByteView data)

@@ -23,8 +23,6 @@ public:
     LogChannel& operator=(const LogChannel&) = delete;
 
     bool isClientThere() const { return _client->isValid(); }
-    // The same, for one who has to know now: it speaks to the client, which may have gone unnoticed.
-    bool doesClientListen();
     const std::string& clientPortName() const { return _clientPortName; }
     std::uint64_t sent() const { return _sentBefore + (_streamer ? _streamer->sent() : 0); }
 
