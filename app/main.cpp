@@ -22,6 +22,7 @@
 #include <QApplication>
 
 #include <algorithm>
+#include <clocale>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
@@ -82,9 +83,16 @@ void endWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString&
     std::_Exit(kExitFailure);
 }
 
+// Qt takes the user's locale, which may have decimal commas. Values and property lists have points.
+void keepDecimalPoints()
+{
+    std::setlocale(LC_NUMERIC, "C");
+}
+
 int runConsole(int argc, char** argv, const std::string& resourceDirectory)
 {
     const QCoreApplication application(argc, argv);
+    keepDecimalPoints();
     // Standard output is the tree's. A terminal that is redrawn in place has no room for other lines at all.
     const bool wouldDisturb = ::isatty(STDOUT_FILENO) && ::isatty(STDERR_FILENO);
     installConsole([wouldDisturb](std::string_view line) {
@@ -109,6 +117,7 @@ int runWindow(int argc, char** argv, const std::string& resourceDirectory, Theme
     }
     const QtMessageHandler usualHandler = qInstallMessageHandler(endWithoutDisplay);
     const QApplication application(argc, argv);
+    keepDecimalPoints();
     qInstallMessageHandler(usualHandler);
     QApplication::setApplicationName(QStringLiteral("orvex"));
     QApplication::setApplicationDisplayName(QStringLiteral("Orvex"));

@@ -4,6 +4,7 @@
 
 #include <atomic>
 #include <chrono>
+#include <cstdio>
 #include <cstdlib>
 #include <cxxabi.h>
 #include <exception>
@@ -56,9 +57,13 @@ std::string descriptionOfCurrentException()
         std::this_thread::sleep_for(std::chrono::seconds(10));
         std::abort();
     }
-    systemLog(Priority::error, "Fatal: %s", descriptionOfCurrentException().c_str());
-    if (SystemLog* log = SystemLog::installed())
+    const std::string description = descriptionOfCurrentException();
+    if (SystemLog* log = SystemLog::installed()) {
+        systemLog(Priority::error, "Fatal: %s", description.c_str());
         log->flush();
+    } else {
+        std::fprintf(stderr, "Fatal: %s\n", description.c_str());
+    }
     std::abort();
 }
 } // namespace
