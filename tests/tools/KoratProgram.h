@@ -6,7 +6,7 @@
 
 #include <gtest/gtest.h>
 
-#include <QFileInfo>
+#include <QLocalSocket>
 #include <QRegularExpression>
 
 namespace orvex::test {
@@ -17,8 +17,13 @@ public:
     explicit KoratProgram(const ProgramFolder& folder, const QStringList& arguments = {})
         : Program(folder, KORATD_PATH, arguments)
     {
+        // Its socket file is there a moment before it listens.
         const QString socket = QString::fromStdString(folder.ports() + "/" + telephony::kServicePortName);
-        EXPECT_TRUE(waitUntil([&] { return QFileInfo::exists(socket) || !isRunning(); }));
+        EXPECT_TRUE(waitUntil([&] {
+            QLocalSocket probe;
+            probe.connectToServer(socket);
+            return probe.waitForConnected(100) || !isRunning();
+        }));
     }
 
     // Ends it. What it says that it has sent to all its clients; -1 when it did not end well.

@@ -94,9 +94,9 @@ TEST(LiveSession, ComesBackAfterTheServiceWasKilled)
     QElapsedTimer elapsed;
     elapsed.start();
     ASSERT_TRUE(monitor.waitForError(" ***** INVALIDATED "));
-    EXPECT_LE(elapsed.restart(), 3500); // the next tick
+    EXPECT_LE(elapsed.restart(), 4500); // the next tick
     ASSERT_TRUE(monitor.waitForError("Could not create KoratServerConnection"));
-    EXPECT_LE(elapsed.elapsed(), 1000); // at once
+    EXPECT_LE(elapsed.elapsed(), 3000); // at once, not after the five seconds of a failed start
     EXPECT_TRUE(monitor.waitForOutput("Connecting...", 2));
 
     const auto before = shown(monitor, "Serving Cell Measurements", "Measured RSRP").size();
