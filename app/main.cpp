@@ -4,7 +4,6 @@
 #include "OrvexApp.h"
 #include "OrvexConsole.h"
 #include "StandardOutput.h"
-#include "TerminationSignals.h"
 
 #include "Accessibility.h"
 #include "FatalErrors.h"
@@ -15,6 +14,7 @@
 #include "QtRunLoop.h"
 #include "SocketMessagePorts.h"
 #include "SystemClock.h"
+#include "TerminationSignals.h"
 
 #include "Console.h"
 #include "SystemLog.h"

@@ -9,13 +9,13 @@ namespace orvex::test {
 // Puts numbers into a bit string one bit at a time: bit 0 is the least significant bit of the first byte.
 class BitStringWriter {
 public:
-    BitStringWriter& put(std::size_t first, std::size_t width, unsigned value)
+    BitStringWriter& put(std::size_t first, std::size_t width, std::uint64_t value)
     {
         for (std::size_t bit = 0; bit < width; ++bit) {
             const std::size_t position = first + bit;
             if (_bytes.size() <= position / 8)
                 _bytes.resize(position / 8 + 1);
-            if ((value >> bit) & 1U)
+            if (bit < 64 && ((value >> bit) & 1U))
                 _bytes[position / 8] =
                     static_cast<std::uint8_t>(_bytes[position / 8] | (1U << (position % 8)));
         }

@@ -1,5 +1,4 @@
 #include "Options.h"
-#include "SignalWatcher.h"
 
 #include "service/KoratService.h"
 #include "service/Report.h"
@@ -8,6 +7,7 @@
 #include "LinuxSystemLog.h"
 #include "QtRunLoop.h"
 #include "SocketMessagePorts.h"
+#include "TerminationSignals.h"
 
 #include <QCoreApplication>
 
@@ -16,13 +16,13 @@
 namespace {
 constexpr int kWrongUsage = 2;
 
-int serve(const orvex::korat::Options& options, orvex::korat::SignalWatcher& stopSignals)
+int serve(const orvex::korat::Options& options)
 {
     using namespace orvex;
     QtRunLoop runLoop;
     SocketMessagePorts ports;
     korat::KoratService service({runLoop, ports}, options);
-    stopSignals.watch([&service] {
+    const TerminationSignals stopSignals([&service] {
         service.stop();
         korat::report("sent %llu messages", static_cast<unsigned long long>(service.sent()));
         QCoreApplication::exit(0);
@@ -34,7 +34,6 @@ int serve(const orvex::korat::Options& options, orvex::korat::SignalWatcher& sto
 int main(int argc, char** argv)
 {
     const QCoreApplication application(argc, argv);
-    orvex::korat::SignalWatcher stopSignals;
     const auto log = orvex::makeLinuxSystemLog("koratd");
     orvex::SystemLog::install(log.get());
     orvex::installFatalErrorHandler();
@@ -42,7 +41,7 @@ int main(int argc, char** argv)
     const auto result = orvex::korat::optionsFromArguments({argv, argv + argc});
     int status = EXIT_SUCCESS;
     if (result.options) {
-        status = serve(*result.options, stopSignals);
+        status = serve(*result.options);
     } else if (result.error.empty()) {
         std::fputs(result.text.c_str(), stdout);
     } else {
