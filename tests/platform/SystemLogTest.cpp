@@ -65,26 +65,31 @@ TEST(LinuxSystemLogDeathTest, StandardErrorGetsLines)
 
 TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
 {
+    std::promise<void> stuck;
     std::promise<void> go;
-    std::shared_future<void> gone = go.get_future();
     std::vector<std::string> written;
+    constexpr std::size_t kWritten = 20'000;
     {
         QueuedSystemLog log([&](const QueuedSystemLog::Lines& lines) {
-            gone.wait();
+            if (written.empty()) {
+                stuck.set_value();
+                go.get_future().wait();
+            }
             for (const auto& line : lines)
                 written.push_back(line.text);
         });
-        // The writer holds at most what it took before it got stuck; the rest has to fit the queue.
-        for (int i = 0; i < 20'000; ++i)
+        // The writer is stuck with the first line; of the others those are kept that fit the queue.
+        log.write(Priority::notice, "0");
+        stuck.get_future().wait();
+        for (std::size_t i = 1; i < kWritten; ++i)
             log.write(Priority::notice, std::to_string(i));
         go.set_value();
         log.flush();
-        EXPECT_GE(written.size(), QueuedSystemLog::kMostLines);
-        EXPECT_LE(written.size(), 2 * QueuedSystemLog::kMostLines + 1);
-        const auto lines = written.size() - 1;
-        EXPECT_EQ(written.back(), std::to_string(20'000 - lines) + " log lines were dropped");
-        for (std::size_t i = 0; i < lines; ++i)
+        constexpr std::size_t kKept = 1 + QueuedSystemLog::kMostLines;
+        ASSERT_EQ(written.size(), kKept + 1);
+        for (std::size_t i = 0; i < kKept; ++i)
             ASSERT_EQ(written[i], std::to_string(i));
+        EXPECT_EQ(written.back(), std::to_string(kWritten - kKept) + " log lines were dropped");
         log.write(Priority::notice, "at the end");
     }
     EXPECT_EQ(written.back(), "at the end") << "the destructor writes what is queued";
