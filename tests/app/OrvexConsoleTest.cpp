@@ -22,13 +22,12 @@ public:
     std::string written;
 };
 
-class OrvexConsoleTest : public testing::Test, public SessionFixture {
-protected:
+struct OrvexConsoleTest : testing::Test, SessionFixture {
     RecordingOutput output;
     OrvexConsole console{platform(), output};
 };
 
-constexpr const char* kBlock = "\nUpdated 2023-11-14 at 22:13:20\n"
+constexpr const char* kBlock = "\nUpdated 2023-11-15 at 00:13:20\n"
                                "Orvex\n"
                                "  Neighbor Measurements\n"
                                "    Version: 3\n"
@@ -72,7 +71,7 @@ TEST_F(OrvexConsoleTest, RedrawsATerminalInPlace)
     deliverNeighbors(0);
     refresh();
     EXPECT_EQ(output.take(),
-        "\x1b[HUpdated 2023-11-14 \xe2\x80\xa6\x1b[K\n"
+        "\x1b[HUpdated 2023-11-15 \xe2\x80\xa6\x1b[K\n"
         "Orvex\x1b[K\n"
         "  Neighbor Measurem\xe2\x80\xa6\x1b[K\n"
         "    Version: 3\x1b[K\n"
@@ -82,41 +81,28 @@ TEST_F(OrvexConsoleTest, RedrawsATerminalInPlace)
 
 TEST(TerminalFrame, FillsColumnsDownwardsAndSaysWhatIsMissing)
 {
-    Lines body;
-    for (int i = 1; i <= 7; ++i)
-        body.push_back("line " + std::to_string(i));
-    const std::string line1 = "line 1" + std::string(40, ' ') + "  ";
-    const struct {
-        const char* name;
-        TerminalSize size;
-        Lines frame;
-    } cases[] = {
-        {"high enough", {200, 9},
-            {"S", "line 1", "line 2", "line 3", "line 4", "line 5", "line 6", "line 7"}},
-        {"two columns", {94, 6},
-            {"S", line1 + "line 5", "line 2" + line1.substr(6) + "line 6",
-                "line 3" + line1.substr(6) + "line 7", "line 4"}},
-        {"a column short", {93, 6}, {"S", "line 1", "line 2", "line 3", "... 4 more lines"}},
-        {"hardly a terminal", {7, 1}, {"S", "... 7 \xe2\x80\xa6"}},
+    const Lines body = {"1", "2", "3", "4", "5", "6", "7"};
+    const std::string gap(47, ' ');
+    const std::tuple<TerminalSize, Lines> cases[] = {
+        {{200, 9}, {"S", "1", "2", "3", "4", "5", "6", "7"}},
+        {{94, 6}, {"S", "1" + gap + "5", "2" + gap + "6", "3" + gap + "7", "4"}},
+        {{93, 6}, {"S", "1", "2", "3", "... 4 more lines"}},
+        {{7, 1}, {"S", "... 7 \xe2\x80\xa6"}},
     };
-    for (const auto& test : cases) {
-        SCOPED_TRACE(test.name);
-        EXPECT_EQ(terminalFrame("S", body, test.size), test.frame);
-    }
+    for (const auto& [size, frame] : cases)
+        EXPECT_EQ(terminalFrame("S", body, size), frame) << size.columns << " columns";
 }
 
 TEST(TerminalFrame, CutsTextsByTheCellsTheyTake)
 {
-    const std::string former = std::setlocale(LC_CTYPE, nullptr);
     ASSERT_NE(std::setlocale(LC_CTYPE, "C.UTF-8"), nullptr);
     EXPECT_EQ(fittedToCells("abcdef", 6, false), "abcdef");
     EXPECT_EQ(fittedToCells("abcdef", 5, false), "abcd\xe2\x80\xa6");
     EXPECT_EQ(fittedToCells("caf\xc3\xa9", 6, true), "caf\xc3\xa9  ");
-    EXPECT_EQ(
-        fittedToCells("\xe4\xb8\xad\xe5\x9b\xbd", 4, true), "\xe4\xb8\xad\xe5\x9b\xbd"); // two cells each
+    // Two cells each.
+    EXPECT_EQ(fittedToCells("\xe4\xb8\xad\xe5\x9b\xbd", 4, true), "\xe4\xb8\xad\xe5\x9b\xbd");
     EXPECT_EQ(fittedToCells("\xe4\xb8\xad\xe5\x9b\xbd", 3, true), "\xe4\xb8\xad\xe2\x80\xa6");
     EXPECT_EQ(fittedToCells("ab", 0, true), "");
-    std::setlocale(LC_CTYPE, former.c_str());
 }
 
 } // namespace

@@ -22,12 +22,6 @@ struct Tree {
     {
     }
 
-    OrvexModelNodeRef at(const std::string& path) const
-    {
-        const auto found = byPath.find(path);
-        return found == byPath.end() ? nullptr : found->second;
-    }
-
     NodesByPath byPath;
     OrvexModelNodeRef root;
 };
@@ -92,7 +86,10 @@ protected:
     }
     void reload(const Tree& tree)
     {
-        reloadPanes(*stack, tree.root, [&tree](const std::string& path) { return tree.at(path); });
+        reloadPanes(*stack, tree.root, [&tree](const std::string& path) {
+            const auto found = tree.byPath.find(path);
+            return found == tree.byPath.end() ? nullptr : found->second;
+        });
     }
     OrvexPaneController& top() const { return static_cast<OrvexPaneController&>(stack->topScreen()); }
     void key(Qt::Key pressed) const { QTest::keyClick(&top().tableList(), pressed); }

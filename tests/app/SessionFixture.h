@@ -21,8 +21,7 @@ class RecordingPreferences final : public Preferences {
 public:
     void setValue(const std::string& domain, const std::string& key, const Value& value) override
     {
-        const bool isFalse = value == Value(false);
-        done.push_back("set " + domain + " " + key + (isFalse ? " false" : " ?"));
+        done.push_back("set " + domain + " " + key + (value == Value(false) ? " false" : " ?"));
     }
     void synchronize(const std::string& domain) override { done.push_back("synchronize " + domain); }
     void postChanged(const std::string& domain, const std::string& key) override

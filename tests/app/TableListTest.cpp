@@ -3,14 +3,11 @@
 #include "SidewaysScrollView.h"
 
 #include <QApplication>
-#include <QElapsedTimer>
-#include <QPixmap>
 #include <QScroller>
 #include <QTest>
 #include <QWheelEvent>
 
 #include <gtest/gtest.h>
-#include <set>
 
 namespace orvex::test {
 namespace {
@@ -40,19 +37,17 @@ public:
     int numberOfRows(const TableList&) const override { return count; }
     std::unique_ptr<TableCell> cellForRow(TableList& list, int row) override
     {
-        const std::string identifier = identifierOf ? identifierOf(row) : "cell";
+        const std::string identifier = row % 2 == 0 ? "even" : "odd";
         auto cell = list.dequeueReusableCell(identifier);
-        if (!cell) {
-            ++made;
-            cell = std::make_unique<WideCell>(identifier);
-        }
-        return cell;
+        if (cell)
+            return cell;
+        ++made;
+        return std::make_unique<WideCell>(identifier);
     }
     void didSelectRow(TableList&, std::optional<int> row) override { opened.push_back(row.value_or(-1)); }
 
     int count = 100;
     int made = 0;
-    std::function<std::string(int)> identifierOf;
     std::vector<int> opened;
 };
 
@@ -88,15 +83,19 @@ protected:
     TableList list{rows, nullptr};
 };
 
-TEST_F(TableListTest, OnlyTheRowsInViewHaveCells)
+TEST_F(TableListTest, OnlyTheRowsInViewHaveCellsWhateverItsSize)
 {
-    EXPECT_EQ(rows.made, 10);
     EXPECT_EQ(list.cellAtRow(10), nullptr);
     for (int offset = 0; offset <= list.maximumOffset(); offset += 30)
         list.setContentOffset(offset);
-    EXPECT_EQ(rows.made, 11); // between two whole rows eleven are in view
-    EXPECT_EQ(list.contentOffset() / 44, 90);
+    EXPECT_EQ(rows.made, 12); // between two whole rows eleven are in view, six of them of one kind
     EXPECT_EQ(list.cellAtRow(95)->geometry(), QRect(0, 95 * 44 - list.contentOffset(), 300, 44));
+
+    list.setContentOffset(list.maximumOffset());
+    list.resize(500, 660);
+    EXPECT_EQ(list.contentOffset(), 100 * 44 - 660);
+    for (int row = 85; row < 100; ++row)
+        EXPECT_EQ(list.cellAtRow(row)->width(), 500);
 }
 
 TEST_F(TableListTest, ReloadingHandsEachRowItsOwnCell)
@@ -114,20 +113,13 @@ TEST_F(TableListTest, ReloadingHandsEachRowItsOwnCell)
     EXPECT_EQ(rows.made, 11);
 }
 
-TEST_F(TableListTest, ACellIsReusedUnderItsIdentifierOnlyAndInTheOrderInWhichItLeft)
+TEST_F(TableListTest, ACellIsReusedUnderItsIdentifierOnlyAndWithoutItsSidewaysPlace)
 {
-    rows.identifierOf = [](int row) { return row % 2 == 0 ? "even" : "odd"; };
-    rows.made = 0;
-    list.reloadData();
-    EXPECT_EQ(rows.made, 10);
-    TableCell* const row0 = list.cellAtRow(0);
-    TableCell* const row1 = list.cellAtRow(1);
-    TableCell* const row2 = list.cellAtRow(2);
+    list.cellAtRow(0)->sidewaysScrollView()->setOffset(70);
+    const std::vector<TableCell*> before = {list.cellAtRow(0), list.cellAtRow(1), list.cellAtRow(2)};
     list.setContentOffset(4 * 44);
-    EXPECT_EQ(list.cellAtRow(10), row0);
-    EXPECT_EQ(list.cellAtRow(11), row1);
-    EXPECT_EQ(list.cellAtRow(12), row2);
-    EXPECT_EQ(rows.made, 10);
+    EXPECT_EQ((std::vector{list.cellAtRow(10), list.cellAtRow(11), list.cellAtRow(12)}), before);
+    EXPECT_EQ(sidewaysAt(10), 0);
 }
 
 TEST_F(TableListTest, ReloadingKeepsThePlaceAsFarAsItExists)
@@ -137,45 +129,36 @@ TEST_F(TableListTest, ReloadingKeepsThePlaceAsFarAsItExists)
     list.reloadData();
     EXPECT_EQ(list.contentOffset(), 1000);
     EXPECT_TRUE(list.cellAtRow(24)->isHighlighted());
-    rows.count = 20;
-    list.reloadData();
-    EXPECT_EQ(list.contentOffset(), 20 * 44 - 440);
-    EXPECT_EQ(list.selectedRow(), std::nullopt);
-    rows.count = 0;
-    list.reloadData();
-    EXPECT_EQ(list.contentOffset(), 0);
+    for (const auto& [count, offset] : {std::pair(20, 20 * 44 - 440), std::pair(0, 0)}) {
+        rows.count = count;
+        list.reloadData();
+        EXPECT_EQ(list.contentOffset(), offset);
+        EXPECT_EQ(list.selectedRow(), std::nullopt);
+    }
     EXPECT_EQ(list.cellAtRow(0), nullptr);
-    for (const int key : {Qt::Key_Down, Qt::Key_End, Qt::Key_Return})
-        QTest::keyClick(&list, static_cast<Qt::Key>(key));
+    for (const auto key : {Qt::Key_Down, Qt::Key_End, Qt::Key_Return})
+        QTest::keyClick(&list, key);
     EXPECT_EQ(list.selectedRow(), std::nullopt);
 }
 
 TEST_F(TableListTest, ATapOpensAndADragDoesNot)
 {
-    QTest::mouseClick(&list, Qt::LeftButton, {}, {50, 100});
-    EXPECT_EQ(rows.opened, std::vector{2});
-    EXPECT_EQ(list.selectedRow(), 2);
-    drag({50, 300}, {0, -200});
-    QTest::mouseClick(&list, Qt::RightButton, {}, {50, 100});
-    EXPECT_EQ(rows.opened, std::vector{2});
-
     rows.count = 3;
     list.reloadData();
+    QTest::mouseClick(&list, Qt::LeftButton, {}, {50, 100});
     QTest::mouseClick(&list, Qt::LeftButton, {}, {50, 400}); // below the last row
-    EXPECT_EQ(rows.opened, (std::vector{2, -1}));
+    QTest::mouseClick(&list, Qt::RightButton, {}, {50, 20});
     EXPECT_EQ(list.selectedRow(), 2);
-}
 
-TEST_F(TableListTest, APressHighlightsUntilItBecomesADrag)
-{
-    QTest::mousePress(&list, Qt::LeftButton, {}, {50, 100});
-    EXPECT_TRUE(list.cellAtRow(2)->isHighlighted());
+    rows.count = 100;
     list.reloadData();
-    EXPECT_TRUE(list.cellAtRow(2)->isHighlighted());
-    QTest::mouseMove(&list, {50, 70}, 10);
-    EXPECT_FALSE(list.cellAtRow(2)->isHighlighted());
-    QTest::mouseRelease(&list, Qt::LeftButton, {}, {50, 70});
-    EXPECT_TRUE(rows.opened.empty());
+    QTest::mousePress(&list, Qt::LeftButton, {}, {50, 200});
+    list.reloadData();
+    EXPECT_TRUE(list.cellAtRow(4)->isHighlighted());
+    QTest::mouseMove(&list, {50, 170}, 10);
+    EXPECT_FALSE(list.cellAtRow(4)->isHighlighted());
+    QTest::mouseRelease(&list, Qt::LeftButton, {}, {50, 170});
+    EXPECT_EQ(rows.opened, (std::vector{2, -1}));
 }
 
 TEST_F(TableListTest, AGestureKeepsToTheAxisInWhichItBegan)
@@ -191,6 +174,7 @@ TEST_F(TableListTest, AGestureKeepsToTheAxisInWhichItBegan)
     EXPECT_EQ(sidewaysAt(11), 0);
     list.reloadData();
     EXPECT_NEAR(sidewaysAt(12), 150, 15);
+    EXPECT_TRUE(rows.opened.empty());
 }
 
 TEST_F(TableListTest, AFlingGoesOnAndAPressThatStopsItOpensNothing)
@@ -212,10 +196,7 @@ TEST_F(TableListTest, AFlingGoesOnAndAPressThatStopsItOpensNothing)
 TEST_F(TableListTest, TheWheelScrollsTheListAndSidewaysTheRowBelowIt)
 {
     wheel({0, -120}, {50, 100});
-    const int notch = list.contentOffset();
-    EXPECT_GT(notch, 0);
-    wheel({0, -240}, {50, 100});
-    EXPECT_EQ(list.contentOffset(), 3 * notch);
+    EXPECT_GT(list.contentOffset(), 0);
     wheel({0, 12000}, {50, 100});
     EXPECT_EQ(list.contentOffset(), 0);
     wheel({-120, 10}, {50, 100});
@@ -226,24 +207,13 @@ TEST_F(TableListTest, TheWheelScrollsTheListAndSidewaysTheRowBelowIt)
 
 TEST_F(TableListTest, KeysMoveTheSelectionThroughTheWholeList)
 {
-    const struct {
-        Qt::Key key;
-        int selected;
-    } cases[] = {
-        {Qt::Key_Down, 0},
-        {Qt::Key_Down, 1},
-        {Qt::Key_PageDown, 10},
-        {Qt::Key_Up, 9},
-        {Qt::Key_End, 99},
-        {Qt::Key_Down, 99},
-        {Qt::Key_PageUp, 90},
-        {Qt::Key_Home, 0},
-        {Qt::Key_Up, 0},
-    };
-    for (const auto& test : cases) {
-        QTest::keyClick(&list, test.key);
-        ASSERT_EQ(list.selectedRow(), test.selected);
-        const TableCell* const cell = list.cellAtRow(test.selected);
+    const std::pair<Qt::Key, int> cases[] = {{Qt::Key_Down, 0}, {Qt::Key_Down, 1}, {Qt::Key_PageDown, 10},
+        {Qt::Key_Up, 9}, {Qt::Key_End, 99}, {Qt::Key_Down, 99}, {Qt::Key_PageUp, 90}, {Qt::Key_Home, 0},
+        {Qt::Key_Up, 0}};
+    for (const auto& [key, row] : cases) {
+        QTest::keyClick(&list, key);
+        ASSERT_EQ(list.selectedRow(), row);
+        const TableCell* const cell = list.cellAtRow(row);
         ASSERT_NE(cell, nullptr);
         EXPECT_TRUE(list.rect().contains(cell->geometry()));
         EXPECT_TRUE(cell->isHighlighted());
@@ -258,24 +228,6 @@ TEST_F(TableListTest, KeysMoveTheSelectionThroughTheWholeList)
     list.deselectRow();
     QTest::keyClick(&list, Qt::Key_Down);
     EXPECT_EQ(list.selectedRow(), 1); // goes on from the row that was deselected
-}
-
-TEST_F(TableListTest, ARowThatTakesOverACellDoesNotTakeOverItsSidewaysPlace)
-{
-    list.cellAtRow(0)->sidewaysScrollView()->setOffset(70);
-    TableCell* const cell = list.cellAtRow(0);
-    list.setContentOffset(44);
-    ASSERT_EQ(list.cellAtRow(10), cell);
-    EXPECT_EQ(sidewaysAt(10), 0);
-}
-
-TEST_F(TableListTest, ResizingGivesAllRowsTheNewWidth)
-{
-    list.setContentOffset(list.maximumOffset());
-    list.resize(500, 660);
-    EXPECT_EQ(list.contentOffset(), 100 * 44 - 660);
-    for (int row = 85; row < 100; ++row)
-        EXPECT_EQ(list.cellAtRow(row)->width(), 500);
 }
 
 } // namespace
