@@ -152,6 +152,12 @@ void NavigationStack::showEvent(QShowEvent* event)
     if (!_rootHasAppeared) {
         _rootHasAppeared = true;
         topScreen().viewWillAppear(false);
+        // In a turn of its own: whoever shows the stack for the first time has yet to set up what it shows.
+        const auto announceRoot = [this] {
+            if (_delegate && count() == 1)
+                _delegate->willShowScreen(*this, topScreen(), false);
+        };
+        QMetaObject::invokeMethod(this, announceRoot, Qt::QueuedConnection);
     }
     QWidget::showEvent(event);
 }

@@ -18,7 +18,8 @@ public:
     class Delegate {
     public:
         virtual ~Delegate() = default;
-        // A push or a pop is about to bring the screen into view. Not called for the root of a new stack.
+        // The screen comes into view: by a push or a pop, or as the root of a stack that is shown for the
+        // first time, which is told in the next turn of the event loop.
         virtual void willShowScreen(NavigationStack& stack, Screen& screen, bool animated) = 0;
     };
 

@@ -47,7 +47,18 @@ TEST_F(OrvexAppTest, LaunchesBeforeItStartsTheSession)
     EXPECT_EQ(status(), "[busy] Connecting");
     runLoop.runPosted();
     EXPECT_EQ(telephony.localPortsCreated, 1);
-    EXPECT_EQ(status(), "[busy] Connecting"); // until the first data
+    EXPECT_EQ(status(), "[busy] Connecting");
+    QCoreApplication::processEvents(); // the stack tells of its root
+    EXPECT_EQ(status(), "Connecting...") << "connected, and nothing has arrived";
+}
+
+TEST_F(OrvexAppTest, SaysThatItConnectsWhileTheServiceIsAbsent)
+{
+    telephony.serviceIsAbsent = true;
+    app->applicationDidFinishLaunching();
+    runLoop.runPosted();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(status(), "[busy] Connecting...");
 }
 
 TEST_F(OrvexAppTest, SaysWhenItWasUpdatedAndLeavesAScreenWhoseRowIsGone)
