@@ -7,8 +7,6 @@
 #include "SectionFixture.h"
 
 #include <memory>
-#include <string>
-#include <vector>
 
 namespace orvex::test {
 
@@ -18,32 +16,21 @@ public:
     explicit Decoding(const char* technology)
     {
         installConsole([](std::string_view) {}); // some sections write a line for every packet
-        _resources.templates["LTE"] = Dictionary::make({
-            {"Serving Cell Info", Dictionary::make()},
-            {"Connected mode LTE Intra-frequency Measurement", Dictionary::make()},
-            {"Measured Neighbor Cells", Array::make()},
-            {"Detected Cells", Array::make()},
-            {"Serving Cell Measurements", Dictionary::make()},
-            {"Neighbor Measurements", Dictionary::make()},
-            {"Neighbor Cells List", Array::make()},
-            {"Reselection Candidates", Dictionary::make()},
-            {"Reselection Candidates List", Array::make()},
-            {"SIM Info", Dictionary::make()},
-            {"PDP Context Info", Array::make()},
-        });
-        _resources.templates["UTRAN"] = Dictionary::make({
-            {"RRC Info", Dictionary::make()},
-            {"Serving Cell Info", Dictionary::make()},
-            {"Neighbor Cell List", Array::make()},
-            {"GSM Neighbor Cell List", Array::make()},
-            {"TRCH BLER", Array::make()},
-            {"CCTRCH SIR", Array::make()},
-            {"PDP Context Info", Array::make()},
-            {"SIM Info", Dictionary::make()},
-        });
+        const auto dictionary = [] { return Dictionary::make(); };
+        const auto array = [] { return Array::make(); };
+        _resources.templates["LTE"] = Dictionary::make({{"Serving Cell Info", dictionary()},
+            {"Connected mode LTE Intra-frequency Measurement", dictionary()},
+            {"Measured Neighbor Cells", array()}, {"Detected Cells", array()},
+            {"Serving Cell Measurements", dictionary()}, {"Neighbor Measurements", dictionary()},
+            {"Neighbor Cells List", array()}, {"Reselection Candidates", dictionary()},
+            {"Reselection Candidates List", array()}, {"SIM Info", dictionary()},
+            {"PDP Context Info", array()}});
+        _resources.templates["UTRAN"] =
+            Dictionary::make({{"RRC Info", dictionary()}, {"Serving Cell Info", dictionary()},
+                {"Neighbor Cell List", array()}, {"GSM Neighbor Cell List", array()}, {"TRCH BLER", array()},
+                {"CCTRCH SIR", array()}, {"PDP Context Info", array()}, {"SIM Info", dictionary()}});
         _generator = LogGenerator::generatorFromTechnology(technology, {_resources, _clock, std::nullopt});
     }
-
     ~Decoding()
     {
         _generator.reset();
@@ -54,15 +41,14 @@ public:
 
     void feed(const Bytes& message) { _generator->updateState(*_state, message); }
 
-    Value section(const char* name) const { return (*(*_state)["Display"].dictionary())[name]; }
-
     // A section with rows as a list of one; a list section record by record.
     std::vector<RowTexts> rows(const char* name) const
     {
-        if (const auto dictionary = section(name).dictionary())
+        const Value section = (*(*_state)["Display"].dictionary())[name];
+        if (const auto dictionary = section.dictionary())
             return {rowsOf(dictionary)};
         std::vector<RowTexts> result;
-        if (const auto array = section(name).array()) {
+        if (const auto array = section.array()) {
             for (const Value& element : *array)
                 result.push_back(rowsOf(element.dictionary()));
         }

@@ -46,7 +46,7 @@ TEST(Subscription, TakesTheCodesThatTheCommandNames)
 TEST(GarbageSource, NothingOfItIsFatalToAGenerator)
 {
     for (const ScenarioEntry& entry : scenarioTable()) {
-        GarbageSource garbage(100, 5);
+        GarbageSource garbage(50, 5);
         test::Decoding decoding(entry.technology);
         const auto scenario = entry.make({});
         int changed = 0;
@@ -56,44 +56,24 @@ TEST(GarbageSource, NothingOfItIsFatalToAGenerator)
             changed += spoilt == message.bytes ? 0 : 1;
             ASSERT_NO_THROW(decoding.feed(spoilt)) << entry.technology << " message " << i;
         }
-        // A random log type may be the true one.
-        EXPECT_GT(changed, 19'900);
+        EXPECT_NEAR(changed, 10'000, 300);
     }
-}
-
-TEST(GarbageSource, TakesItsShare)
-{
-    const Bytes message(20, 1);
-    GarbageSource none(0, 1);
-    GarbageSource quarter(25, 1);
-    int changed = 0;
-    for (int i = 0; i < 10'000; ++i) {
-        ASSERT_EQ(none.pass(message), message);
-        changed += quarter.pass(message) == message ? 0 : 1;
-    }
-    EXPECT_NEAR(changed, 2500, 200);
 }
 
 TEST(GarbageSource, KnowsWhatReceiversReadAsPropertyLists)
 {
-    const auto message = [](std::uint8_t type, std::uint8_t low, std::uint8_t high, std::size_t length) {
-        Bytes bytes(length);
-        bytes[0] = type;
-        bytes[3] = low;
-        bytes[4] = high;
-        return bytes;
+    const auto isRead = [](Bytes bytes, std::size_t length) {
+        bytes.resize(length);
+        return isReadAsPropertyList(bytes);
     };
-    const auto prefixed = [](Bytes bytes) {
-        bytes.insert(bytes.begin(), {0x81, 0});
-        return bytes;
-    };
-    EXPECT_TRUE(isReadAsPropertyList(message(255, 2, 0, 13)));
-    EXPECT_TRUE(isReadAsPropertyList(prefixed(message(255, 0, 0, 11))));
-    EXPECT_FALSE(isReadAsPropertyList(message(255, 0, 0, 12)));
-    EXPECT_FALSE(isReadAsPropertyList(prefixed(message(255, 0, 0, 10))));
-    EXPECT_FALSE(isReadAsPropertyList(message(255, 3, 0, 40)));
-    EXPECT_FALSE(isReadAsPropertyList(message(255, 1, 1, 40)));
-    EXPECT_FALSE(isReadAsPropertyList(message(1, 0, 0, 40)));
+    const Bytes prefixed{0x81, 0, 255, 0, 0, 0};
+    EXPECT_TRUE(isRead({255, 0, 0, 2, 0}, 13));
+    EXPECT_TRUE(isRead(prefixed, 13));
+    EXPECT_FALSE(isRead({255, 0, 0, 0, 0}, 12));
+    EXPECT_FALSE(isRead(prefixed, 12));
+    EXPECT_FALSE(isRead({255, 0, 0, 3, 0}, 40));
+    EXPECT_FALSE(isRead({255, 0, 0, 1, 1}, 40));
+    EXPECT_FALSE(isRead({1, 0, 0, 0, 0}, 40));
 }
 
 } // namespace

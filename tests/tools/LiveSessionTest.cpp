@@ -5,8 +5,6 @@
 
 #include <gmock/gmock.h>
 
-#include <QRegularExpression>
-
 #include <set>
 
 namespace orvex::test {
@@ -17,52 +15,47 @@ using testing::Contains;
 using testing::HasSubstr;
 using testing::Not;
 
-// The monitor in a terminal.
 class ConsoleProgram : public Program {
 public:
     explicit ConsoleProgram(const ProgramFolder& folder)
         : Program(folder, ORVEX_PATH, {"--console"})
     {
     }
+
+    // What a row of a section has shown, each value once.
+    std::set<std::string> shown(const char* section, const char* row) const
+    {
+        std::set<std::string> values;
+        const QString start = QString("%1: ").arg(row);
+        bool isInside = false;
+        for (const QString& line : QString::fromStdString(output()).split('\n')) {
+            const QString text = line.trimmed();
+            if (isInside && text.startsWith(start)) {
+                values.insert(text.mid(start.size()).toStdString());
+                isInside = false;
+            } else if (text == section) {
+                isInside = true;
+            }
+        }
+        return values;
+    }
 };
 
-// What a row of a section has shown, each value once.
-std::set<std::string> shown(const Program& monitor, const char* section, const char* row)
+TEST(LiveSession, ValuesChange)
 {
-    const auto values = monitor.valuesOf(section, row);
-    return {values.begin(), values.end()};
-}
-
-struct LiveCase {
-    const char* technology;
-    const char* section;
-    const char* row;
-};
-
-void PrintTo(const LiveCase& each, std::ostream* stream)
-{
-    *stream << each.row;
-}
-
-class Live : public testing::TestWithParam<LiveCase> { };
-
-INSTANTIATE_TEST_SUITE_P(LiveSession, Live,
-    testing::Values(LiveCase{"MRL_LTE", "Serving Cell Measurements", "Measured RSRP"},
-        LiveCase{"MRL_UTRAN2", "Neighbor Cell List", "Filter RSCP"}),
-    [](const auto& each) { return std::string(each.param.technology); });
-
-TEST_P(Live, ValuesChange)
-{
-    const auto& [technology, section, row] = GetParam();
-    const ProgramFolder folder;
-    const KoratProgram korat(folder, {"--technology", technology});
-    ConsoleProgram monitor(folder);
-    EXPECT_TRUE(waitUntil([&, s = section, r = row] { return shown(monitor, s, r).size() >= 3; }, 20s));
-    EXPECT_THAT(monitor.output(), HasSubstr("Updated 2"));
-    EXPECT_THAT(monitor.valuesOf("SIM Info", "EF-MSISDN"), Contains("+0010155550142"));
-    EXPECT_THAT(monitor.valuesOf("PDP Context Info", "APN"), Contains("internet.example"));
-    EXPECT_THAT(monitor.output(), Not(HasSubstr("(unknown)")));
-    EXPECT_EQ(monitor.terminate(), 0);
+    for (const auto& [technology, section, row] :
+        {std::tuple("MRL_LTE", "Serving Cell Measurements", "Measured RSRP"),
+            std::tuple("MRL_UTRAN2", "Neighbor Cell List", "Filter RSCP")}) {
+        const ProgramFolder folder;
+        const KoratProgram korat(folder, {"--technology", technology});
+        ConsoleProgram monitor(folder);
+        EXPECT_TRUE(waitUntil([&, s = section, r = row] { return monitor.shown(s, r).size() >= 3; }, 20s));
+        EXPECT_THAT(monitor.output(), HasSubstr("Updated 2"));
+        EXPECT_THAT(monitor.shown("SIM Info", "EF-MSISDN"), Contains("+0010155550142"));
+        EXPECT_THAT(monitor.shown("PDP Context Info", "APN"), Contains("internet.example"));
+        EXPECT_THAT(monitor.output(), Not(HasSubstr("(unknown)")));
+        EXPECT_EQ(monitor.terminate(), 0);
+    }
 }
 
 TEST(LiveSession, AbsentServiceIsTriedAgainAfterFiveSeconds)
@@ -72,7 +65,6 @@ TEST(LiveSession, AbsentServiceIsTriedAgainAfterFiveSeconds)
     ASSERT_TRUE(monitor.waitForError("Could not create KoratServerConnection"));
     QElapsedTimer elapsed;
     elapsed.start();
-    EXPECT_TRUE(monitor.waitForError("Could not create the ports necessary"));
     EXPECT_TRUE(monitor.waitForOutput("Connecting..."));
     ASSERT_TRUE(monitor.waitForError("Could not create KoratServerConnection", 2));
     EXPECT_GE(elapsed.elapsed(), 4500);
@@ -99,47 +91,31 @@ TEST(LiveSession, ComesBackAfterTheServiceWasKilled)
     EXPECT_LE(elapsed.elapsed(), 3000); // at once, not after the five seconds of a failed start
     EXPECT_TRUE(monitor.waitForOutput("Connecting...", 2));
 
-    const auto before = shown(monitor, "Serving Cell Measurements", "Measured RSRP").size();
+    const auto before = monitor.shown("Serving Cell Measurements", "Measured RSRP").size();
     korat = std::make_unique<KoratProgram>(folder, QStringList{"--seed", "99"});
     EXPECT_TRUE(waitUntil(
-        [&] { return shown(monitor, "Serving Cell Measurements", "Measured RSRP").size() >= before + 2; },
+        [&] { return monitor.shown("Serving Cell Measurements", "Measured RSRP").size() >= before + 2; },
         20s));
     EXPECT_THAT(monitor.errors(), Not(HasSubstr("already exists")));
 }
 
-struct FaultCase {
-    const char* fault;
-    const char* line;
-};
-
-void PrintTo(const FaultCase& each, std::ostream* stream)
+TEST(LiveSession, AFaultIsLoggedAndLeavesTheMonitorConnecting)
 {
-    *stream << each.fault;
-}
-
-class Fault : public testing::TestWithParam<FaultCase> { };
-
-INSTANTIATE_TEST_SUITE_P(LiveSession, Fault,
-    testing::Values(FaultCase{"refuse-channel=35",
-                        "_KoratServerConnectionNetworkMonitorCreateLogChannel returns error: 35!"},
-        FaultCase{"null-port", "Could not create a log channel (Korat returned null port)!"},
-        FaultCase{"no-reply", " ***** No response to GetTechnology; cannot configure"},
-        FaultCase{"bad-reply", " ***** Could not parse reply to GetTechnology; cannot configure"},
-        FaultCase{"unknown-technology", "No log generator technology works"}),
-    [](const auto& each) {
-        QString name = each.param.fault;
-        return name.replace(QRegularExpression("[^a-z]"), "").toStdString();
-    });
-
-TEST_P(Fault, IsLoggedAndLeavesTheMonitorConnecting)
-{
-    const auto& [fault, line] = GetParam();
-    const ProgramFolder folder;
-    const KoratProgram korat(folder, {"--fault", fault});
-    ConsoleProgram monitor(folder);
-    EXPECT_TRUE(monitor.waitForError(line));
-    EXPECT_THAT(monitor.output(), Not(HasSubstr("Updated")));
-    EXPECT_EQ(monitor.terminate(), 0) << monitor.errors();
+    const std::pair<const char*, const char*> cases[] = {
+        {"refuse-channel=35", "_KoratServerConnectionNetworkMonitorCreateLogChannel returns error: 35!"},
+        {"null-port", "Could not create a log channel (Korat returned null port)!"},
+        {"no-reply", " ***** No response to GetTechnology; cannot configure"},
+        {"bad-reply", " ***** Could not parse reply to GetTechnology; cannot configure"},
+        {"unknown-technology", "No log generator technology works"},
+    };
+    for (const auto& [fault, line] : cases) {
+        const ProgramFolder folder;
+        const KoratProgram korat(folder, {"--fault", fault});
+        ConsoleProgram monitor(folder);
+        EXPECT_TRUE(monitor.waitForError(line)) << fault;
+        EXPECT_THAT(monitor.output(), Not(HasSubstr("Updated")));
+        EXPECT_EQ(monitor.terminate(), 0) << monitor.errors();
+    }
 }
 
 TEST(LiveSession, GarbageIsSurvived)

@@ -65,24 +65,6 @@ public:
     {
         return waitUntil([&] { return _errors.count(text) >= times; }, longest);
     }
-    // The first such row of a section, tree after tree.
-    std::vector<std::string> valuesOf(const char* section, const char* row) const
-    {
-        std::vector<std::string> values;
-        const QString start = QString("%1: ").arg(row);
-        bool isInside = false;
-        for (const QString& line : QString::fromUtf8(_output).split('\n')) {
-            const QString text = line.trimmed();
-            if (isInside && text.startsWith(start)) {
-                values.push_back(text.mid(start.size()).toStdString());
-                isInside = false;
-            } else if (text == section) {
-                isInside = true;
-            }
-        }
-        return values;
-    }
-
     // Stops it where it is, and lets it go on after a while, whatever the test does meanwhile.
     std::jthread freezeFor(std::chrono::milliseconds time)
     {
