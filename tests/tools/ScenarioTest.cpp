@@ -68,6 +68,19 @@ TEST(EveryScenario, StampsItsMessagesInOrder)
     }
 }
 
+Value extraOf(const Bytes& bytes)
+{
+    const auto parsed = propertyListFromData(std::span(bytes).subspan(13));
+    EXPECT_TRUE(parsed.value) << parsed.error;
+    return parsed.value.value_or(Value());
+}
+
+void expectTexts(const Value& dictionary)
+{
+    for (const auto& [key, value] : *dictionary.dictionary())
+        EXPECT_TRUE(value.string()) << key;
+}
+
 // What is seen on a drive: the least and the most of each measure, and all values of others.
 class Drive {
 public:
@@ -149,15 +162,20 @@ void Drive::note(const LogMessage& message)
             [this](const auto& channel) { note("SIR", channel.sir(5)); });
         break;
     }
-    case kSimFilesCode:
-    case kPDPContextsCode: break;
-    default:
-        if (message.code >= kExtraCodes) {
-            const auto cells = propertyListFromData(std::span(bytes).subspan(13)).value->array();
-            const auto serving = (*cells)[0].dictionary();
-            EXPECT_EQ((*serving)["CellType"], Value("Serving"));
-            EXPECT_TRUE((*serving)["UARFCN"].integer());
-        }
+    case kSimFilesCode: expectTexts(extraOf(bytes)); break;
+    case kPDPContextsCode: {
+        const auto contexts = extraOf(bytes).array();
+        for (const Value& context : *contexts)
+            expectTexts(context);
+        break;
+    }
+    case kCellMonitorCode: {
+        const auto serving = (*extraOf(bytes).array())[0].dictionary();
+        EXPECT_EQ((*serving)["CellType"], Value("Serving"));
+        EXPECT_TRUE((*serving)["UARFCN"].integer());
+        break;
+    }
+    default: break;
     }
 }
 
