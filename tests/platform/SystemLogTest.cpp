@@ -15,10 +15,6 @@
 
 #include <unistd.h>
 
-namespace {
-std::vector<std::string> theSyslog;
-}
-
 // In the place of the C library's, to see what reaches it.
 extern "C" [[gnu::format(printf, 2, 3)]] void syslog(int priority, const char* format, ...);
 
@@ -29,38 +25,35 @@ void syslog(int priority, const char* format, ...)
     va_start(arguments, format);
     orvex::formatInto(line, format, arguments);
     va_end(arguments);
-    theSyslog.push_back(std::to_string(priority) + ' ' + line);
+    std::fprintf(stderr, "syslog %d %s", priority, line.c_str());
 }
 
 namespace orvex {
 namespace {
 
-using test::Environment;
-using testing::ElementsAre;
+using test::setEnvironment;
 
-TEST(LinuxSystemLog, SyslogGetsThePriorityAsItIs)
+// Ends the process, well unless the writing does not.
+void writeTo(const char* destination, const std::function<void(SystemLog&)>& write)
 {
-    const Environment destination("ORVEX_LOG", nullptr);
+    setEnvironment("ORVEX_LOG", destination);
     const auto log = makeLinuxSystemLog("test");
-    log->write(Priority::error, "one");
-    log->write(Priority::dlfFailure, "100% %s\n");
+    SystemLog::install(log.get());
+    write(*log);
     log->flush();
-    EXPECT_THAT(theSyslog, ElementsAre("3 one", "16 100% %s\n"));
+    _exit(0);
 }
 
-TEST(LinuxSystemLogDeathTest, StandardErrorGetsLines)
+TEST(LinuxSystemLogDeathTest, SyslogGetsThePriorityAsItIsAndStandardErrorGetsLines)
 {
-    EXPECT_EXIT(
-        {
-            const Environment destination("ORVEX_LOG", "stderr");
-            const auto log = makeLinuxSystemLog("test");
-            log->write(Priority::error, "one");
-            log->write(Priority::dlfFailure, "ends by itself\n");
-            log->write(Priority::notice, "");
-            log->flush();
-            _exit(0);
-        },
-        testing::ExitedWithCode(0), "^<3>one\n<16>ends by itself\n<5>\n$");
+    const auto write = [](SystemLog& log) {
+        log.write(Priority::error, "one");
+        log.write(Priority::dlfFailure, "100% %s\n");
+        log.write(Priority::notice, "");
+    };
+    const testing::ExitedWithCode well(0);
+    EXPECT_EXIT(writeTo(nullptr, write), well, "^syslog 3 onesyslog 16 100% %s\nsyslog 5 $");
+    EXPECT_EXIT(writeTo("stderr", write), well, "^<3>one\n<16>100% %s\n<5>\n$");
 }
 
 TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
@@ -98,36 +91,30 @@ TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
 TEST(FileSystemLog, KeepsEveryLineAndTellsOfAFullDisk)
 {
     const std::string path = testing::TempDir() + "orvex-file-log-" + std::to_string(getpid());
+    std::string expected = "<3>ends by itself\n";
     {
         FileSystemLog log(path);
-        for (int i = 0; i < 10'000; ++i)
-            log.write(i % 2 ? Priority::dlfFailure : Priority::warning, "line " + std::to_string(i));
         log.write(Priority::error, "ends by itself\n");
+        for (int i = 0; i < 10'000; ++i) {
+            log.write(Priority::dlfFailure, std::to_string(i));
+            expected += "<16>" + std::to_string(i) + '\n';
+        }
         log.flush();
         EXPECT_EQ(log.error(), "");
     }
-    std::string expected;
-    for (int i = 0; i < 10'000; ++i)
-        expected += (i % 2 ? "<16>line " : "<4>line ") + std::to_string(i) + '\n';
     std::ifstream file(path);
-    EXPECT_EQ(std::string(std::istreambuf_iterator<char>(file), {}), expected + "<3>ends by itself\n");
+    EXPECT_EQ(std::string(std::istreambuf_iterator<char>(file), {}), expected);
     unlink(path.c_str());
 
-    FileSystemLog full("/dev/full");
-    full.write(Priority::error, "x");
-    full.flush();
-    EXPECT_EQ(full.error(), "/dev/full: No space left on device");
-    FileSystemLog nowhere("/nowhere/at/all");
-    nowhere.write(Priority::error, "x");
-    nowhere.flush();
-    EXPECT_EQ(nowhere.error(), "/nowhere/at/all: No such file or directory");
+    const char* const faults[][2] = {
+        {"/dev/full", "No space left on device"}, {"/nowhere/at/all", "No such file or directory"}};
+    for (const auto& [bad, reason] : faults) {
+        FileSystemLog log(bad);
+        log.write(Priority::error, "x");
+        log.flush();
+        EXPECT_EQ(log.error(), text("%s: %s", bad, reason));
+    }
 }
-
-class LampError { };
-class RangeError : public std::runtime_error {
-public:
-    using std::runtime_error::runtime_error;
-};
 
 TEST(FatalErrorsDeathTest, LastLineSaysWhatWasThrown)
 {
@@ -135,22 +122,17 @@ TEST(FatalErrorsDeathTest, LastLineSaysWhatWasThrown)
         std::function<void()> fail;
         const char* line;
     } cases[] = {
-        {[] { throw RangeError("index 7 of 3"); },
-            "<3>Fatal: uncaught exception of type orvex::.*RangeError: index 7 of 3\n"},
-        {[] { throw LampError(); }, "<3>Fatal: uncaught exception of type orvex::.*LampError\n"},
+        {[] { throw std::out_of_range("index 7 of 3"); },
+            "<3>Fatal: uncaught exception of type std::out_of_range: index 7 of 3\n"},
         {[] { throw 7; }, "<3>Fatal: uncaught exception of type int\n"},
         {[] { std::terminate(); }, "<3>Fatal: terminated without an exception\n"},
     };
     for (const auto& test : cases) {
-        EXPECT_EXIT(
-            {
-                const Environment destination("ORVEX_LOG", "stderr");
-                const auto log = makeLinuxSystemLog("test");
-                SystemLog::install(log.get());
-                installFatalErrorHandler();
-                [&]() noexcept { test.fail(); }();
-            },
-            testing::KilledBySignal(SIGABRT), test.line);
+        const auto fail = [&](SystemLog&) noexcept {
+            installFatalErrorHandler();
+            test.fail();
+        };
+        EXPECT_EXIT(writeTo("stderr", fail), testing::KilledBySignal(SIGABRT), test.line);
     }
 }
 
