@@ -14,7 +14,7 @@ namespace orvex::test {
 namespace {
 
 class NavigationStackTest : public testing::Test {
-protected:
+public:
     NavigationStackTest()
     {
         stack.resize(300, 400);

@@ -48,6 +48,7 @@ inline OrvexPaneController& paneAt(const NavigationStack& stack, int index)
 inline std::vector<std::string> pathsOn(const NavigationStack& stack)
 {
     std::vector<std::string> paths;
+    paths.reserve(static_cast<std::size_t>(stack.count()));
     for (int index = 0; index < stack.count(); ++index)
         paths.push_back(paneAt(stack, index).path());
     return paths;

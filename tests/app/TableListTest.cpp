@@ -103,6 +103,7 @@ TEST_F(TableListTest, ReloadingHandsEachRowItsOwnCell)
     list.setContentOffset(20); // an eleventh cell
     list.setContentOffset(0);  // which now waits for reuse
     std::vector<TableCell*> before;
+    before.reserve(10);
     for (int row = 0; row < 10; ++row)
         before.push_back(list.cellAtRow(row));
     for (int time = 0; time < 3; ++time) {
