@@ -23,6 +23,20 @@ std::optional<std::int32_t> CellRecord::number(const char* key) const
     return static_cast<std::int32_t>(*entry);
 }
 
+void printServingCell(Rows& row, const CellRecord& cell, std::span<const CellEntry> entries)
+{
+    for (const CellEntry& entry : entries) {
+        const auto number = cell.number(entry.key);
+        if (!number) {
+            systemLog(Priority::error, "Serving Cell Info: Failed to retrieve %s\n", entry.nameInMessage);
+            continue;
+        }
+        row.print(entry.row, "%d", *number);
+        if (entry.otherRow)
+            row.print(entry.otherRow, "%d", *number);
+    }
+}
+
 std::optional<std::vector<CellRecord>> CellMonitorList::read(Packet packet)
 {
     const auto list = propertyListFromData(PacketReader(packet).from(kPacketHeaderLength).bytes());

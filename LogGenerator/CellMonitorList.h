@@ -1,11 +1,13 @@
 #pragma once
 
 #include "PacketReader.h"
+#include "Rows.h"
 
 #include "Array.h"
 #include "Dictionary.h"
 
 #include <optional>
+#include <span>
 #include <stdexcept>
 #include <vector>
 
@@ -27,6 +29,18 @@ public:
 private:
     DictionaryRef _record;
 };
+
+// A number of a cell record and where it is shown.
+struct CellEntry {
+    const char* key;
+    const char* row;
+    const char* nameInMessage;
+    const char* otherRow = nullptr; // shows the same number too; null when there is none
+};
+
+// Writes the rows of a serving cell's entries. An entry that is no number leaves its rows as they are, with
+// the log line "Serving Cell Info: Failed to retrieve NAME".
+void printServingCell(Rows& row, const CellRecord& cell, std::span<const CellEntry> entries);
 
 // The cell-monitor list (extra code 0xFF0001): a property list with an array of cell records from byte 13 on.
 class CellMonitorList {

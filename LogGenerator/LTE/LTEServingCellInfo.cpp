@@ -23,12 +23,6 @@ const char* bandwidthText(int resourceBlocks)
     return textFor(resourceBlocks, kBandwidths, "Unknown");
 }
 
-struct CellEntry {
-    const char* key;
-    const char* row;
-    const char* nameInMessage;
-};
-
 constexpr CellEntry kCellEntries[] = {
     {telephony::kCellTAC, "Tracking Area Code", "TAC"},
     {telephony::kCellID, "Cell Identity", "Cell ID"},
@@ -95,12 +89,7 @@ void LTEServingCellInfo::updateFromCellMonitorList(Packet packet) const
     if (serving == cells->end())
         return;
     Rows row = rows();
-    for (const CellEntry& entry : kCellEntries) {
-        if (const auto number = serving->number(entry.key))
-            row.print(entry.row, "%d", *number);
-        else
-            systemLog(Priority::error, "Serving Cell Info: Failed to retrieve %s\n", entry.nameInMessage);
-    }
+    printServingCell(row, *serving, kCellEntries);
 }
 
 } // namespace orvex

@@ -10,35 +10,14 @@ namespace orvex {
 
 namespace {
 
-struct CellEntry {
-    const char* key;
-    const char* row;
-    const char* otherRow; // null when there is none
-    const char* nameInMessage;
-};
-
 // The list has one UARFCN; it goes to both rows, over the two that the baseband tells apart.
 constexpr CellEntry kCellEntries[] = {
-    {telephony::kCellLAC, "Local Area Code", nullptr, "LAC"},
-    {telephony::kCellID, "Cell ID", nullptr, "Cell ID"},
-    {telephony::kCellBandInfo, "Freq Band Indicator", nullptr, "Freq Band Indicator"},
-    {telephony::kCellScramblingCode, "Cell Scrambling Code", nullptr, "Cell Scrambling Code"},
-    {telephony::kCellUARFCN, "Uplink UARFCN", "Downlink UARFCN", "UARFCN"},
+    {telephony::kCellLAC, "Local Area Code", "LAC"},
+    {telephony::kCellID, "Cell ID", "Cell ID"},
+    {telephony::kCellBandInfo, "Freq Band Indicator", "Freq Band Indicator"},
+    {telephony::kCellScramblingCode, "Cell Scrambling Code", "Cell Scrambling Code"},
+    {telephony::kCellUARFCN, "Uplink UARFCN", "UARFCN", "Downlink UARFCN"},
 };
-
-void applyServingCell(const CellRecord& cell, Rows& row)
-{
-    for (const CellEntry& entry : kCellEntries) {
-        const auto number = cell.number(entry.key);
-        if (!number) {
-            systemLog(Priority::error, "Serving Cell Info: Failed to retrieve %s\n", entry.nameInMessage);
-            continue;
-        }
-        row.print(entry.row, "%d", *number);
-        if (entry.otherRow)
-            row.print(entry.otherRow, "%d", *number);
-    }
-}
 
 } // namespace
 
@@ -78,7 +57,7 @@ void UTRANServingCellInfo::updateFromCellMonitorList(Packet packet) const
     Rows row = rows();
     for (const CellRecord& cell : *cells) {
         if (cell.is(telephony::kRadioUTRAN, telephony::kCellTypeServing))
-            applyServingCell(cell, row); // of several, the last one wins
+            printServingCell(row, cell, kCellEntries); // of several, the last one wins
     }
 }
 
