@@ -55,15 +55,21 @@ protected:
     // The two array operations on the bound array, if there is one.
     void clearSection() const;
     void replaceSection(const Array& with) const;
+    // A new array of what the maker makes of each record: row dictionaries, as a rule.
+    template <typename Records, typename Maker>
+    static ArrayRef listOf(const Records& records, Maker make)
+    {
+        auto list = Array::make();
+        for (const auto& record : records)
+            list->append(make(record));
+        return list;
+    }
     // Empties the bound array and fills it anew with one row dictionary a record.
     template <typename Records, typename RowMaker>
     void refillSection(const Records& records, RowMaker rowsOf) const
     {
         clearSection();
-        Array list;
-        for (const auto& record : records)
-            list.append(rowsOf(record));
-        replaceSection(list);
+        replaceSection(*listOf(records, rowsOf));
     }
 
     // "Received an unknown log message: %d"

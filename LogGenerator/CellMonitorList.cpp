@@ -5,9 +5,32 @@
 #include "TelephonyConstants.h"
 #include "TextFormat.h"
 
+#include <algorithm>
+#include <iterator>
 #include <utility>
 
 namespace orvex {
+
+namespace {
+
+constexpr std::int16_t kNotMeasured = 32767;
+
+void printNumber(Rows& row, const char* name, const CellEntry& entry, std::int32_t number)
+{
+    switch (entry.form) {
+    case CellNumber::whole: row.print(name, "%d", number); break;
+    case CellNumber::low16Bits: row.print(name, "%d", static_cast<std::uint16_t>(number)); break;
+    case CellNumber::level:
+        const auto steps = static_cast<std::int16_t>(number);
+        if (steps == kNotMeasured)
+            row.set(name, "");
+        else
+            row.print(name, "%d%s", steps * entry.unitsPerStep, entry.unit);
+        break;
+    }
+}
+
+} // namespace
 
 bool CellRecord::is(const char* radioAccessTechnology, const char* cellType) const
 {
@@ -23,36 +46,63 @@ std::optional<std::int32_t> CellRecord::number(const char* key) const
     return static_cast<std::int32_t>(*entry);
 }
 
-void printServingCell(Rows& row, const CellRecord& cell, std::span<const CellEntry> entries)
+void printCell(
+    Rows& row, const CellRecord& cell, std::span<const CellEntry> entries, const char* sectionInMessage)
 {
     for (const CellEntry& entry : entries) {
         const auto number = cell.number(entry.key);
         if (!number) {
-            systemLog(Priority::error, "Serving Cell Info: Failed to retrieve %s\n", entry.nameInMessage);
+            systemLog(Priority::error, "%s: Failed to retrieve %s\n", sectionInMessage, entry.nameInMessage);
             continue;
         }
-        row.print(entry.row, "%d", *number);
+        printNumber(row, entry.row, entry, *number);
         if (entry.otherRow)
-            row.print(entry.otherRow, "%d", *number);
+            printNumber(row, entry.otherRow, entry, *number);
     }
 }
 
-std::optional<std::vector<CellRecord>> CellMonitorList::read(Packet packet)
+CellMonitorList::CellMonitorList(Packet packet)
 {
     const auto list = propertyListFromData(PacketReader(packet).from(kPacketHeaderLength).bytes());
     if (!list.value) {
         systemLog(Priority::error, "Cell Info Array data could not be constructed");
-        return std::nullopt;
+        return;
     }
     const ArrayRef array = list.value->array();
     if (!array)
         throw WrongKindException(text("cell-monitor list is a %s", nameOf(list.value->kind())));
-    std::vector<CellRecord> records;
+    _isPresent = true;
     for (const Value& element : *array) {
         if (auto record = element.dictionary())
-            records.emplace_back(std::move(record));
+            _cells.emplace_back(std::move(record));
     }
-    return records;
+}
+
+bool CellMonitorList::isPresentOrReported() const
+{
+    if (!_isPresent)
+        systemLog(Priority::error, "Failed to get Cell Array\n");
+    return _isPresent;
+}
+
+const CellRecord* CellMonitorList::find(
+    std::initializer_list<const char*> radioAccessTechnologies, const char* cellType) const
+{
+    const auto isWanted = [&](const CellRecord& cell) {
+        return std::ranges::any_of(
+            radioAccessTechnologies, [&](const char* radio) { return cell.is(radio, cellType); });
+    };
+    const auto cell = std::ranges::find_if(_cells, isWanted);
+    return cell == _cells.end() ? nullptr : &*cell;
+}
+
+std::vector<CellRecord> CellMonitorList::findAll(
+    const char* radioAccessTechnology, const char* cellType) const
+{
+    std::vector<CellRecord> result;
+    std::ranges::copy_if(_cells, std::back_inserter(result),
+        [&](const CellRecord& cell) { return cell.is(radioAccessTechnology, cellType); });
+    return result;
 }
 
 } // namespace orvex

@@ -6,6 +6,7 @@
 #include "Array.h"
 #include "Dictionary.h"
 
+#include <initializer_list>
 #include <optional>
 #include <span>
 #include <stdexcept>
@@ -30,30 +31,57 @@ private:
     DictionaryRef _record;
 };
 
+// How a cell record's number is shown.
+enum class CellNumber {
+    whole,
+    low16Bits, // unsigned
+    level,     // the low 16 bits with sign; 32767 stands for not measured and is shown as an empty text
+};
+
 // A number of a cell record and where it is shown.
 struct CellEntry {
     const char* key;
     const char* row;
     const char* nameInMessage;
+    CellNumber form = CellNumber::whole;
+    const char* unit = "";          // of a level, the blank before it included
+    int unitsPerStep = 1;           // of a level
     const char* otherRow = nullptr; // shows the same number too; null when there is none
 };
 
-// Writes the rows of a serving cell's entries. An entry that is no number leaves its rows as they are, with
-// the log line "Serving Cell Info: Failed to retrieve NAME".
-void printServingCell(Rows& row, const CellRecord& cell, std::span<const CellEntry> entries);
+// Writes the rows of a cell's entries. An entry that is no number leaves its rows as they are, with the log
+// line "SECTION: Failed to retrieve NAME".
+void printCell(
+    Rows& row, const CellRecord& cell, std::span<const CellEntry> entries, const char* sectionInMessage);
 
 // The cell-monitor list (extra code 0xFF0001): a property list with an array of cell records from byte 13 on.
 class CellMonitorList {
 public:
+    static constexpr LogCode kCode = kExtraCodeCellMonitorList;
+    static constexpr std::size_t kMinimumLength = 0;
+
     // The list is a property list of another kind. Nobody catches it.
     class WrongKindException : public std::runtime_error {
     public:
         using std::runtime_error::runtime_error;
     };
 
-    // The records in order; an element that is no dictionary is skipped. Absent, after the log line
-    // "Cell Info Array data could not be constructed", when there is no property list.
-    static std::optional<std::vector<CellRecord>> read(Packet packet);
+    // Says "Cell Info Array data could not be constructed" in the log when there is no property list.
+    explicit CellMonitorList(Packet packet);
+
+    // False, after the log line "Failed to get Cell Array", when there was no property list.
+    bool isPresentOrReported() const;
+    // The records in order; an element that is no dictionary is left out.
+    const std::vector<CellRecord>& cells() const { return _cells; }
+    // The first cell of the type in one of the technologies; null when there is none.
+    const CellRecord* find(
+        std::initializer_list<const char*> radioAccessTechnologies, const char* cellType) const;
+    // All cells of the type in the technology.
+    std::vector<CellRecord> findAll(const char* radioAccessTechnology, const char* cellType) const;
+
+private:
+    bool _isPresent = false;
+    std::vector<CellRecord> _cells;
 };
 
 } // namespace orvex

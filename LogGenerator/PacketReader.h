@@ -45,6 +45,7 @@ public:
     std::uint8_t u8(std::size_t offset) const { return static_cast<std::uint8_t>(number<1>(offset)); }
     std::uint16_t u16(std::size_t offset) const { return static_cast<std::uint16_t>(number<2>(offset)); }
     std::uint32_t u32(std::size_t offset) const { return number<4>(offset); }
+    std::int8_t s8(std::size_t offset) const { return static_cast<std::int8_t>(u8(offset)); }
     std::int16_t s16(std::size_t offset) const { return static_cast<std::int16_t>(u16(offset)); }
     std::int32_t s32(std::size_t offset) const { return static_cast<std::int32_t>(u32(offset)); }
 

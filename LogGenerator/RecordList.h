@@ -3,10 +3,13 @@
 #include "ArrayOutOfBoundsException.h"
 #include "PacketReader.h"
 
+#include <algorithm>
+
 namespace orvex {
 
 // The repeated records of a packet: `count` of them, as the packet itself says, `stride` bytes apart from
-// `start` on. Record is made from a reader that begins at the record's first byte.
+// `start` on, each `width` bytes long (the stride where nothing else is said; some formats let one record
+// reach into the next). Record is made from a reader that begins at the record's first byte.
 //
 // Iterating ends at the last record that lies wholly inside the packet, whatever the count claims. Indexing
 // goes by the count alone: at or beyond it throws ArrayOutOfBoundsException, and fields of a record that the
@@ -15,14 +18,26 @@ template <typename Record>
 class RecordList {
 public:
     RecordList(PacketReader packet, std::size_t start, std::size_t stride, std::size_t count)
+        : RecordList(packet, start, stride, count, stride)
+    {
+    }
+    RecordList(
+        PacketReader packet, std::size_t start, std::size_t stride, std::size_t count, std::size_t width)
         : _packet(packet)
         , _start(start)
         , _stride(stride)
         , _count(count)
+        , _width(width)
     {
     }
 
     std::size_t count() const { return _count; }
+    // How many of them lie wholly inside the packet.
+    std::size_t countInside() const
+    {
+        const std::size_t available = _packet.from(_start).size();
+        return available < _width ? 0 : std::min(_count, (available - _width) / _stride + 1);
+    }
     Record operator[](std::size_t index) const
     {
         if (index >= _count)
@@ -55,16 +70,11 @@ public:
     Iterator end() const { return {*this, countInside()}; }
 
 private:
-    std::size_t countInside() const
-    {
-        const std::size_t available = _packet.from(_start).size() / _stride;
-        return available < _count ? available : _count;
-    }
-
     PacketReader _packet;
     std::size_t _start;
     std::size_t _stride;
     std::size_t _count;
+    std::size_t _width;
 };
 
 } // namespace orvex

@@ -3,7 +3,7 @@
 namespace orvex {
 
 ConnectedModeMeasurementMisc::ConnectedModeMeasurementMisc(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("Connected mode LTE Intra-frequency Measurement", dict, codeDict)
+    : PacketSection("Connected mode LTE Intra-frequency Measurement", dict, codeDict)
 {
 }
 

@@ -1,12 +1,12 @@
 #pragma once
 
 #include "LTE/LogCode_0xB179.h"
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 
 namespace orvex {
 
 // "Connected mode LTE Intra-frequency Measurement": the serving cell as measured in connected mode.
-class ConnectedModeMeasurementMisc final : public SingleCodeSection<LogCode_0xB179> {
+class ConnectedModeMeasurementMisc final : public PacketSection<LogCode_0xB179> {
 public:
     ConnectedModeMeasurementMisc(ClassDictionary& dict, CodeDictionary& codeDict);
 

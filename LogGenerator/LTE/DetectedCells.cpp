@@ -14,7 +14,7 @@ DictionaryRef rowsOf(const LogCode_0xB179::DetectedCell& cell)
 } // namespace
 
 DetectedCells::DetectedCells(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("Detected Cells", dict, codeDict)
+    : PacketSection("Detected Cells", dict, codeDict)
 {
 }
 

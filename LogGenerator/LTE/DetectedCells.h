@@ -1,12 +1,12 @@
 #pragma once
 
 #include "LTE/LogCode_0xB179.h"
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 
 namespace orvex {
 
 // "Detected Cells": cells found in connected mode but not measured, one row dictionary each.
-class DetectedCells final : public SingleCodeSection<LogCode_0xB179> {
+class DetectedCells final : public PacketSection<LogCode_0xB179> {
 public:
     DetectedCells(ClassDictionary& dict, CodeDictionary& codeDict);
 

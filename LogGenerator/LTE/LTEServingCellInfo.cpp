@@ -1,14 +1,8 @@
 #include "LTE/LTEServingCellInfo.h"
 
-#include "CellMonitorList.h"
 #include "EnumTable.h"
-#include "LTE/LogCode_0xB0C1.h"
-#include "LTE/LogCode_0xB0C2.h"
 
-#include "SystemLog.h"
 #include "TelephonyConstants.h"
-
-#include <algorithm>
 
 namespace orvex {
 
@@ -34,37 +28,21 @@ constexpr CellEntry kCellEntries[] = {
 } // namespace
 
 LTEServingCellInfo::LTEServingCellInfo(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("Serving Cell Info", {LogCode_0xB0C2::kCode, LogCode_0xB0C1::kCode, kExtraCodeCellMonitorList},
-        dict, codeDict)
+    : PacketSection("Serving Cell Info", {Priority::warning, "LTE Serving Cell Info"},
+        OtherCodes::areReported, dict, codeDict)
 {
 }
 
-void LTEServingCellInfo::updateWithData(Packet packet, LogCode logCode)
+void LTEServingCellInfo::update(const LogCode_0xB0C1& antennas)
 {
-    systemLog(Priority::warning, "LTE Serving Cell Info");
-    switch (logCode) {
-    case LogCode_0xB0C1::kCode: return updateFromAntennas(packet);
-    case LogCode_0xB0C2::kCode: return updateFromServingCell(packet);
-    case kExtraCodeCellMonitorList: return updateFromCellMonitorList(packet);
-    default: return reportUnknown(logCode);
-    }
-}
-
-void LTEServingCellInfo::updateFromAntennas(Packet packet) const
-{
-    if (packet.size() < LogCode_0xB0C1::kMinimumLength)
-        return;
-    rows().print("Num Tx Antennas", "%d", LogCode_0xB0C1(packet).transmitAntennas());
+    rows().print("Num Tx Antennas", "%d", antennas.transmitAntennas());
     // Decoded, and yet reported: the logs of this system have always had this line for every such packet,
     // and people's filters know it.
     reportUnknown(LogCode_0xB0C1::kCode);
 }
 
-void LTEServingCellInfo::updateFromServingCell(Packet packet) const
+void LTEServingCellInfo::update(const LogCode_0xB0C2& cell)
 {
-    if (packet.size() < LogCode_0xB0C2::kMinimumLength)
-        return;
-    const LogCode_0xB0C2 cell(packet);
     Rows row = rows();
     row.print("Physical Cell ID", "%d", cell.physicalCellIdentity());
     row.print("Download Frequency", "%d", cell.downlinkFrequency());
@@ -77,19 +55,13 @@ void LTEServingCellInfo::updateFromServingCell(Packet packet) const
     row.print("Freq Band Indicator", "%d", cell.frequencyBandIndicator());
 }
 
-void LTEServingCellInfo::updateFromCellMonitorList(Packet packet) const
+void LTEServingCellInfo::update(const CellMonitorList& list)
 {
-    const auto cells = CellMonitorList::read(packet);
-    if (!cells) {
-        systemLog(Priority::error, "Failed to get Cell Array\n");
-        return;
-    }
-    const auto serving = std::ranges::find_if(*cells,
-        [](const CellRecord& cell) { return cell.is(telephony::kRadioLTE, telephony::kCellTypeServing); });
-    if (serving == cells->end())
+    if (!list.isPresentOrReported())
         return;
     Rows row = rows();
-    printServingCell(row, *serving, kCellEntries);
+    if (const CellRecord* cell = list.find({telephony::kRadioLTE}, telephony::kCellTypeServing))
+        printCell(row, *cell, kCellEntries, "Serving Cell Info");
 }
 
 } // namespace orvex

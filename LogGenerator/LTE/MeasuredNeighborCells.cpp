@@ -16,7 +16,7 @@ DictionaryRef rowsOf(const LogCode_0xB179::MeasuredNeighbor& neighbor)
 } // namespace
 
 MeasuredNeighborCells::MeasuredNeighborCells(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("Measured Neighbor Cells", dict, codeDict)
+    : PacketSection("Measured Neighbor Cells", dict, codeDict)
 {
 }
 

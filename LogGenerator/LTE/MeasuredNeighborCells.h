@@ -1,13 +1,13 @@
 #pragma once
 
 #include "LTE/LogCode_0xB179.h"
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 
 namespace orvex {
 
 // "Measured Neighbor Cells": the intra-frequency neighbours measured in connected mode, one row dictionary
 // each.
-class MeasuredNeighborCells final : public SingleCodeSection<LogCode_0xB179> {
+class MeasuredNeighborCells final : public PacketSection<LogCode_0xB179> {
 public:
     MeasuredNeighborCells(ClassDictionary& dict, CodeDictionary& codeDict);
 

@@ -36,7 +36,7 @@ DictionaryRef rowsOf(const LogCode_0xB180::NeighborCell& cell)
 } // namespace
 
 NeighborCellsList::NeighborCellsList(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("Neighbor Cells List", dict, codeDict)
+    : PacketSection("Neighbor Cells List", dict, codeDict)
 {
 }
 

@@ -3,7 +3,7 @@
 namespace orvex {
 
 NeighborMeasurementMisc::NeighborMeasurementMisc(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("Neighbor Measurements", dict, codeDict)
+    : PacketSection("Neighbor Measurements", dict, codeDict)
 {
 }
 

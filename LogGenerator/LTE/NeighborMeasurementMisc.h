@@ -1,12 +1,12 @@
 #pragma once
 
 #include "LTE/LogCode_0xB180.h"
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 
 namespace orvex {
 
 // "Neighbor Measurements": what the idle-mode neighbour measurement says of its layer.
-class NeighborMeasurementMisc final : public SingleCodeSection<LogCode_0xB180> {
+class NeighborMeasurementMisc final : public PacketSection<LogCode_0xB180> {
 public:
     NeighborMeasurementMisc(ClassDictionary& dict, CodeDictionary& codeDict);
 

@@ -60,7 +60,7 @@ DictionaryRef rowsOf(const LogCode_0xB186::Candidate& candidate)
 } // namespace
 
 ReselectionCandidatesList::ReselectionCandidatesList(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("Reselection Candidates List", dict, codeDict)
+    : PacketSection("Reselection Candidates List", dict, codeDict)
 {
 }
 

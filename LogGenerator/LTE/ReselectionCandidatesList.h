@@ -1,13 +1,13 @@
 #pragma once
 
 #include "LTE/LogCode_0xB186.h"
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 
 namespace orvex {
 
 // "Reselection Candidates List": the cells of any radio technology considered for reselection, one row
 // dictionary each.
-class ReselectionCandidatesList final : public SingleCodeSection<LogCode_0xB186> {
+class ReselectionCandidatesList final : public PacketSection<LogCode_0xB186> {
 public:
     ReselectionCandidatesList(ClassDictionary& dict, CodeDictionary& codeDict);
 

@@ -3,7 +3,7 @@
 namespace orvex {
 
 ReselectionCandidatesMisc::ReselectionCandidatesMisc(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("Reselection Candidates", dict, codeDict)
+    : PacketSection("Reselection Candidates", dict, codeDict)
 {
 }
 

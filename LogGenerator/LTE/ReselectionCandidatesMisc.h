@@ -1,12 +1,12 @@
 #pragma once
 
 #include "LTE/LogCode_0xB186.h"
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 
 namespace orvex {
 
 // "Reselection Candidates": the serving cell from which reselection is considered.
-class ReselectionCandidatesMisc final : public SingleCodeSection<LogCode_0xB186> {
+class ReselectionCandidatesMisc final : public PacketSection<LogCode_0xB186> {
 public:
     ReselectionCandidatesMisc(ClassDictionary& dict, CodeDictionary& codeDict);
 

@@ -23,7 +23,7 @@ void printSearch(Rows& row, const char* name, int raw, const char* unit)
 } // namespace
 
 ServingCellMeasurement::ServingCellMeasurement(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("Serving Cell Measurements", dict, codeDict)
+    : PacketSection("Serving Cell Measurements", dict, codeDict)
 {
 }
 

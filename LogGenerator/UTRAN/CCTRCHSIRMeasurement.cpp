@@ -21,7 +21,7 @@ DictionaryRef rowsOf(const LogCode_0xD00C::CompositeChannel& channel)
 } // namespace
 
 CCTRCHSIRMeasurement::CCTRCHSIRMeasurement(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection(
+    : PacketSection(
         "CCTRCH SIR", {Priority::warning, "CCTRCH SIR Measurement"}, OtherCodes::areIgnored, dict, codeDict)
 {
 }

@@ -1,13 +1,13 @@
 #pragma once
 
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 #include "UTRAN/LogCode_0xD00C.h"
 
 namespace orvex {
 
 // "CCTRCH SIR": signal-to-interference ratios of the coded composite transport channels, one row dictionary
 // each.
-class CCTRCHSIRMeasurement final : public SingleCodeSection<LogCode_0xD00C> {
+class CCTRCHSIRMeasurement final : public PacketSection<LogCode_0xD00C> {
 public:
     CCTRCHSIRMeasurement(ClassDictionary& dict, CodeDictionary& codeDict);
 

@@ -20,7 +20,7 @@ DictionaryRef rowsOf(const LogCode_0xD00E::GSMNeighbor& neighbor)
 } // namespace
 
 GSMNeighbhorMeasurements::GSMNeighbhorMeasurements(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("GSM Neighbor Cell List", {Priority::warning, "GSM Neighbor Cell List"},
+    : PacketSection("GSM Neighbor Cell List", {Priority::warning, "GSM Neighbor Cell List"},
         OtherCodes::areIgnored, dict, codeDict)
 {
 }

@@ -1,13 +1,13 @@
 #pragma once
 
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 #include "UTRAN/LogCode_0xD00E.h"
 
 namespace orvex {
 
 // "GSM Neighbor Cell List": GSM neighbours seen from UTRAN. The list is built and never published: after
 // the first packet the section stays empty.
-class GSMNeighbhorMeasurements final : public SingleCodeSection<LogCode_0xD00E> {
+class GSMNeighbhorMeasurements final : public PacketSection<LogCode_0xD00E> {
 public:
     GSMNeighbhorMeasurements(ClassDictionary& dict, CodeDictionary& codeDict);
 

@@ -15,7 +15,7 @@ DictionaryRef rowsOf(const LogCode_0xD00C::TransportChannel& channel)
 } // namespace
 
 TRCHBLERMeasurement::TRCHBLERMeasurement(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection(
+    : PacketSection(
         "TRCH BLER", {Priority::notice, "TRCH BLER Measurement"}, OtherCodes::areIgnored, dict, codeDict)
 {
 }

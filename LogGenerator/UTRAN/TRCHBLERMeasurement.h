@@ -1,12 +1,12 @@
 #pragma once
 
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 #include "UTRAN/LogCode_0xD00C.h"
 
 namespace orvex {
 
 // "TRCH BLER": block error rates of the transport channels, one row dictionary each.
-class TRCHBLERMeasurement final : public SingleCodeSection<LogCode_0xD00C> {
+class TRCHBLERMeasurement final : public PacketSection<LogCode_0xD00C> {
 public:
     TRCHBLERMeasurement(ClassDictionary& dict, CodeDictionary& codeDict);
 

@@ -23,7 +23,7 @@ DictionaryRef rowsOf(const LogCode_0xD00A::Neighbor& neighbor)
 } // namespace
 
 UTRANNeighbhorMeasurements::UTRANNeighbhorMeasurements(ClassDictionary& dict, CodeDictionary& codeDict)
-    : SingleCodeSection("Neighbor Cell List", {Priority::warning, "NeighbhorMeasurements List"},
+    : PacketSection("Neighbor Cell List", {Priority::warning, "NeighbhorMeasurements List"},
         OtherCodes::areIgnored, dict, codeDict)
 {
 }

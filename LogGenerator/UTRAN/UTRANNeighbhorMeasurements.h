@@ -1,12 +1,12 @@
 #pragma once
 
-#include "SingleCodeSection.h"
+#include "PacketSection.h"
 #include "UTRAN/LogCode_0xD00A.h"
 
 namespace orvex {
 
 // "Neighbor Cell List": the intra-frequency neighbours, one row dictionary each.
-class UTRANNeighbhorMeasurements final : public SingleCodeSection<LogCode_0xD00A> {
+class UTRANNeighbhorMeasurements final : public PacketSection<LogCode_0xD00A> {
 public:
     UTRANNeighbhorMeasurements(ClassDictionary& dict, CodeDictionary& codeDict);
 

@@ -1,9 +1,5 @@
 #include "UTRAN/UTRANServingCellInfo.h"
 
-#include "CellMonitorList.h"
-#include "UTRAN/LogCode_0xD0E2.h"
-
-#include "SystemLog.h"
 #include "TelephonyConstants.h"
 
 namespace orvex {
@@ -16,30 +12,22 @@ constexpr CellEntry kCellEntries[] = {
     {telephony::kCellID, "Cell ID", "Cell ID"},
     {telephony::kCellBandInfo, "Freq Band Indicator", "Freq Band Indicator"},
     {telephony::kCellScramblingCode, "Cell Scrambling Code", "Cell Scrambling Code"},
-    {telephony::kCellUARFCN, "Uplink UARFCN", "UARFCN", "Downlink UARFCN"},
+    {.key = telephony::kCellUARFCN,
+        .row = "Uplink UARFCN",
+        .nameInMessage = "UARFCN",
+        .otherRow = "Downlink UARFCN"},
 };
 
 } // namespace
 
 UTRANServingCellInfo::UTRANServingCellInfo(ClassDictionary& dict, CodeDictionary& codeDict)
-    : Base("Serving Cell Info", {LogCode_0xD0E2::kCode, kExtraCodeCellMonitorList}, dict, codeDict)
+    : PacketSection(
+        "Serving Cell Info", {Priority::warning, "Serving Cell Info"}, OtherCodes::areIgnored, dict, codeDict)
 {
 }
 
-void UTRANServingCellInfo::updateWithData(Packet packet, LogCode logCode)
+void UTRANServingCellInfo::update(const LogCode_0xD0E2& cell)
 {
-    systemLog(Priority::warning, "Serving Cell Info");
-    if (logCode == LogCode_0xD0E2::kCode)
-        updateFromServingCell(packet);
-    else if (logCode == kExtraCodeCellMonitorList)
-        updateFromCellMonitorList(packet);
-}
-
-void UTRANServingCellInfo::updateFromServingCell(Packet packet) const
-{
-    if (packet.size() < LogCode_0xD0E2::kMinimumLength)
-        return;
-    const LogCode_0xD0E2 cell(packet);
     Rows row = rows();
     row.print("Cell Access Restrictions", "%d", cell.cellAccessRestrictions());
     row.print("Cell ID", "%d", cell.cellIdentity());
@@ -49,16 +37,11 @@ void UTRANServingCellInfo::updateFromServingCell(Packet packet) const
     row.set("Allowed Access", cell.isBarred() ? "Emergency Calls Only" : "All Calls");
 }
 
-void UTRANServingCellInfo::updateFromCellMonitorList(Packet packet) const
+void UTRANServingCellInfo::update(const CellMonitorList& list)
 {
-    const auto cells = CellMonitorList::read(packet);
-    if (!cells)
-        return;
     Rows row = rows();
-    for (const CellRecord& cell : *cells) {
-        if (cell.is(telephony::kRadioUTRAN, telephony::kCellTypeServing))
-            printServingCell(row, cell, kCellEntries); // of several, the last one wins
-    }
+    for (const CellRecord& cell : list.findAll(telephony::kRadioUTRAN, telephony::kCellTypeServing))
+        printCell(row, cell, kCellEntries, "Serving Cell Info"); // of several, the last one wins
 }
 
 } // namespace orvex

@@ -1,0 +1,78 @@
+#pragma once
+
+#include "Base.h"
+
+#include "SystemLog.h"
+
+namespace orvex {
+
+// The line that a section writes for every packet.
+struct EntryLine {
+    Priority priority;
+    const char* word;
+};
+
+enum class OtherCodes { areReported, areIgnored };
+
+// Takes the packets that one kind of payload reader reads.
+template <typename Reader>
+class PacketTaker {
+public:
+    PacketTaker() = default;
+    PacketTaker(const PacketTaker&) = delete;
+    PacketTaker& operator=(const PacketTaker&) = delete;
+
+    virtual void update(const Reader& report) = 0;
+
+protected:
+    ~PacketTaker() = default;
+};
+
+// A section that says which packets it takes by naming their payload readers, in the order of its log codes,
+// and has an update() for each. Packets of other codes, and packets below their reader's minimum length,
+// change nothing.
+template <typename... Readers>
+class PacketSection : public Base, protected PacketTaker<Readers>... {
+public:
+    void updateWithData(Packet packet, LogCode logCode) final
+    {
+        systemLog(_entryLine.priority, "%s", _entryLine.word);
+        const bool isTaken = (offer<Readers>(packet, logCode) || ...);
+        if (!isTaken && _otherCodes == OtherCodes::areReported)
+            reportUnknown(logCode);
+    }
+
+protected:
+    // Says its name for every packet and reports those of other codes.
+    PacketSection(const char* sectionName, ClassDictionary& dict, CodeDictionary& codeDict)
+        : PacketSection(
+            sectionName, {Priority::warning, sectionName}, OtherCodes::areReported, dict, codeDict)
+    {
+    }
+    PacketSection(const char* sectionName, EntryLine entryLine, OtherCodes otherCodes, ClassDictionary& dict,
+        CodeDictionary& codeDict)
+        : Base(sectionName, {Readers::kCode...}, dict, codeDict)
+        , _entryLine(entryLine)
+        , _otherCodes(otherCodes)
+    {
+    }
+
+private:
+    // False when the packet is of another code.
+    template <typename Reader>
+    bool offer(Packet packet, LogCode logCode)
+    {
+        if (logCode != Reader::kCode)
+            return false;
+        if (packet.size() >= Reader::kMinimumLength) {
+            PacketTaker<Reader>& taker = *this;
+            taker.update(Reader(packet));
+        }
+        return true;
+    }
+
+    EntryLine _entryLine;
+    OtherCodes _otherCodes;
+};
+
+} // namespace orvex
