@@ -1,5 +1,6 @@
 #include "LogGenerator.h"
 
+#include "GSM/MRL_GSMLogGenerator.h"
 #include "LTE/LTELogGenerator.h"
 #include "UTRAN/UTRANLogGenerator.h"
 
@@ -42,7 +43,7 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
     };
     static constexpr Choice kChoices[] = {
         {telephony::kTechnologyIFX, nullptr},
-        {telephony::kTechnologyMRL_GSM, nullptr},
+        {telephony::kTechnologyMRL_GSM, &MRL_GSMLogGenerator::generator},
         {telephony::kTechnologyMRL_CDMA, nullptr},
         {telephony::kTechnologyMRL_LTE, &LTELogGenerator::generator},
         {telephony::kTechnologyMRL_UTRAN2, &UTRANLogGenerator::generator},

@@ -1,4 +1,5 @@
 #include "LogGenerator.h"
+#include "GSM/MRL_GSMLogGenerator.h"
 #include "LTE/LTELogGenerator.h"
 #include "UTRAN/UTRANLogGenerator.h"
 
@@ -21,30 +22,42 @@ TEST(LogGenerator, ChoosesByTheTextOfTheTechnology)
     const GeneratorEnvironment environment{resources, clock, {}};
     const auto lte = LogGenerator::generatorFromTechnology(telephony::kTechnologyMRL_LTE, environment);
     EXPECT_NE(dynamic_cast<LTELogGenerator*>(lte.get()), nullptr);
+    const auto gsm = LogGenerator::generatorFromTechnology(telephony::kTechnologyMRL_GSM, environment);
+    EXPECT_NE(dynamic_cast<MRL_GSMLogGenerator*>(gsm.get()), nullptr);
     const auto utran = LogGenerator::generatorFromTechnology(telephony::kTechnologyMRL_UTRAN2, environment);
     EXPECT_NE(dynamic_cast<UTRANLogGenerator*>(utran.get()), nullptr);
     for (const Value& unknown : {Value("MRL_LTE "), Value("mrl_lte"), Value(""), Value(), Value(1)})
         EXPECT_EQ(LogGenerator::generatorFromTechnology(unknown, environment), nullptr);
 }
 
-TEST(LTELogGenerator, TellsOfItsBirthAndItsEnd)
+// What a generator with this many sections says from its birth to its end.
+template <typename Generator>
+void expectLife(const std::string& name, std::size_t sections, const std::string& indexName)
 {
+    using testing::StartsWith;
     const FixedResources resources;
     const FixedClock clock;
     RecordingLog log;
     std::vector<std::string> console;
     installConsole([&console](std::string_view line) { console.emplace_back(line); });
-    LTELogGenerator::generator({resources, clock, {}});
+    Generator::generator({resources, clock, {}});
     installConsole({});
-    const auto lines = log.take();
-    ASSERT_EQ(lines.size(), 17U);
-    EXPECT_EQ(lines[0], "<3>Creating LTELogGenerator object");
-    EXPECT_EQ(lines[1], "<4>Array Count: 3");
-    EXPECT_THAT(lines[12], testing::StartsWith("<3>Creating MRLLogGenerator2 object with 0x"));
-    EXPECT_EQ(lines[14], "<3>Class Index: 1");
-    EXPECT_THAT(lines[15], testing::StartsWith("<4>LTELogGenerator is destructed 0x"));
-    EXPECT_THAT(lines[16], testing::StartsWith("<4>MRL_GSMLogGenerator is destructed 0x"));
-    EXPECT_EQ(console, (std::vector<std::string>{"Deallocing LTEClassIndex", "Deallocing ClassIndex"}));
+
+    std::vector<testing::Matcher<std::string>> expected(
+        sections, testing::Matcher<std::string>(StartsWith("<4>Array Count: ")));
+    expected.insert(expected.begin(), "<3>Creating " + name + " object");
+    expected.insert(expected.end(),
+        {StartsWith("<3>Creating MRLLogGenerator2 object with 0x"), StartsWith("<4>Creating Log object: 0x"),
+            "<3>Class Index: 1", StartsWith("<4>" + name + " is destructed 0x"),
+            StartsWith("<4>MRL_GSMLogGenerator is destructed 0x")});
+    EXPECT_THAT(log.take(), testing::ElementsAreArray(expected));
+    EXPECT_EQ(console, (std::vector<std::string>{"Deallocing " + indexName, "Deallocing ClassIndex"}));
+}
+
+TEST(MarlinGenerators, TellOfTheirBirthAndTheirEnd)
+{
+    expectLife<LTELogGenerator>("LTELogGenerator", 11, "LTEClassIndex");
+    expectLife<MRL_GSMLogGenerator>("MRL_GSMLogGenerator", 26, "MRL_GSMClassIndex");
 }
 
 TEST(LogGenerator, HistoryKeepsTheNewestFive)

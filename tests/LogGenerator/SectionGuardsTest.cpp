@@ -1,5 +1,6 @@
 // What every section does with a packet that is not for it: too short, or of another code.
 
+#include "GSM/MRL_GSMClassIndex.h"
 #include "LTE/LTEClassIndex.h"
 #include "UTRAN/UTRANClassIndex.h"
 
@@ -45,6 +46,48 @@ const std::vector<Guard> kUTRAN = {
     {"SIM Info", kExtraCodeSimFiles, 0, "<4>SimInfo", OtherCode::isIgnored},
 };
 
+// Process CO goes by the name of Process CS in the log.
+const std::vector<Guard> kGSM = {
+    {"GPRS Information", 0x51F5, 18, "<4>GPRSInformation", OtherCode::isReported},
+    {"GPRS Information", 0x7135, 32, "<4>GPRSInformation", OtherCode::isReported},
+    {"GPRS Information", 0x51F6, 24, "<4>GPRSInformation", OtherCode::isReported},
+    {"GPRS Information", 0x51FB, 34, "<4>GPRSInformation", OtherCode::isReported},
+    {"GPRS Information", 0x51FD, 35, "<4>GPRSInformation", OtherCode::isReported},
+    {"GPRS Information", 0x51F4, 15, "<4>GPRSInformation", OtherCode::isReported},
+    {"GPRS Information", 0x5137, 29, "<4>GPRSInformation", OtherCode::isReported},
+    {"GSM Serving Cell", 0x5134, 26, "<4>GSMServingCell", OtherCode::isReported},
+    {"GSM Serving Cell", 0x5137, 29, "<4>GSMServingCell", OtherCode::isReported},
+    {"GSM Serving Cell", 0x5076, 17, "<4>GSMServingCell", OtherCode::isReported},
+    {"Mobile Allocation", 0x51F8, 15, "<4>MobileAllocation", OtherCode::isReported},
+    {"Neighboring Cells", 0x5137, 29, "<4>NeighboringCells", OtherCode::isReported},
+    {"Neighboring Cells", 0x51FF, 15, "<4>NeighboringCells", OtherCode::isReported},
+    {"GSM RR Info", 0x512C, 17, "<4>GSMRRInfo", OtherCode::isReported},
+    {"GSM RR Info", 0x5137, 29, "<4>GSMRRInfo", OtherCode::isReported},
+    {"GSM RR Info", 0x5072, 20, "<4>GSMRRInfo", OtherCode::isReported},
+    {"GSM RR Info", 0x51F6, 24, "<4>GSMRRInfo", OtherCode::isReported},
+    {"Active Set", 0x417A, 16, "<4>ActiveSet", OtherCode::isReported},
+    {"Detected Set", 0x417A, 16, "<4>DetectedSet", OtherCode::isReported},
+    {"Monitored Set", 0x417A, 16, "<4>MonitoredSet", OtherCode::isReported},
+    {"Virtual Active Set", 0x417A, 16, "<4>VirtualActiveSet", OtherCode::isReported},
+    {"UMTS Set", 0x4005, 15, "<4>UMTSSet", OtherCode::isReported},
+    {"GSM Set", 0x4005, 15, "<4>GSMSet", OtherCode::isReported},
+    {"Process CO", 0x7131, 16, "<4>ProcessCS", OtherCode::isReported},
+    {"Process CO", 0x7132, 16, "<4>ProcessCS", OtherCode::isReported},
+    {"Process CS", 0x7131, 16, "<4>ProcessCS", OtherCode::isReported},
+    {"Process CS", 0x7132, 16, "<4>ProcessCS", OtherCode::isReported},
+    {"Process PS", 0x7130, 16, "<4>ProcessPS", OtherCode::isReported},
+    {"Process PS", 0x7132, 16, "<4>ProcessPS", OtherCode::isReported},
+    {"Serving PLMN", 0x7135, 32, "<4>Serving PLMN", OtherCode::isReported},
+    {"Serving PLMN", 0x7132, 16, "<4>Serving PLMN", OtherCode::isReported},
+    {"Equivalent PLMN List", 0x7150, 17, "<4>Equivalent PLMN List", OtherCode::isReported},
+    {"UMTS RR Info", 0x4125, 14, "<4>UMTSRRInfo", OtherCode::isReported},
+    {"UMTS RR Info", 0x4031, 16, "<4>UMTSRRInfo", OtherCode::isReported},
+    {"UMTS RR Info", 0x4127, 29, "<4>UMTSRRInfo", OtherCode::isReported},
+    {"UMTS RR Info", 0x4157, 19, "<4>UMTSRRInfo", OtherCode::isReported},
+    {"BLER", 0x4116, 16, "<4>BLER", OtherCode::isReported},
+    {"HSDPA Info", 0x4221, 18, "<4>HSDPA Info", OtherCode::isIgnored},
+};
+
 using Lines = std::vector<std::string>;
 
 // The log lines of one packet, which must leave dictionary and array alone.
@@ -84,6 +127,7 @@ TEST(Section, RefusesPacketsThatAreNotForIt)
 {
     expectGuards(LTEClassIndex(), kLTE);
     expectGuards(UTRANClassIndex(), kUTRAN);
+    expectGuards(MRL_GSMClassIndex(), kGSM);
 }
 
 } // namespace

@@ -1,0 +1,32 @@
+#include "GSM/ActiveSet.h"
+
+#include <algorithm>
+
+namespace orvex {
+
+ActiveSet::ActiveSet(ClassDictionary& dict, CodeDictionary& codeDict)
+    : PacketSection("Active Set", {Priority::warning, "ActiveSet"}, OtherCodes::areReported, dict, codeDict)
+{
+}
+
+void ActiveSet::update(const LogCode_0x417A& report)
+{
+    clearSection();
+    const auto cells = report.cells();
+    const auto energies = report.energies();
+    Array list;
+    // A cell is shown when both its records are in the packet; its energies stand behind all cells.
+    for (std::size_t i = 0; i < std::min(cells.countInside(), energies.countInside()); ++i) {
+        if (!cells[i].isActive())
+            continue;
+        const int ecNo = lookUpECNO(energies[i].ecIo());
+        Rows row = Rows::make();
+        row.print("Scrambling Code", "%d", cells[i].primaryScramblingCode());
+        row.print("RSCP", "%d dB", report.rssi() + ecNo); // shown so, though it is dBm
+        row.print("Energy Per Chip", "%d dB", ecNo);
+        list.append(row.dictionary());
+    }
+    replaceSection(list);
+}
+
+} // namespace orvex

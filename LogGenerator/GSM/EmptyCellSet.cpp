@@ -1,0 +1,16 @@
+#include "GSM/EmptyCellSet.h"
+
+namespace orvex {
+
+EmptyCellSet::EmptyCellSet(
+    const char* sectionName, const char* entryWord, ClassDictionary& dict, CodeDictionary& codeDict)
+    : PacketSection(sectionName, {Priority::warning, entryWord}, OtherCodes::areReported, dict, codeDict)
+{
+}
+
+void EmptyCellSet::update(const LogCode_0x417A& /*report*/)
+{
+    clearSection();
+}
+
+} // namespace orvex

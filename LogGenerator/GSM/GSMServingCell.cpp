@@ -1,0 +1,52 @@
+#include "GSM/GSMServingCell.h"
+
+#include "TelephonyConstants.h"
+
+namespace orvex {
+
+namespace {
+
+constexpr CellEntry kCellEntries[] = {
+    {telephony::kCellID, "Cell ID", "Cell ID"},
+    {telephony::kCellARFCN, "ARFCN", "ARFCN"},
+};
+
+} // namespace
+
+GSMServingCell::GSMServingCell(ClassDictionary& dict, CodeDictionary& codeDict)
+    : PacketSection(
+        "GSM Serving Cell", {Priority::warning, "GSMServingCell"}, OtherCodes::areReported, dict, codeDict)
+{
+}
+
+void GSMServingCell::update(const LogCode_0x5134& report)
+{
+    Rows row = rows();
+    row.print("Cell ID", "%d", report.cellIdentity());
+    row.print("ARFCN", "%d", report.arfcn());
+    row.print("BSIC", "%d", report.bsic());
+}
+
+void GSMServingCell::update(const LogCode_0x5137& report)
+{
+    Rows row = rows();
+    row.print("RSSI", "%d dBm", report.receiveLevel()); // the bare byte: the sign has never been shown
+    row.print("C1 Value", "%d", report.c1());
+    row.print("C2 Value", "%d", report.c2());
+}
+
+void GSMServingCell::update(const LogCode_0x5076& report)
+{
+    rows().print("MA Dedicated ARFCN", "%d", report.arfcnLowByte());
+}
+
+void GSMServingCell::update(const CellMonitorList& list)
+{
+    if (!list.isPresentOrReported())
+        return;
+    Rows row = rows();
+    if (const CellRecord* cell = list.find({telephony::kRadioGSM}, telephony::kCellTypeServing))
+        printCell(row, *cell, kCellEntries, "GSMServingCell");
+}
+
+} // namespace orvex

@@ -1,0 +1,29 @@
+#include "GSM/GSMSet.h"
+
+namespace orvex {
+
+namespace {
+
+DictionaryRef rowsOf(const LogCode_0x4005::GSMCell& cell)
+{
+    Rows row = Rows::make();
+    row.print("ARFCN", "%d", cell.arfcn());
+    row.print("BSIC", "%d", cell.bsic());
+    row.print("RSSI", "%d dBm", cell.rssi());
+    row.print("Ranking Value", "%d", cell.rankingValue());
+    return row.dictionary();
+}
+
+} // namespace
+
+GSMSet::GSMSet(ClassDictionary& dict, CodeDictionary& codeDict)
+    : PacketSection("GSM Set", {Priority::warning, "GSMSet"}, OtherCodes::areReported, dict, codeDict)
+{
+}
+
+void GSMSet::update(const LogCode_0x4005& report)
+{
+    refillSection(report.gsmCells(), rowsOf);
+}
+
+} // namespace orvex

@@ -1,0 +1,41 @@
+#include "GSM/HSDPAInformation.h"
+
+#include "EnumTable.h"
+
+namespace orvex {
+
+namespace {
+
+constexpr EnumText kCarrierConfigurations[] = {
+    {0, "Single Carrier"}, {1, "MIMO"}, {2, "Dual Carrier"}, {3, "Reserved"}};
+
+DictionaryRef rowsOf(const LogCode_0x4221::Process& process)
+{
+    Rows row = Rows::make();
+    row.print("Process ID", "%u", process.identity());
+    row.print("No Rx Bits", "%u", process.receivedBits());
+    row.print("New Tx", "%u", process.newTransmissions());
+    row.print("Block Errors", "%u", process.blockErrors());
+    return row.dictionary();
+}
+
+} // namespace
+
+HSDPAInformation::HSDPAInformation(ClassDictionary& dict, CodeDictionary& codeDict)
+    : PacketSection("HSDPA Info", {Priority::warning, "HSDPA Info"}, OtherCodes::areIgnored, dict, codeDict)
+{
+}
+
+void HSDPAInformation::update(const LogCode_0x4221& report)
+{
+    Rows row = rows();
+    row.print("Version", "%u", report.version());
+    row.print("Sub Frames", "%u", report.subframes());
+    row.set("Carrier Info", textFor(report.carrierConfiguration(), kCarrierConfigurations, ""));
+    if (report.primaryProcesses().count() > 0)
+        row.set("Primary HARQ Process", listOf(report.primaryProcesses(), rowsOf));
+    if (report.secondaryProcesses().count() > 0)
+        row.set("Secondary HARQ Process", listOf(report.secondaryProcesses(), rowsOf));
+}
+
+} // namespace orvex

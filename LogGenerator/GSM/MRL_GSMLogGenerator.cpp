@@ -1,0 +1,33 @@
+#include "GSM/MRL_GSMLogGenerator.h"
+
+#include "GSM/MRL_GSMClassIndex.h"
+
+#include "SystemLog.h"
+
+namespace orvex {
+
+namespace {
+// Runs, and logs, before the generators below come into being.
+std::unique_ptr<ClassIndex> makeClassIndex()
+{
+    systemLog(Priority::error, "Creating MRL_GSMLogGenerator object");
+    return std::make_unique<MRL_GSMClassIndex>();
+}
+} // namespace
+
+std::unique_ptr<LogGenerator> MRL_GSMLogGenerator::generator(const GeneratorEnvironment& environment)
+{
+    return std::make_unique<MRL_GSMLogGenerator>(environment);
+}
+
+MRL_GSMLogGenerator::MRL_GSMLogGenerator(const GeneratorEnvironment& environment)
+    : MRLLogGenerator2(environment, "MRL_GSM", makeClassIndex())
+{
+}
+
+MRL_GSMLogGenerator::~MRL_GSMLogGenerator()
+{
+    systemLog(Priority::warning, "MRL_GSMLogGenerator is destructed %p", static_cast<const void*>(this));
+}
+
+} // namespace orvex

@@ -1,0 +1,19 @@
+#pragma once
+
+#include "GSM/LogCode_0x7131.h"
+#include "GSM/LogCode_0x7132.h"
+#include "PacketSection.h"
+
+namespace orvex {
+
+// "Process CO": registration and mobility management of the circuit-switched side in short.
+class ProcessCO final : public PacketSection<LogCode_0x7131, LogCode_0x7132> {
+public:
+    ProcessCO(ClassDictionary& dict, CodeDictionary& codeDict);
+
+protected:
+    void update(const LogCode_0x7131& report) override;
+    void update(const LogCode_0x7132& report) override;
+};
+
+} // namespace orvex

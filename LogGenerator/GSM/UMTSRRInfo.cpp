@@ -1,0 +1,79 @@
+#include "GSM/UMTSRRInfo.h"
+
+#include "EnumTable.h"
+
+#include "TelephonyConstants.h"
+
+#include <limits>
+
+namespace orvex {
+
+namespace {
+
+constexpr EnumText kStates[] = {{0, "Disconnected"}, {1, "Connecting"}, {2, "CELL_FACH"}, {3, "CELL_DCH"},
+    {4, "CELL_PCH"}, {5, "URA_PCH"}};
+
+constexpr CellEntry kCellEntries[] = {
+    {telephony::kCellID, "Cell ID", "Cell ID"},
+    {telephony::kCellUARFCN, "UARFCN", "UARFCN"},
+    {telephony::kCellScramblingCode, "Scrambling Code", "Scrambling Code"},
+};
+
+// Of the entries that have one. Not a number when none has: then nothing was sent, and a figure would lie.
+double averageTransmitPower(const LogCode_0x4031& report)
+{
+    double sum = 0;
+    int count = 0;
+    for (const auto& entry : report.entries()) {
+        if (const auto power = entry.transmitPower()) {
+            sum += *power;
+            ++count;
+        }
+    }
+    // 0/0 would do but for its sign, which shows on some machines.
+    return count ? sum / count : std::numeric_limits<double>::quiet_NaN();
+}
+
+} // namespace
+
+UMTSRRInfo::UMTSRRInfo(ClassDictionary& dict, CodeDictionary& codeDict)
+    : PacketSection(
+        "UMTS RR Info", {Priority::warning, "UMTSRRInfo"}, OtherCodes::areReported, dict, codeDict)
+{
+}
+
+void UMTSRRInfo::update(const LogCode_0x4125& report)
+{
+    rows().set("RRC State", textFor(report.state(), kStates, "Unknown"));
+}
+
+void UMTSRRInfo::update(const LogCode_0x4031& report)
+{
+    rows().print("Transmit Power", "%4.2lf dBm", averageTransmitPower(report));
+}
+
+void UMTSRRInfo::update(const LogCode_0x4127& report)
+{
+    Rows row = rows();
+    row.print("Cell ID", "%d", report.cellIdentity());
+    row.print("Downlink Frequency", "%d", report.downlinkUARFCN());
+    row.print("Uplink Frequency", "%d", report.uplinkUARFCN());
+    row.remove("UARFCN"); // the cell-monitor list's; it is of the cell before
+    row.print("URA ID", "%d", report.uraIdentity());
+}
+
+void UMTSRRInfo::update(const LogCode_0x4157& report)
+{
+    rows().set("Ciphering", report.isCiphered() ? "Enabled" : "Disabled");
+}
+
+void UMTSRRInfo::update(const CellMonitorList& list)
+{
+    if (!list.isPresentOrReported())
+        return;
+    Rows row = rows();
+    if (const CellRecord* cell = list.find({telephony::kRadioUMTS}, telephony::kCellTypeServing))
+        printCell(row, *cell, kCellEntries, "UMTSRRInfo");
+}
+
+} // namespace orvex

@@ -1,0 +1,55 @@
+#include "GSM/UMTSSet.h"
+
+#include "TelephonyConstants.h"
+
+namespace orvex {
+
+namespace {
+
+constexpr CellEntry kCellEntries[] = {
+    {telephony::kCellUARFCN, "UARFCN", "UARFCN", CellNumber::low16Bits},
+    {telephony::kCellScramblingCode, "Scrambling Code", "Scrambling Code", CellNumber::low16Bits},
+    {telephony::kCellRSCP, "RSCP", "RSCP", CellNumber::level, " dBm"},
+    {telephony::kCellECN0, "Energy Per Chip", "Energy Per Chip", CellNumber::level, " dB"},
+};
+
+DictionaryRef rowsOfCell(const CellRecord& cell)
+{
+    Rows row = Rows::make();
+    printCell(row, cell, kCellEntries, "UMTSSet");
+    return row.dictionary();
+}
+
+DictionaryRef rowsOfRankedCell(const LogCode_0x4005::UMTSCell& cell)
+{
+    Rows row = Rows::make();
+    row.print("Scrambling Code", "%d", cell.primaryScramblingCode());
+    row.print("RSCP", "%d dB", cell.rscp()); // shown so, though it is dBm
+    row.print("Energy Per Chip", "%f dB", cell.ecNo());
+    row.print("Downlink Frequency", "%d", cell.downlinkUARFCN());
+    row.print("Ranking Value", "%d", cell.rankingValue());
+    row.print("Rank Cell RSCP", "%d dB", cell.rankingRSCP());
+    return row.dictionary();
+}
+
+} // namespace
+
+UMTSSet::UMTSSet(ClassDictionary& dict, CodeDictionary& codeDict)
+    : PacketSection("UMTS Set", {Priority::warning, "UMTSSet"}, OtherCodes::areReported, dict, codeDict)
+{
+}
+
+void UMTSSet::update(const LogCode_0x4005& report)
+{
+    refillSection(report.umtsCells(), rowsOfRankedCell);
+}
+
+void UMTSSet::update(const CellMonitorList& list)
+{
+    clearSection();
+    if (!list.isPresentOrReported())
+        return;
+    refillSection(list.findAll(telephony::kRadioUMTS, telephony::kCellTypeNeighbor), rowsOfCell);
+}
+
+} // namespace orvex
