@@ -20,10 +20,11 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     const QCommandLineOption version(QStringList{QStringLiteral("v"), QStringLiteral("version")});
     const QCommandLineOption console(QStringLiteral("console"));
     const QCommandLineOption resources(QStringLiteral("resources"), {}, QStringLiteral("DIR"));
+    const QCommandLineOption open(QStringLiteral("open"), {}, QStringLiteral("FILE"));
     const QCommandLineOption light(QStringLiteral("light"));
     const QCommandLineOption dark(QStringLiteral("dark"));
     QCommandLineParser parser;
-    parser.addOptions({help, version, console, resources, light, dark});
+    parser.addOptions({help, version, console, resources, open, light, dark});
 
     // parse() rather than process(), which would end the program in its own way.
     if (!parser.parse(arguments))
@@ -47,6 +48,8 @@ CommandLine CommandLine::parse(const QStringList& arguments)
         result.theme = Theme::Mode::dark;
     if (parser.isSet(resources))
         result.resources = parser.value(resources).toStdString();
+    if (parser.isSet(open))
+        result.snapshot = parser.value(open).toLocal8Bit().toStdString();
     return result;
 }
 
@@ -57,6 +60,7 @@ std::string CommandLine::usage()
            "\n"
            "Options:\n"
            "  --console        Write to the terminal instead of opening a window.\n"
+           "  --open FILE      Show a saved snapshot instead of a session.\n"
            "  --resources DIR  Take the section templates from this directory.\n"
            "  --light, --dark  Choose the colours. Default: as the desktop has them.\n"
            "  -h, --help       Show this help and exit.\n"

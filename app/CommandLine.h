@@ -16,6 +16,7 @@ struct CommandLine {
     Action action = Action::window;
     Theme::Mode theme = Theme::Mode::system;
     std::optional<std::string> resources; // a directory in place of the default one
+    std::optional<std::string> snapshot;  // a file to show in place of a session
     std::string error;                    // with wrongUsage: one line
 
     // The arguments as the program got them, its own name first.

@@ -2,6 +2,7 @@
 
 #include "HomeScreenPreference.h"
 #include "OrvexPaneController.h"
+#include "OrvexSaveViewController.h"
 #include "PaneReloader.h"
 #include "UpdateMessage.h"
 
@@ -12,7 +13,14 @@
 namespace orvex {
 
 namespace {
-constexpr QSize kWindowSize{375, 667}; // a handset's screen
+// A handset has it; elsewhere it is made. When that fails, so will the save, and say it.
+std::string reportDirectory()
+{
+    const std::string directory = paths::diagnosticReports();
+    std::error_code ignored;
+    std::filesystem::create_directories(directory, ignored);
+    return directory;
+}
 } // namespace
 
 std::shared_ptr<OrvexApp> OrvexApp::create(const AppPlatform& platform)
@@ -35,7 +43,7 @@ OrvexApp::~OrvexApp()
 void OrvexApp::applicationDidFinishLaunching()
 {
     getSaveButtonPref();
-    _window = std::make_unique<Window>(QStringLiteral("Orvex"), kWindowSize);
+    _window = std::make_unique<Window>(QStringLiteral("Orvex"), Window::kHandsetSize);
     _model = OrvexModel::create(_platform.session);
     _model->setListener(this);
     _updateMessage = kConnectingMessage;
@@ -100,9 +108,19 @@ void OrvexApp::getSaveButtonPref()
 
 void OrvexApp::showSaveView()
 {
-    if (!_window || !_saveScreenFactory || saveViewController())
+    if (!_window || saveViewController())
         return;
-    _window->presentModally(_saveScreenFactory(_model->getSaveContents()), true);
+    const auto& [runLoop, ports, telephony, generators] = _platform.session;
+    // In a later turn: the screen must not go inside the action of its own button.
+    auto close = [&runLoop = runLoop, app = weak_from_this()] {
+        runLoop.post([app] {
+            if (const auto self = app.lock())
+                self->closeSaveView();
+        });
+    };
+    _window->presentModally(std::make_unique<OrvexSaveViewController>(_model->getSaveContents(),
+                                generators.clock, reportDirectory(), std::move(close)),
+        true);
 }
 
 void OrvexApp::closeSaveView()

@@ -6,7 +6,6 @@
 #include "NavigationStack.h"
 #include "Window.h"
 
-#include <functional>
 #include <memory>
 #include <optional>
 #include <string>
@@ -21,16 +20,10 @@ class OrvexApp final : public std::enable_shared_from_this<OrvexApp>,
                        public NavigationStack::Delegate,
                        public PaneHost {
 public:
-    // Makes the screen that saves a snapshot of these contents (null when there are none yet).
-    using SaveScreenFactory = std::function<std::unique_ptr<Screen>(const ArrayRef& saveContents)>;
-
     static std::shared_ptr<OrvexApp> create(const AppPlatform& platform);
     ~OrvexApp() override;
     OrvexApp(const OrvexApp&) = delete;
     OrvexApp& operator=(const OrvexApp&) = delete;
-
-    // Until a factory is given there is no Save button, as it would lead nowhere. To be given before launch.
-    void setSaveScreenFactory(SaveScreenFactory factory) { _saveScreenFactory = std::move(factory); }
 
     // Opens the window and queues the start of the session.
     void applicationDidFinishLaunching();
@@ -44,7 +37,7 @@ public:
     // Whether this is an internal build, read from its marker by getSaveButtonPref().
     bool allowSaveButton() const { return _allowSaveButton; }
     void getSaveButtonPref();
-    bool offersSaveButton() const override { return _allowSaveButton && _saveScreenFactory; }
+    bool offersSaveButton() const override { return _allowSaveButton; }
     // Opens the snapshot screen over everything, unless it is open.
     void showSaveView() override;
     void closeSaveView();
@@ -63,7 +56,6 @@ private:
     explicit OrvexApp(const AppPlatform& platform);
 
     AppPlatform _platform;
-    SaveScreenFactory _saveScreenFactory;
     std::unique_ptr<Window> _window;
     NavigationStack* _navController = nullptr; // the window's
     std::shared_ptr<OrvexModel> _model;

@@ -3,7 +3,11 @@
 #include "CommandLine.h"
 #include "OrvexApp.h"
 #include "OrvexConsole.h"
+#include "SnapshotViewer.h"
 #include "StandardOutput.h"
+
+#include "DisplayTreePrinter.h"
+#include "SnapshotTree.h"
 
 #include "Accessibility.h"
 #include "FatalErrors.h"
@@ -26,6 +30,8 @@
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
+#include <filesystem>
+#include <functional>
 #include <unistd.h>
 
 namespace {
@@ -109,7 +115,8 @@ int runConsole(int argc, char** argv, const std::string& resourceDirectory)
     return status;
 }
 
-int runWindow(int argc, char** argv, const std::string& resourceDirectory, Theme::Mode theme)
+// Runs the body with an application object that can open windows.
+int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<int()>& body)
 {
     if (!displayIsNamed()) {
         complainOfNoDisplay();
@@ -123,14 +130,42 @@ int runWindow(int argc, char** argv, const std::string& resourceDirectory, Theme
     QApplication::setApplicationDisplayName(QStringLiteral("Orvex"));
     Theme::use(theme);
     installAccessibility();
+    return body();
+}
 
-    LinuxPlatform platform(resourceDirectory);
-    const auto app = OrvexApp::create(platform.forApp());
-    const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
-    app->applicationDidFinishLaunching();
-    const int status = QApplication::exec();
-    app->applicationWillTerminate();
-    return status;
+int runWindow(int argc, char** argv, const std::string& resourceDirectory, Theme::Mode theme)
+{
+    return runInWindow(argc, argv, theme, [&resourceDirectory] {
+        LinuxPlatform platform(resourceDirectory);
+        const auto app = OrvexApp::create(platform.forApp());
+        const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
+        app->applicationDidFinishLaunching();
+        const int status = QApplication::exec();
+        app->applicationWillTerminate();
+        return status;
+    });
+}
+
+// The file's tree, on the terminal or in a window of its own.
+int showSnapshot(int argc, char** argv, const CommandLine& commandLine)
+{
+    const std::string& path = *commandLine.snapshot;
+    const auto [snapshot, error] = readSnapshot(path);
+    if (!snapshot) {
+        std::fprintf(stderr, "orvex: %s\n", error.c_str());
+        return kExitFailure;
+    }
+    if (commandLine.action == CommandLine::Action::console) {
+        const std::string tree = DisplayTreePrinter::text(*snapshotTree(*snapshot));
+        const bool written = std::printf("%s\n%s", snapshotMessage(*snapshot).c_str(), tree.c_str()) >= 0
+            && std::fflush(stdout) == 0;
+        return written ? EXIT_SUCCESS : kExitFailure;
+    }
+    return runInWindow(argc, argv, commandLine.theme, [&, &shown = *snapshot] {
+        const SnapshotViewer viewer(shown, std::filesystem::path(path).filename().string());
+        const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
+        return QApplication::exec();
+    });
 }
 
 } // namespace
@@ -156,9 +191,14 @@ int main(int argc, char** argv)
     SystemLog::install(log.get());
     installFatalErrorHandler();
     const std::string directory = commandLine.resources.value_or(FileResources::defaultDirectory());
-    const int status = commandLine.action == CommandLine::Action::console
-        ? runConsole(argc, argv, directory)
-        : runWindow(argc, argv, directory, commandLine.theme);
+    const auto run = [&] {
+        if (commandLine.snapshot)
+            return showSnapshot(argc, argv, commandLine);
+        return commandLine.action == CommandLine::Action::console
+            ? runConsole(argc, argv, directory)
+            : runWindow(argc, argv, directory, commandLine.theme);
+    };
+    const int status = run();
     SystemLog::install(nullptr);
     log->flush();
     return status;

@@ -5,6 +5,7 @@
 #include "Theme.h"
 
 #include <QPainter>
+#include <QPolygonF>
 
 #include <algorithm>
 #include <utility>
@@ -18,7 +19,8 @@ constexpr double kChevronHeight = 12;
 constexpr double kChevronRight = 14; // from the chevron's tip to the edge
 constexpr double kDotRadius = 1;
 constexpr double kDotDistance = 3.2;
-constexpr int kDisclosureWidth = 20; // what the chevron takes from the content view
+constexpr QSizeF kCheckmarkSize(13, 10);
+constexpr int kAccessoryWidth = 20; // what chevron or checkmark take from the content view
 } // namespace
 
 TableCell::TableCell(std::string reuseIdentifier)
@@ -47,7 +49,7 @@ void TableCell::setHighlighted(bool highlighted)
 
 void TableCell::layoutSubviews()
 {
-    const int accessoryWidth = _accessory == Accessory::none ? 0 : kDisclosureWidth;
+    const int accessoryWidth = _accessory == Accessory::none ? 0 : kAccessoryWidth;
     _contentView->setGeometry(0, 0, std::max(0, width() - accessoryWidth - kRightInset), height());
 }
 
@@ -68,8 +70,24 @@ void TableCell::paintEvent(QPaintEvent*)
             kChevronWidth, kChevronHeight);
         drawChevron(painter, chevron, ChevronDirection::right, theme.accessory, 2);
     }
+    if (_accessory == Accessory::checkmark)
+        drawCheckmark(painter);
     if (sidewaysScrollView() && sidewaysScrollView()->hidesContentAtRight())
         drawMoreMark(painter);
+}
+
+void TableCell::drawCheckmark(QPainter& painter) const
+{
+    const QPointF topLeft(
+        width() - kChevronRight - kCheckmarkSize.width(), (height() - kCheckmarkSize.height()) / 2);
+    const auto at = [&](double right, double down) {
+        return topLeft + QPointF(right * kCheckmarkSize.width(), down * kCheckmarkSize.height());
+    };
+    painter.save();
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(QPen(Theme::current().tint, 2, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
+    painter.drawPolyline(QPolygonF{at(0, 0.55), at(0.36, 1), at(1, 0)});
+    painter.restore();
 }
 
 // Three dots beside the content: a value may be wholly out of sight, and nobody would look for it.

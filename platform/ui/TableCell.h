@@ -15,7 +15,7 @@ class SidewaysScrollView;
 // Cells take no input; the list does.
 class TableCell : public QWidget {
 public:
-    enum class Accessory { none, disclosureIndicator };
+    enum class Accessory { none, disclosureIndicator, checkmark };
 
     // Right of the content view, so that a value set flush right does not touch the edge of the window.
     static constexpr int kRightInset = 10;
@@ -45,6 +45,7 @@ protected:
 private:
     friend class TableList;
 
+    void drawCheckmark(QPainter& painter) const;
     void drawMoreMark(QPainter& painter) const;
 
     std::string _reuseIdentifier;

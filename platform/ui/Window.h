@@ -13,6 +13,8 @@ namespace orvex {
 // The application's window: a root view that fills it, and at most one modal screen that slides up over it.
 class Window final : public QWidget {
 public:
+    static constexpr QSize kHandsetSize{375, 667};
+
     Window(const QString& title, const QSize& size);
 
     void setRootView(std::unique_ptr<QWidget> view);

@@ -55,6 +55,23 @@ Value Value::shallowCopy() const
     }
 }
 
+Value Value::deepCopy() const
+{
+    if (const ArrayRef elements = array()) {
+        auto copy = Array::make();
+        for (const Value& element : *elements)
+            copy->append(element.deepCopy());
+        return copy;
+    }
+    if (const DictionaryRef entries = dictionary()) {
+        auto copy = Dictionary::make();
+        for (const auto& [key, value] : *entries)
+            copy->set(key, value.deepCopy());
+        return copy;
+    }
+    return shallowCopy();
+}
+
 bool operator==(const Value& left, const Value& right)
 {
     if (left.kind() != right.kind())

@@ -23,7 +23,7 @@ using BytesRef = std::shared_ptr<Bytes>;
 // The one value type of property lists, generator state, display dictionary and snapshots.
 //
 // Scalars are held by value. Arrays, dictionaries and byte buffers are held by reference: copying a Value
-// that holds one shares it. shallowCopy() is the one way to a container of its own.
+// that holds one shares it. A container of one's own is had from shallowCopy() and deepCopy() alone.
 class Value {
 public:
     enum class Kind { null, string, integer, real, boolean, date, data, array, dictionary };
@@ -78,6 +78,8 @@ public:
 
     // A container of its own kind holding the same elements; any other value as it is.
     Value shallowCopy() const;
+    // The same with copies of its elements, all the way down.
+    Value deepCopy() const;
 
     // Scalars by value, containers element by element.
     friend bool operator==(const Value& left, const Value& right);

@@ -99,27 +99,21 @@ TEST_F(OrvexAppTest, SaysThatItConnectsFromTheNextRefreshOrNavigationAfterALoss)
     EXPECT_EQ(status(), "Updated 2023-11-15 at 00:13:20"); // of the last data
 }
 
-TEST_F(OrvexAppTest, OffersTheSaveButtonOnInternalBuildsOnceThereIsAScreenForIt)
+TEST_F(OrvexAppTest, OffersTheSaveButtonOnInternalBuildsAlone)
 {
     const std::filesystem::path marker = paths::internalBuildMarker();
     std::filesystem::create_directories(marker.parent_path());
     std::ofstream(marker).put('\n');
-
     app->getSaveButtonPref();
-    EXPECT_FALSE(app->offersSaveButton());
-    std::vector<ArrayRef> opened;
-    app->setSaveScreenFactory([&opened](const ArrayRef& contents) {
-        opened.push_back(contents);
-        return std::make_unique<Screen>();
-    });
     EXPECT_TRUE(app->offersSaveButton());
 
     launchAndShow(1);
     QTest::mouseClick(pane(0).toolbarRow()->items().back().widget, Qt::LeftButton);
+    const Screen* const opened = app->saveViewController();
+    ASSERT_NE(opened, nullptr);
     app->showSaveView();
-    ASSERT_EQ(opened.size(), 1U);
-    EXPECT_FALSE(opened[0]->isEmpty());
-    EXPECT_TRUE(app->saveViewController()->isVisible());
+    EXPECT_EQ(app->saveViewController(), opened) << "one at a time";
+    EXPECT_TRUE(opened->isVisible());
     EXPECT_FALSE(app->navigationStack()->isVisible());
     app->closeSaveView();
     app->closeSaveView();

@@ -1,0 +1,36 @@
+#pragma once
+
+#include "PaneHost.h"
+#include "Snapshot.h"
+
+#include <memory>
+#include <string>
+
+namespace orvex {
+
+class NavigationStack;
+class Window;
+
+// Shows a saved snapshot on the list screens. There is no session: nothing moves, nothing can be saved.
+class SnapshotViewer final : public PaneHost {
+public:
+    // The name stands in the title of the window.
+    SnapshotViewer(const Snapshot& snapshot, const std::string& name);
+    ~SnapshotViewer() override;
+    SnapshotViewer(const SnapshotViewer&) = delete;
+    SnapshotViewer& operator=(const SnapshotViewer&) = delete;
+
+    NavigationStack& navigationStack() const { return *_navController; }
+
+    bool offersSaveButton() const override { return false; }
+    void showSaveView() override { }
+
+private:
+    std::unique_ptr<Window> _window;
+    NavigationStack* _navController; // the window's
+};
+
+// What the status line says under a snapshot.
+std::string snapshotMessage(const Snapshot& snapshot);
+
+} // namespace orvex

@@ -1,0 +1,130 @@
+#include "Snapshot.h"
+
+#include "PropertyList.h"
+
+#include <gtest/gtest.h>
+
+#include <csignal>
+#include <filesystem>
+#include <fstream>
+#include <sys/resource.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+namespace orvex::test {
+namespace {
+
+class SnapshotTest : public testing::Test {
+protected:
+    SnapshotTest()
+    {
+        std::string pattern = testing::TempDir() + "snapshotXXXXXX";
+        directory = ::mkdtemp(pattern.data());
+    }
+    ~SnapshotTest() override { std::filesystem::remove_all(directory); }
+
+    std::string write(const std::string& content) const
+    {
+        std::ofstream(directory + "/file.orvex", std::ios::binary) << content;
+        return directory + "/file.orvex";
+    }
+
+    std::string directory;
+};
+
+Snapshot someSnapshot()
+{
+    return {"2024-03-05 14:07:09 +0000",
+        Array::make({Dictionary::make(
+            {{"Description", "Snapshot (x)"}, {"Display", Dictionary::make({{"A", Array::make({"b"})}})},
+                {"DisplayState", std::make_shared<Bytes>(Bytes{1, 0, 255})}})}),
+        "words"};
+}
+
+TEST_F(SnapshotTest, IsReadAsItWasWritten)
+{
+    const std::string path = snapshotPath(directory, Date{1'709'647'629.9});
+    EXPECT_EQ(path, directory + "/OrvexSnapshot-1709647629.orvex");
+    const Snapshot written = someSnapshot();
+    ASSERT_TRUE(writeSnapshot(written, path));
+    const auto [read, error] = readSnapshot(path);
+    ASSERT_TRUE(read) << error;
+    EXPECT_EQ(read->timestamp, written.timestamp);
+    EXPECT_EQ(read->description, written.description);
+    EXPECT_TRUE(*read->data == *written.data);
+}
+
+TEST_F(SnapshotTest, SaysWhyAFileIsNone)
+{
+    const std::string good = R"(<plist version="1.0"><dict><key>Timestamp</key><string>t</string>)"
+                             R"(<key>Description</key><string>d</string><key>Data</key>)";
+    const struct {
+        const char* content;
+        const char* reason;
+    } cases[] = {
+        {"", "not a snapshot: "},
+        {"<plist version=\"1.0\"><dict><key>Da", "not a snapshot: "},
+        {"<plist version=\"1.0\"><array/></plist>", "not a snapshot: its property list is no dictionary"},
+        {"<plist version=\"1.0\"><dict/></plist>", "not a snapshot: it has no list \"Data\""},
+    };
+    for (const auto& [content, reason] : cases) {
+        const std::string path = write(content);
+        const auto [read, error] = readSnapshot(path);
+        EXPECT_FALSE(read) << content;
+        EXPECT_TRUE(error.starts_with(path + ": " + reason)) << error;
+        EXPECT_EQ(error.find('\n'), std::string::npos);
+    }
+    EXPECT_EQ(readSnapshot(write(good + "<array><string/></array></dict></plist>")).error,
+        directory + "/file.orvex: not a snapshot: an entry of \"Data\" is no dictionary");
+    EXPECT_EQ(
+        readSnapshot(write("<plist version=\"1.0\"><dict><key>Data</key><array/></dict></plist>")).error,
+        directory + "/file.orvex: not a snapshot: \"Timestamp\" or \"Description\" is no text");
+    EXPECT_TRUE(readSnapshot(write(good + "<array/></dict></plist>")).snapshot);
+    EXPECT_EQ(readSnapshot(directory + "/none").error, directory + "/none: No such file or directory");
+    EXPECT_EQ(readSnapshot(directory).error, directory + ": Is a directory");
+}
+
+TEST_F(SnapshotTest, ACutFileGivesOneLineAndNoSnapshot)
+{
+    const std::string path = directory + "/whole.orvex";
+    ASSERT_TRUE(writeSnapshot(someSnapshot(), path));
+    std::ifstream file(path, std::ios::binary);
+    const std::string whole((std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());
+    const std::size_t end = whole.find("</plist>");
+    for (std::size_t length = 0; length < end; length += 7)
+        EXPECT_FALSE(readSnapshot(write(whole.substr(0, length))).snapshot) << length;
+}
+
+// Writes in a child process whose files may not grow beyond this, as on a full disk.
+int statusOfWritingWithin(rlim_t bytes, const std::string& path)
+{
+    const pid_t child = ::fork();
+    if (child == 0) {
+        std::signal(SIGXFSZ, SIG_IGN);
+        const rlimit limit{bytes, bytes};
+        ::setrlimit(RLIMIT_FSIZE, &limit);
+        ::_exit(writeSnapshot(someSnapshot(), path) ? 0 : 7);
+    }
+    int status = 0;
+    ::waitpid(child, &status, 0);
+    return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+}
+
+TEST_F(SnapshotTest, TellsWhenItCouldNotBeWritten)
+{
+    Snapshot unwritable = someSnapshot();
+    unwritable.data->append(Dictionary::make({{"Display", Value()}}));
+    EXPECT_FALSE(writeSnapshot(unwritable, directory + "/null.orvex"));
+    EXPECT_FALSE(std::filesystem::exists(directory + "/null.orvex"));
+    EXPECT_FALSE(writeSnapshot(someSnapshot(), directory + "/gone/x.orvex"));
+
+    const std::string full = directory + "/full.orvex";
+    EXPECT_EQ(statusOfWritingWithin(100, full), 7);
+    EXPECT_EQ(std::filesystem::file_size(full), 100U) << "in place: what fitted is there";
+    EXPECT_FALSE(readSnapshot(full).snapshot);
+    EXPECT_EQ(statusOfWritingWithin(100'000, full), 0);
+}
+
+} // namespace
+} // namespace orvex::test
