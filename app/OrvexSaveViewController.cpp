@@ -23,6 +23,7 @@ constexpr int kBarHeight = NavigationBar::kHeight;
 constexpr int kMargin = 10;
 constexpr int kFieldHeight = 36;
 constexpr int kFieldFontSize = 15;
+constexpr int kFieldTextMargin = 6;
 constexpr int kCaptionHeight = 24;
 constexpr int kCaptionFontSize = 13;
 
@@ -52,9 +53,12 @@ OrvexSaveViewController::OrvexSaveViewController(
 {
     setTitle(QStringLiteral("Save Snapshot"));
     _titleLabel->setLine(title());
-    _titleLabel->setAlignment(Qt::AlignCenter);
     _caption->setLine(QStringLiteral("Will be saved:"));
     _saveDescription->setFont(Theme::systemFont(kFieldFontSize));
+    QPalette palette = _saveDescription->palette();
+    palette.setColor(QPalette::Base, Theme::current().bar);
+    _saveDescription->setPalette(palette);
+    _saveDescription->setTextMargins(kFieldTextMargin, 0, kFieldTextMargin, 0);
     _saveDescription->setPlaceholderText(QStringLiteral("Description"));
     _saveDescription->setAccessibleName(QStringLiteral("Description"));
     setTabOrder(_saveDescription, _saveButton);
@@ -71,7 +75,7 @@ void OrvexSaveViewController::savePressed()
     const std::string path = snapshotPath(_reportDirectory, _clock.now());
     if (!writeSnapshot(snapshot, path)) {
         systemLog(Priority::error, "Unable to write snapshot to %s", path.c_str());
-        showAlert(*this, QStringLiteral("File Error"), QStringLiteral("Unable to write file to disk"),
+        Alert::show(*this, QStringLiteral("File Error"), QStringLiteral("Unable to write file to disk"),
             QStringLiteral("Close"));
     }
     _close();
@@ -115,8 +119,8 @@ void OrvexSaveViewController::resizeEvent(QResizeEvent*)
 {
     placeButton(*_cancelButton, 0, kBarHeight);
     placeButton(*_saveButton, width() - _saveButton->sizeHint().width(), kBarHeight);
-    const int side = std::max(_cancelButton->width(), _saveButton->width());
-    _titleLabel->setGeometry(side, 0, std::max(0, width() - 2 * side), kBarHeight - 1);
+    const int titleWidth = sizeOfLine(title(), _titleLabel->font()).width();
+    _titleLabel->setGeometry((width() - titleWidth) / 2, 0, titleWidth, kBarHeight - 1);
     int top = kBarHeight + kMargin;
     _saveDescription->setGeometry(kMargin, top, width() - 2 * kMargin, kFieldHeight);
     top += kFieldHeight + kMargin;

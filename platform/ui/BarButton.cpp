@@ -57,8 +57,9 @@ void BarButton::paintEvent(QPaintEvent*)
     }
     painter.setPen(color);
     const QRect place(textLeft(), 0, width() - textLeft() - kPadding, height());
+    const auto side = _style == Style::back ? Qt::AlignLeft : Qt::AlignHCenter;
     const QString fitted = fontMetrics().elidedText(text(), Qt::ElideRight, place.width());
-    painter.drawText(place, Qt::AlignLeft | Qt::AlignVCenter | Qt::TextSingleLine, fitted);
+    painter.drawText(place, static_cast<int>(side | Qt::AlignVCenter) | Qt::TextSingleLine, fitted);
 }
 
 } // namespace orvex

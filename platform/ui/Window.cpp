@@ -52,7 +52,7 @@ void Window::dismissModal(bool animated)
     leaving->viewWillDisappear(animated);
     _root->show();
     _root->setFocus();
-    leaving->raise();
+    _root->lower(); // and an alert stays on top of both
     _slide.start(
         kSlideMilliseconds,
         [this, leaving](double progress) { leaving->move(0, qRound(progress * height())); },

@@ -1,5 +1,7 @@
 #include "OrvexSaveViewController.h"
 
+#include "Alert.h"
+#include "BarButton.h"
 #include "OrvexApp.h"
 #include "PaneFixture.h"
 #include "SaveHistoryContentCell.h"
@@ -10,8 +12,6 @@
 #include "RecordingLog.h"
 
 #include <QLineEdit>
-#include <QMessageBox>
-#include <QPushButton>
 
 #include <filesystem>
 
@@ -41,12 +41,13 @@ protected:
         const bool isTicked = cell->accessory() == TableCell::Accessory::checkmark;
         return (isTicked ? "[x] " : "[ ] ") + cell->text().text().toStdString();
     }
-    static QMessageBox* shownAlert()
+    // Null while there is none.
+    Alert* shownAlert() const
     {
-        for (QWidget* widget : QApplication::topLevelWidgets()) {
-            auto* const box = qobject_cast<QMessageBox*>(widget);
-            if (box && box->isVisible())
-                return box;
+        for (QObject* child : app->window()->children()) {
+            auto* const alert = dynamic_cast<Alert*>(child);
+            if (alert && alert->isVisible())
+                return alert;
         }
         return nullptr;
     }
@@ -116,17 +117,22 @@ TEST_F(OrvexSaveViewControllerTest, SaysThatTheFileCouldNotBeWrittenAndTheSessio
     EXPECT_EQ(app->saveViewController(), nullptr);
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 
-    QMessageBox* const alert = shownAlert();
+    Alert* const alert = shownAlert();
     ASSERT_NE(alert, nullptr) << "stays when the screen goes";
-    EXPECT_EQ(alert->text(), "File Error");
-    EXPECT_EQ(alert->informativeText(), "Unable to write file to disk");
-    ASSERT_EQ(alert->buttons().size(), 1);
-    EXPECT_EQ(alert->buttons()[0]->text(), "Close");
+    EXPECT_EQ(alert->title().text(), "File Error");
+    EXPECT_EQ(alert->message().text(), "Unable to write file to disk");
+    EXPECT_EQ(alert->button().text(), "Close");
+    app->window()->resize(500, 300);
+    EXPECT_EQ(alert->geometry(), app->window()->rect());
     deliverNeighbors(3);
     refresh();
     EXPECT_EQ(shownAlert(), alert);
-    alert->buttons()[0]->click();
+    QApplication::setActiveWindow(app->window());
+    app->navigationStack()->setFocus();
+    EXPECT_EQ(QApplication::focusWidget(), alert) << "keys are the alert's";
+    QTest::mouseClick(&alert->button(), Qt::LeftButton);
     EXPECT_EQ(shownAlert(), nullptr);
+    EXPECT_NE(QApplication::focusWidget(), alert);
 }
 
 TEST_F(OrvexSaveViewControllerTest, ATouchBesideTheFieldTakesTheKeyboardAway)
