@@ -34,22 +34,20 @@ bool complain(const std::string& message)
 // Feeds the messages of one capture. False, after a line on standard error, when it could not be read whole.
 bool feed(OfflineSession& session, const std::string& path, Progress& progress)
 {
-    CaptureReader reader(path);
+    const auto reader = CaptureReader::open(path);
     const std::size_t before = session.messageCount();
-    CaptureReader::Status status = reader.next();
-    for (; status == CaptureReader::Status::message; status = reader.next()) {
-        session.take(reader.message());
-        progress.advance(reader.message().size());
+    CaptureReader::Status status = reader->next();
+    for (; status == CaptureReader::Status::message; status = reader->next()) {
+        session.take(reader->message());
+        progress.advance(reader->message().size());
     }
-    if (reader.incompletePackets() > 0) {
-        complain(path + ": " + std::to_string(reader.incompletePackets())
-            + " packets hold only the beginning of their message and were left out");
-    }
+    if (const std::string omissions = reader->omissions(); !omissions.empty())
+        complain(path + ": " + omissions);
     if (status == CaptureReader::Status::end)
         return true;
     const std::size_t whole = session.messageCount() - before;
     return complain(
-        reader.error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
+        reader->error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
 }
 
 bool print(const OrvexModelNode& root, const DecodeOptions& options)

@@ -114,8 +114,8 @@ TEST_F(DecodeTest, SaysInOneLineWhyACaptureCannotBeRead)
         Bytes bytes;
         const char* why;
     } cases[] = {
-        {"no pcap file", Bytes(100, 'x'), "0.pcap: not a pcap file"},
-        {"zero bytes", {}, "0.pcap: not a pcap file"},
+        {"no pcap file", Bytes(100, 'x'), "0.pcap: neither a pcap nor a DLF file"},
+        {"zero bytes", {}, "0.pcap: neither a pcap nor a DLF file"},
         {"another link type", PcapFile(1).add(antennas(4)).bytes(),
             "0.pcap: its link type is 1; log messages have 147 (USER0)"},
         {"cut in the first packet", PcapFile().add(antennas(4)).cut(1).bytes(), "0.pcap: truncated"},

@@ -1,4 +1,4 @@
-#include "CaptureReader.h"
+#include "PcapReader.h"
 
 #include "TextFormat.h"
 
@@ -10,7 +10,7 @@
 
 namespace orvex {
 
-struct CaptureReader::Pcap {
+struct PcapReader::Pcap {
     explicit Pcap(pcap_t* opened)
         : handle(opened)
     {
@@ -22,8 +22,8 @@ struct CaptureReader::Pcap {
     pcap_t* handle;
 };
 
-CaptureReader::CaptureReader(const std::string& path)
-    : _path(path)
+PcapReader::PcapReader(const std::string& path)
+    : CaptureReader(path)
 {
     // Opened here, since libpcap takes "-" for the standard input and says less of what went wrong.
     std::FILE* file = std::fopen(path.c_str(), "rbe");
@@ -32,7 +32,8 @@ CaptureReader::CaptureReader(const std::string& path)
         return;
     }
     std::array<char, PCAP_ERRBUF_SIZE> reason{};
-    pcap_t* opened = pcap_fopen_offline(file, reason.data());
+    pcap_t* opened =
+        pcap_fopen_offline_with_tstamp_precision(file, PCAP_TSTAMP_PRECISION_MICRO, reason.data());
     if (!opened) {
         std::fclose(file);
         breakOff(std::string("not a pcap file: ") + reason.data());
@@ -45,9 +46,9 @@ CaptureReader::CaptureReader(const std::string& path)
     }
 }
 
-CaptureReader::~CaptureReader() = default;
+PcapReader::~PcapReader() = default;
 
-CaptureReader::Status CaptureReader::next()
+CaptureReader::Status PcapReader::next()
 {
     if (!_pcap)
         return Status::broken;
@@ -63,15 +64,16 @@ CaptureReader::Status CaptureReader::next()
             ++_incompletePackets;
             continue;
         }
-        _message = ByteView(bytes, header->caplen);
-        return Status::message;
+        return yield(ByteView(bytes, header->caplen),
+            std::chrono::seconds(header->ts.tv_sec) + std::chrono::microseconds(header->ts.tv_usec));
     }
 }
 
-CaptureReader::Status CaptureReader::breakOff(const std::string& reason)
+std::string PcapReader::omissions() const
 {
-    _error = _path + ": " + reason;
-    return Status::broken;
+    if (_incompletePackets == 0)
+        return {};
+    return text("%zu packets hold only the beginning of their message and were left out", _incompletePackets);
 }
 
 } // namespace orvex

@@ -1,0 +1,54 @@
+#include "CaptureReader.h"
+
+#include "DlfReader.h"
+#include "PcapReader.h"
+
+#include <algorithm>
+#include <array>
+#include <cerrno>
+#include <cstring>
+#include <fstream>
+
+namespace orvex {
+
+namespace {
+
+// A capture that could not be opened.
+class NoCapture final : public CaptureReader {
+public:
+    NoCapture(const std::string& path, const std::string& reason)
+        : CaptureReader(path)
+    {
+        breakOff(reason);
+    }
+
+    Status next() override { return Status::broken; }
+    std::string omissions() const override { return {}; }
+};
+
+// Of pcap with micro- and nanoseconds, in both byte orders, and of its successor, which libpcap reads too.
+bool isPcapMagic(const std::array<unsigned char, 4>& bytes)
+{
+    static constexpr std::array<unsigned char, 4> kMagics[] = {{0xA1, 0xB2, 0xC3, 0xD4},
+        {0xD4, 0xC3, 0xB2, 0xA1}, {0xA1, 0xB2, 0x3C, 0x4D}, {0x4D, 0x3C, 0xB2, 0xA1},
+        {0x0A, 0x0D, 0x0D, 0x0A}};
+    return std::ranges::find(kMagics, bytes) != std::end(kMagics);
+}
+
+} // namespace
+
+std::unique_ptr<CaptureReader> CaptureReader::open(const std::string& path)
+{
+    std::ifstream file(path, std::ios::binary);
+    if (!file)
+        return std::make_unique<NoCapture>(path, std::strerror(errno));
+    std::array<unsigned char, 4> magic{};
+    file.read(reinterpret_cast<char*>(magic.data()), magic.size());
+    if (file.bad()) // a directory opens, and fails at the first read
+        return std::make_unique<NoCapture>(path, std::strerror(errno));
+    if (file && isPcapMagic(magic))
+        return std::make_unique<PcapReader>(path);
+    return std::make_unique<DlfReader>(path);
+}
+
+} // namespace orvex

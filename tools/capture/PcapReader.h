@@ -1,0 +1,24 @@
+#pragma once
+
+#include "CaptureReader.h"
+
+namespace orvex {
+
+// A pcap file of either byte order, with micro- or nanoseconds, link type 147 (USER0): one message per
+// packet, exactly as it stands on the log channel.
+class PcapReader final : public CaptureReader {
+public:
+    explicit PcapReader(const std::string& path);
+    ~PcapReader() override;
+
+    Status next() override;
+    std::string omissions() const override;
+
+private:
+    struct Pcap;
+
+    std::unique_ptr<Pcap> _pcap;        // null when the file cannot be read
+    std::size_t _incompletePackets = 0; // the capture holds only their beginning
+};
+
+} // namespace orvex

@@ -1,0 +1,61 @@
+#include "PcapWriter.h"
+
+#include <pcap/pcap.h>
+
+#include <cerrno>
+#include <cstring>
+
+namespace orvex {
+
+namespace {
+constexpr int kLongestMessage = 16 << 20; // what a message port carries
+} // namespace
+
+struct PcapWriter::Dump {
+    explicit Dump(std::FILE* file)
+        : handle(pcap_open_dead(DLT_USER0, kLongestMessage))
+        , dumper(pcap_dump_fopen(handle, file))
+    {
+    }
+    ~Dump()
+    {
+        pcap_dump_close(dumper);
+        pcap_close(handle);
+    }
+    Dump(const Dump&) = delete;
+    Dump& operator=(const Dump&) = delete;
+
+    pcap_t* handle;
+    pcap_dumper_t* dumper;
+};
+
+PcapWriter::PcapWriter(const std::string& path)
+    : _path(path)
+{
+    std::FILE* file = std::fopen(path.c_str(), "wbe");
+    if (file)
+        _dump = std::make_unique<Dump>(file);
+    else
+        _error = path + ": " + std::strerror(errno);
+}
+
+PcapWriter::~PcapWriter() = default;
+
+void PcapWriter::write(ByteView message, std::chrono::microseconds time)
+{
+    if (!_dump)
+        return;
+    pcap_pkthdr header{};
+    header.ts.tv_sec = static_cast<time_t>(time.count() / 1'000'000);
+    header.ts.tv_usec = static_cast<suseconds_t>(time.count() % 1'000'000);
+    header.caplen = header.len = static_cast<bpf_u_int32>(message.size());
+    pcap_dump(reinterpret_cast<u_char*>(_dump->dumper), &header, message.data());
+}
+
+void PcapWriter::flush()
+{
+    if (_dump && _error.empty() && pcap_dump_flush(_dump->dumper) != 0)
+        _error = _path + ": " + std::strerror(errno);
+}
+
+} // namespace orvex

@@ -1,0 +1,34 @@
+#pragma once
+
+#include "MessagePort.h"
+
+#include <chrono>
+#include <memory>
+#include <string>
+
+namespace orvex {
+
+// Writes log messages as a pcap file with microseconds and link type 147 (USER0), one message per packet.
+class PcapWriter {
+public:
+    // An existing file is overwritten.
+    explicit PcapWriter(const std::string& path);
+    ~PcapWriter();
+    PcapWriter(const PcapWriter&) = delete;
+    PcapWriter& operator=(const PcapWriter&) = delete;
+
+    void write(ByteView message, std::chrono::microseconds time);
+    void flush();
+
+    // One line with the file's path; empty while everything could be written.
+    const std::string& error() const { return _error; }
+
+private:
+    struct Dump;
+
+    std::string _path;
+    std::unique_ptr<Dump> _dump; // null when the file cannot be written
+    std::string _error;
+};
+
+} // namespace orvex
