@@ -1,7 +1,5 @@
 #include "UTRANTown.h"
 
-#include <algorithm>
-
 namespace orvex::korat {
 
 namespace {
@@ -103,20 +101,6 @@ std::vector<GSMCell> gsmCellsOfTown()
         result.push_back({1 + (37 * i) % 124, i % 8, (i / 8) % 8, 2001 + 3 * i});
     return result;
 }
-
-// The cells of a field at least that strong, strongest first.
-template <typename Cell>
-std::vector<UTRANTown::Heard<Cell>> heard(
-    const std::vector<Cell>& cells, const RadioField& field, double weakest)
-{
-    std::vector<UTRANTown::Heard<Cell>> result;
-    for (std::size_t i = 0; i < cells.size(); ++i) {
-        if (field.level(i) >= weakest)
-            result.push_back({&cells[i], field.level(i)});
-    }
-    std::sort(result.begin(), result.end(), [](const auto& a, const auto& b) { return a.level > b.level; });
-    return result;
-}
 } // namespace
 
 UTRANTown::UTRANTown()
@@ -135,21 +119,21 @@ bool UTRANTown::step(double position, Randomness& randomness)
     return _selector.step(_field);
 }
 
-UTRANTown::Heard<UTRANCell> UTRANTown::serving() const
+Heard<UTRANCell> UTRANTown::serving() const
 {
     return {&_cells[_selector.serving()], _field.level(_selector.serving())};
 }
 
-std::vector<UTRANTown::Heard<UTRANCell>> UTRANTown::others(double weakest) const
+std::vector<Heard<UTRANCell>> UTRANTown::others(double weakest) const
 {
-    auto result = heard(_cells, _field, weakest);
+    auto result = heardCells(_cells, _field, weakest);
     std::erase_if(result, [this](const auto& each) { return each.cell == serving().cell; });
     return result;
 }
 
-std::vector<UTRANTown::Heard<GSMCell>> UTRANTown::gsmCells(double weakest) const
+std::vector<Heard<GSMCell>> UTRANTown::gsmCells(double weakest) const
 {
-    return heard(_gsmCells, _gsmField, weakest);
+    return heardCells(_gsmCells, _gsmField, weakest);
 }
 
 } // namespace orvex::korat

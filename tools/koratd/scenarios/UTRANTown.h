@@ -1,6 +1,8 @@
 #pragma once
 
 #include "CellSelector.h"
+#include "GSMCell.h"
+#include "HeardCells.h"
 #include "RadioField.h"
 #include "Randomness.h"
 
@@ -18,24 +20,11 @@ struct UTRANCell {
     bool isBarred = false;
 };
 
-struct GSMCell {
-    int arfcn = 0;
-    int networkColorCode = 0;
-    int baseStationColorCode = 0;
-    int cellID = 0;
-};
-
 // The UTRAN cells (in the unpaired band 34, one frequency for both directions) and GSM cells along a road
 // through a town. An underpass has a cell of its own, where nothing else is heard.
 class UTRANTown {
 public:
     static constexpr double kRoadLength = 3600; // m
-
-    template <typename Cell>
-    struct Heard {
-        const Cell* cell = nullptr;
-        double level = 0; // dBm: RSCP, or the GSM carrier's strength
-    };
 
     UTRANTown();
 
