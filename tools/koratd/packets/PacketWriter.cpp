@@ -33,6 +33,11 @@ PacketWriter::PacketWriter(LogCode code, Microseconds time, std::size_t length)
     littleEndian(5, 8, static_cast<std::uint64_t>(time.count()));
 }
 
+void PacketWriter::s8(std::size_t offset, std::int64_t value)
+{
+    littleEndian(offset, 1, static_cast<std::uint64_t>(clampedTo<std::int8_t>(value)));
+}
+
 void PacketWriter::s16(std::size_t offset, std::int64_t value)
 {
     littleEndian(offset, 2, static_cast<std::uint64_t>(clampedTo<std::int16_t>(value)));

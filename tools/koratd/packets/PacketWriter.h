@@ -27,6 +27,7 @@ public:
     void u8(std::size_t offset, std::int64_t value) { unsignedNumber(offset, 1, value); }
     void u16(std::size_t offset, std::int64_t value) { unsignedNumber(offset, 2, value); }
     void u32(std::size_t offset, std::int64_t value) { unsignedNumber(offset, 4, value); }
+    void s8(std::size_t offset, std::int64_t value);
     void s16(std::size_t offset, std::int64_t value);
     void s32(std::size_t offset, std::int64_t value);
     // A field of a bit string that starts at a byte: bit 0 is the lowest bit of that byte, bit 8 the lowest
