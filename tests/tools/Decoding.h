@@ -39,6 +39,8 @@ public:
     Decoding(const Decoding&) = delete;
     Decoding& operator=(const Decoding&) = delete;
 
+    // False for a technology without a generator.
+    bool isPossible() const { return _generator != nullptr; }
     void feed(const Bytes& message) { _generator->updateState(*_state, message); }
 
     // A section with rows as a list of one; a list section record by record.

@@ -27,7 +27,7 @@ TEST(KoratProcess, WrongOptionsEndWithTheUsage)
         const char* complaint;
         QStringList arguments;
     } cases[] = {
-        {"known are: MRL_LTE, MRL_UTRAN2", {"--technology", "MRL_GSM"}},
+        {"known are: MRL_GSM, MRL_LTE, MRL_UTRAN2", {"--technology", "MRL_CDMA"}},
         {"MRL_LTE has no scenario \"sea\"; known are: town", {"--scenario", "sea"}},
         {"--rate", {"--rate", "0"}},
         {"--rate", {"--rate", "fast"}},

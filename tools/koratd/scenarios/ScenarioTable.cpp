@@ -1,5 +1,6 @@
 #include "ScenarioTable.h"
 
+#include "GSMTownScenario.h"
 #include "LTETownScenario.h"
 #include "UTRANTownScenario.h"
 
@@ -15,6 +16,7 @@ std::unique_ptr<Scenario> make(const ScenarioSettings& settings)
 }
 
 constexpr ScenarioEntry kScenarios[] = {
+    {telephony::kTechnologyMRL_GSM, "town", make<GSMTownScenario>},
     {telephony::kTechnologyMRL_LTE, "town", make<LTETownScenario>},
     {telephony::kTechnologyMRL_UTRAN2, "town", make<UTRANTownScenario>},
 };

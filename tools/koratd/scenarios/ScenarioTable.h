@@ -21,7 +21,7 @@ std::span<const ScenarioEntry> scenarioTable();
 // An empty name asks for the technology's default. Null when there is none.
 const ScenarioEntry* findScenario(std::string_view technology, std::string_view name);
 
-// For messages: "MRL_LTE, MRL_UTRAN2", and the names of one technology's scenarios likewise.
+// For messages: "MRL_GSM, MRL_LTE, MRL_UTRAN2", and the names of one technology's scenarios likewise.
 std::string knownTechnologies();
 std::string knownScenarios(std::string_view technology);
 
