@@ -27,5 +27,7 @@ PropertyListResult propertyListFromData(
 
 // The XML form. None when the value holds null, which has no form, or exceeds the limits.
 std::optional<Bytes> propertyListXML(const Value& value, const PropertyListLimits& limits = {});
+// The binary form of the same; none when there is no XML form.
+std::optional<Bytes> propertyListBinary(const Value& value, const PropertyListLimits& limits = {});
 
 } // namespace orvex

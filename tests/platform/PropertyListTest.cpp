@@ -122,6 +122,20 @@ TEST(PropertyList, WritesEachKindAsXML)
     }
 }
 
+TEST(PropertyList, WritesBinaryListsThatAreReadAsTheyWere)
+{
+    const auto list = Dictionary::make({{"z", Array::make({"a<b>&", "\u00e4", "", Array::make()})},
+        {"a", Array::make({kLowest, -1, 255, kHighest, -0.25, true, Date{1794808471}, data({0, 255})})}});
+    const auto binary = propertyListBinary(list);
+    ASSERT_TRUE(binary);
+    EXPECT_TRUE(std::string(binary->begin(), binary->end()).starts_with("bplist00"));
+    const auto read = propertyListFromData(*binary);
+    ASSERT_TRUE(read.value) << read.error;
+    EXPECT_TRUE(*read.value == Value(list));
+    EXPECT_EQ(read.value->dictionary()->begin()->key, "z");
+    EXPECT_FALSE(propertyListBinary(Array::make({Value()})));
+}
+
 TEST(PropertyList, RefusesToWriteWhatHasNoFormOrIsTooLarge)
 {
     Value deepest = Array::make();
