@@ -4,6 +4,7 @@
 
 #include <chrono>
 #include <cstdint>
+#include <optional>
 
 namespace orvex::korat {
 
@@ -17,7 +18,7 @@ using Microseconds = std::chrono::microseconds;
 
 // One message of the log channel, as it goes over the wire.
 struct LogMessage {
-    LogCode code = 0;
+    std::optional<LogCode> code; // none: no packet, but a whole property list
     Bytes bytes;
 };
 

@@ -24,7 +24,7 @@ public:
 
     // The next message; their times never go back.
     virtual Item next() = 0;
-    // The codes of all messages that can come.
+    // The codes of all messages that can come; empty when they carry none.
     virtual std::vector<LogCode> codes() const = 0;
 };
 
