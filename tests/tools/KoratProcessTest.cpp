@@ -27,7 +27,7 @@ TEST(KoratProcess, WrongOptionsEndWithTheUsage)
         const char* complaint;
         QStringList arguments;
     } cases[] = {
-        {"known are: MRL_GSM, MRL_LTE, MRL_UTRAN2", {"--technology", "MRL_CDMA"}},
+        {"known are: MRL_GSM, MRL_LTE, MRL_UTRAN2, MRL_CDMA", {"--technology", "MRL_NOISE"}},
         {"MRL_LTE has no scenario \"sea\"; known are: town", {"--scenario", "sea"}},
         {"--rate", {"--rate", "0"}},
         {"--rate", {"--rate", "fast"}},

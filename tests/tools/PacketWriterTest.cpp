@@ -19,10 +19,12 @@ TEST(PacketWriter, ValuesStayInTheirFieldAndLeaveTheirNeighboursAlone)
     packet.bits(21, 25, 3, -1);   // becomes 0
     packet.bits(21, 28, 4, 0b1001);
     packet.bits(21, 0, 9, 0x101); // written anew
+    packet.s8(26, 200);
+    packet.s8(27, -200);
     const Bytes bytes = packet.take().bytes;
-    EXPECT_THAT(Bytes(bytes.begin(), bytes.begin() + 26),
+    EXPECT_THAT(Bytes(bytes.begin(), bytes.begin() + 29),
         testing::ElementsAre(255, 0x0C, 0x01, 2, 0, 7, 6, 5, 4, 3, 2, 1, 0, // the length is one short
-            255, 0, 0xFF, 0xFF, 0xFF, 0x7F, 0x00, 0x80, 0x01, 0xEB, 0x3F, 0x90, 0));
+            255, 0, 0xFF, 0xFF, 0xFF, 0x7F, 0x00, 0x80, 0x01, 0xEB, 0x3F, 0x90, 0, 0x7F, 0x80, 0));
 }
 
 TEST(PacketWriter, WritingOutsideThePacketIsAFault)

@@ -87,4 +87,9 @@ std::int64_t steps(double value, double origin, double step)
     return std::llround((value - origin) / step);
 }
 
+double ratioOf(double decibels)
+{
+    return std::pow(10, decibels / 10);
+}
+
 } // namespace orvex::korat

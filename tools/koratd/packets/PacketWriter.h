@@ -47,5 +47,7 @@ private:
 
 // The number of steps from the origin to a value, as measurements are coded: steps(-70, -140, 0.25) is 280.
 std::int64_t steps(double value, double origin, double step);
+// The ratio of powers that a number of decibels stands for.
+double ratioOf(double decibels);
 
 } // namespace orvex::korat

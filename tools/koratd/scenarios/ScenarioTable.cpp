@@ -1,5 +1,6 @@
 #include "ScenarioTable.h"
 
+#include "C2KTownScenario.h"
 #include "GSMTownScenario.h"
 #include "LTETownScenario.h"
 #include "UTRANTownScenario.h"
@@ -19,6 +20,7 @@ constexpr ScenarioEntry kScenarios[] = {
     {telephony::kTechnologyMRL_GSM, "town", make<GSMTownScenario>},
     {telephony::kTechnologyMRL_LTE, "town", make<LTETownScenario>},
     {telephony::kTechnologyMRL_UTRAN2, "town", make<UTRANTownScenario>},
+    {telephony::kTechnologyMRL_CDMA, "town", make<C2KTownScenario>},
 };
 
 void append(std::string& list, std::string_view name)

@@ -23,7 +23,11 @@ protected:
     // Computes the state at this moment and emits what it brings.
     virtual void step() = 0;
 
-    void emit(LogMessage message) { _due.push_back({elapsed(), std::move(message)}); }
+    // Messages of one step are emitted in the order of their times, which may lie later within the step.
+    void emit(LogMessage message, Microseconds later = {})
+    {
+        _due.push_back({elapsed() + later, std::move(message)});
+    }
     // The time in packets.
     Microseconds now() const { return _start + elapsed(); }
     Microseconds elapsed() const { return kStep * _stepNumber; }
