@@ -27,7 +27,7 @@ TEST(KoratProcess, WrongOptionsEndWithTheUsage)
         const char* complaint;
         QStringList arguments;
     } cases[] = {
-        {"known are: MRL_GSM, MRL_LTE, MRL_UTRAN2, MRL_CDMA", {"--technology", "MRL_NOISE"}},
+        {"known are: MRL_GSM, MRL_LTE, MRL_UTRAN2, MRL_CDMA, IFX", {"--technology", "MRL_NOISE"}},
         {"MRL_LTE has no scenario \"sea\"; known are: town", {"--scenario", "sea"}},
         {"--rate", {"--rate", "0"}},
         {"--rate", {"--rate", "fast"}},
@@ -73,6 +73,34 @@ TEST(KoratProcess, StreamsWhatWasAskedForAfterTheStartCommand)
 
     client.send(everything());
     EXPECT_TRUE(waitUntil([&] { return client.codes().size() == 9; }));
+}
+
+TEST(KoratProcess, StreamsPacketsWithoutExtraOnesForCDMA2000)
+{
+    const ProgramFolder folder;
+    KoratProgram korat(folder, {"--technology", "MRL_CDMA", "--rate", "2000"});
+    KoratClient client(folder.ports());
+    ASSERT_EQ(client.open(), 0);
+    EXPECT_EQ(client.technology(), Value("MRL_CDMA"));
+    client.send(Dictionary::make({{"SetState", "Streaming"},
+        {"SetMarlinLogCodes",
+            Array::make({0x108A, 0x1183, 0x1192, 0x12B6, 0x119C, 0x119D, 0x127E, 0x134F})}}));
+    EXPECT_TRUE(waitUntil([&] { return client.codes().size() == 8; }));
+}
+
+TEST(KoratProcess, StreamsPropertyListsForIFX)
+{
+    const ProgramFolder folder;
+    KoratProgram korat(folder, {"--technology", "IFX", "--rate", "200"});
+    KoratClient client(folder.ports());
+    ASSERT_EQ(client.open(), 0);
+    EXPECT_EQ(client.technology(), Value("IFX"));
+    client.send(everything());
+    ASSERT_TRUE(waitUntil([&] { return client.messages.size() >= 20; }));
+    for (const Bytes& message : client.messages) {
+        const auto list = propertyListFromData(message);
+        EXPECT_TRUE(list.value && list.value->dictionary()) << list.error;
+    }
 }
 
 TEST(KoratProcess, ServesOneClientAtATime)

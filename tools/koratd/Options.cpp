@@ -121,7 +121,7 @@ OptionsResult optionsFromArguments(const std::vector<std::string>& arguments)
     QCommandLineParser parser;
     parser.setApplicationDescription(
         "Stands in for a handset's telephony service: opens the log channel to a "
-        "monitor and streams a scenario's log packets to it.");
+        "monitor and streams a scenario's log messages to it.");
     parser.addOptions({
         {{"h", "help"}, "Shows this help."},
         {{"v", "version"}, "Shows the version."},

@@ -36,12 +36,14 @@ constexpr C2KSystem kSystems[] = {
 std::vector<RadioField::Transmitter> transmitters()
 {
     std::vector<RadioField::Transmitter> result;
-    for (int i = 0; i < 2 * kSites; ++i) {
-        RadioField::Transmitter transmitter;
-        transmitter.position = 400.0 * (i / 2);
-        transmitter.levelAt20m = -45;
-        transmitter.direction = i % 2 == 0 ? 1 : -1;
-        result.push_back(transmitter);
+    for (int site = 0; site < kSites; ++site) {
+        for (const int direction : {1, -1}) {
+            RadioField::Transmitter transmitter;
+            transmitter.position = 400.0 * site;
+            transmitter.levelAt20m = -45;
+            transmitter.direction = direction;
+            result.push_back(transmitter);
+        }
     }
     return result;
 }

@@ -2,6 +2,7 @@
 
 #include "C2KTownScenario.h"
 #include "GSMTownScenario.h"
+#include "IFXTownScenario.h"
 #include "LTETownScenario.h"
 #include "UTRANTownScenario.h"
 
@@ -21,6 +22,7 @@ constexpr ScenarioEntry kScenarios[] = {
     {telephony::kTechnologyMRL_LTE, "town", make<LTETownScenario>},
     {telephony::kTechnologyMRL_UTRAN2, "town", make<UTRANTownScenario>},
     {telephony::kTechnologyMRL_CDMA, "town", make<C2KTownScenario>},
+    {telephony::kTechnologyIFX, "town", make<IFXTownScenario>},
 };
 
 void append(std::string& list, std::string_view name)

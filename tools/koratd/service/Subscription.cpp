@@ -36,7 +36,8 @@ bool Subscription::isStartCommand(const Dictionary& command)
 
 bool Subscription::wantsAny(const std::vector<LogCode>& codes) const
 {
-    return codes.empty() || std::any_of(codes.begin(), codes.end(), [this](LogCode code) { return wants(code); });
+    return codes.empty()
+        || std::any_of(codes.begin(), codes.end(), [this](LogCode code) { return wants(code); });
 }
 
 } // namespace orvex::korat
