@@ -1,11 +1,15 @@
 // What the CDMA2000 scenario sends, read from the bytes as a receiver does.
 
+#include "packets/C2KForwardLinkPacket.h"
+#include "packets/C2KReverseLinkPacket.h"
+
 #include "ScenarioItems.h"
 
 #include "PacketReader.h"
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cmath>
 #include <map>
 #include <set>
@@ -14,6 +18,14 @@ namespace orvex::korat {
 namespace {
 
 using namespace std::chrono_literals;
+
+constexpr int kForwardBits[] = {128, 256, 512, 1024, 0, 128, 256, 512, 1024, 0, 128, 256, 512, 1024, 0, 128,
+    256, 512, 1024, 0, 128, 256, 512, 1024, 0, 512, 1024, 2048, 0, 128, 256, 512, 1024, 0, 512, 1024, 2048, 0,
+    1024, 3072, 0, 512, 1024, 2048, 0, 4096, 0, 1024, 3072, 0, 4096, 0, 5120, 0, 5120, 0};
+constexpr int kReverseBits[] = {128, 256, 512, 768, 1024, 1536, 2048, 3072, 4096, 6144, 8192, 12288};
+// A wrong weight of the sender would shift the rates too little to be seen in them.
+static_assert(std::ranges::equal(kForwardBits, C2KForwardLinkPacket::kBits));
+static_assert(std::ranges::equal(kReverseBits, C2KReverseLinkPacket::kBits));
 
 class C2KDrive {
 public:
@@ -80,12 +92,6 @@ void C2KDrive::noteRate(const char* measure, std::uint32_t sequence, double bits
 
 void C2KDrive::note(const Scenario::Item& item)
 {
-    static constexpr int kForwardBits[] = {128, 256, 512, 1024, 0, 128, 256, 512, 1024, 0, 128, 256, 512,
-        1024, 0, 128, 256, 512, 1024, 0, 128, 256, 512, 1024, 0, 512, 1024, 2048, 0, 128, 256, 512, 1024, 0,
-        512, 1024, 2048, 0, 1024, 3072, 0, 512, 1024, 2048, 0, 4096, 0, 1024, 3072, 0, 4096, 0, 5120, 0, 5120,
-        0};
-    static constexpr int kReverseBits[] = {
-        128, 256, 512, 768, 1024, 1536, 2048, 3072, 4096, 6144, 8192, 12288};
     static constexpr std::size_t kReverseColumns[] = {0, 4, 8, 12, 288, 292, 296, 300};
 
     const PacketReader packet(item.message.bytes);
