@@ -1,6 +1,6 @@
 #pragma once
 
-#include "scenarios/ScenarioTable.h"
+#include "ScenarioItems.h"
 
 #include <gtest/gtest.h>
 
@@ -11,18 +11,6 @@
 #include <vector>
 
 namespace orvex::korat {
-
-inline constexpr Microseconds kStart{1'700'000'000'000'000};
-
-inline std::vector<Scenario::Item> itemsOf(
-    const ScenarioEntry& entry, Microseconds duration, std::uint64_t seed = 1)
-{
-    std::vector<Scenario::Item> items;
-    const auto scenario = entry.make({seed, kStart});
-    for (auto item = scenario->next(); item.due <= duration; item = scenario->next())
-        items.push_back(std::move(item));
-    return items;
-}
 
 // Between which bounds the least and the most of a measure are expected.
 struct Range {

@@ -50,11 +50,12 @@ void GSMDrive::note(const LogMessage& message)
         {0x4125, 13, "RRC states"}, {0x4157, 13, "ciphering"}, {0x4221, 16, "primary processes"},
         {0x4221, 17, "secondary processes"}, {0x4116, 13, "transport channels"}};
     const PacketReader packet(message.bytes);
-    for (const auto& [code, offset, name] : kBytes) {
-        if (code == message.code)
+    for (const auto& [wanted, offset, name] : kBytes) {
+        if (wanted == message.code)
             kinds[name].insert(packet.u8(offset));
     }
-    switch (message.code) {
+    const LogCode code = message.code.value_or(0);
+    switch (code) {
     case 0x417A: noteSearcher(packet); break;
     case 0x4005: noteRanking(packet); break;
     case 0x4031: noteTransmitPower(packet); break;
@@ -85,9 +86,9 @@ void GSMDrive::note(const LogMessage& message)
             (*(*contexts)[1].dictionary())["State"] == Value("Active") ? 1 : 0);
         break;
     }
-    default: noteGSM(message.code, packet); break;
+    default: noteGSM(code, packet); break;
     }
-    _lastCode = message.code;
+    _lastCode = code;
 }
 
 void GSMDrive::noteGSM(LogCode code, const PacketReader& packet)
