@@ -1,5 +1,7 @@
 #include "MRLLogGenerator2.h"
 
+#include "LogMessage.h"
+
 #include "Array.h"
 #include "SystemLog.h"
 #include "TelephonyConstants.h"
@@ -11,11 +13,6 @@
 namespace orvex {
 
 namespace {
-constexpr std::uint8_t kPrefixMark = 0x81;
-constexpr std::size_t kPrefixLength = 2;
-constexpr std::uint8_t kLogTypeBaseband = 1;
-constexpr std::uint8_t kLogTypeExtra = 255;
-
 // Says that a generator comes into being before the generators below it say so themselves.
 const GeneratorEnvironment& announced(const GeneratorEnvironment& environment, const ClassIndex* cIndex)
 {
@@ -27,7 +24,7 @@ const GeneratorEnvironment& announced(const GeneratorEnvironment& environment, c
 MRLLogGenerator2::MRLLogGenerator2(
     const GeneratorEnvironment& environment, std::string pListName, std::unique_ptr<ClassIndex> cIndex)
     : MRLLogGenerator(announced(environment, cIndex.get()))
-    , _pListName(std::move(pListName))
+    , _template(std::move(pListName))
     , _cIndex(std::move(cIndex))
 {
     const long owners = 1; // this generator alone
@@ -50,21 +47,20 @@ void MRLLogGenerator2::updateState(Dictionary& state, ByteView data)
 
 void MRLLogGenerator2::updateWithData(ByteView data)
 {
-    if (data.size() < kPacketHeaderLength)
+    const LogMessage message(data);
+    if (!message.isComplete())
         return;
-    const Packet packet = data[0] == kPrefixMark ? data.subspan(kPrefixLength) : data;
-    const PacketReader header(packet);
-    const std::uint8_t logType = header.u8(0);
-    if (logType != kLogTypeBaseband && logType != kLogTypeExtra) {
-        systemLog(Priority::error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(logType));
+    const unsigned logType = message.logType();
+    if (logType != LogMessage::kTypeBaseband && logType != LogMessage::kTypeExtra) {
+        systemLog(Priority::error, "Invalid log type: %x. Dropping.", logType);
         return;
     }
-    const LogCode code = header.u16(3) | (logType == kLogTypeExtra ? kExtraCodeBase : 0);
+    const LogCode code = message.logCode();
     const auto* subscribers = _cIndex ? _cIndex->getSubscribers(code) : nullptr;
     if (!subscribers)
         return;
     for (Base* section : *subscribers)
-        section->updateWithData(packet, code);
+        section->updateWithData(message.packet(), code);
 }
 
 Value MRLLogGenerator2::generateLogUsingState(Dictionary& state)
@@ -81,7 +77,7 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
     if (display && display == _boundDisplay.lock())
         return display;
 
-    DictionaryRef skeleton = templateInState(state);
+    DictionaryRef skeleton = _template.in(state);
     if (display && skeleton) {
         // The session went on with a new generator, after the service came back say: the display stays, and
         // the new sections take over where the old ones stopped writing.
@@ -90,9 +86,11 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
         return display;
     }
     if (!skeleton)
-        skeleton = loadTemplate(state);
-    if (!skeleton)
+        skeleton = _template.loadInto(state, environment().resources);
+    if (!skeleton) {
+        systemLog(Priority::error, "Cannot load template for display");
         return {};
+    }
     systemLog(Priority::warning, "Initialized class index: %p, Self: %p",
         static_cast<const void*>(_cIndex.get()), static_cast<const void*>(this));
     if (_cIndex)
@@ -103,25 +101,6 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
     state.set("ExtraInfo", Dictionary::make());
     _boundDisplay = built.dictionary();
     return {}; // deliberately: only the next call gets it
-}
-
-DictionaryRef MRLLogGenerator2::templateInState(const Dictionary& state) const
-{
-    const Value& name = state["TemplateName"];
-    const bool isOwn = name.isNull() || name == Value(_pListName);
-    return isOwn ? state["Template"].dictionary() : nullptr;
-}
-
-DictionaryRef MRLLogGenerator2::loadTemplate(Dictionary& state) const
-{
-    auto skeleton = _pListName.empty() ? nullptr : environment().resources.dictionaryNamed(_pListName);
-    if (!skeleton) {
-        systemLog(Priority::error, "Cannot load template for display");
-        return nullptr;
-    }
-    state.set("Template", skeleton);
-    state.set("TemplateName", _pListName);
-    return skeleton;
 }
 
 Value MRLLogGenerator2::processTemplate(const Value& object)
@@ -146,7 +125,7 @@ Value MRLLogGenerator2::processTemplate(const Value& object)
     systemLog(Priority::error, "Received an object of unknown type");
     systemLog(Priority::warning, "Processing the template");
     throw InvalidTemplateException(
-        text("template %s holds a value of kind %s", _pListName.c_str(), nameOf(object.kind())));
+        text("template %s holds a value of kind %s", _template.name().c_str(), nameOf(object.kind())));
 }
 
 void MRLLogGenerator2::bindToDisplay(const Value& templateObject, const Value& display)

@@ -2,6 +2,7 @@
 
 #include "ClassIndex.h"
 #include "MRLLogGenerator.h"
+#include "StateTemplate.h"
 
 #include <stdexcept>
 
@@ -58,12 +59,8 @@ private:
     void printDict(const Value& object) const;
     void bindToDisplay(const Value& templateObject, const Value& display);
     void bindSection(std::string_view name, const Value& container);
-    // The state's template; null when it has none, or another technology's.
-    DictionaryRef templateInState(const Dictionary& state) const;
-    // The template of the resource, put into the state. Null, with a log line, when there is none.
-    DictionaryRef loadTemplate(Dictionary& state) const;
 
-    std::string _pListName;
+    StateTemplate _template{""};
     std::unique_ptr<ClassIndex> _cIndex;     // null in a generator that was never set up
     std::weak_ptr<Dictionary> _boundDisplay; // whose entries the sections write into
 };

@@ -1,0 +1,35 @@
+#pragma once
+
+#include "PacketReader.h"
+
+namespace orvex {
+
+// The frame of a message on the log channel: at least a packet header long, and, when its first byte is 0x81,
+// with a 2-byte prefix before the packet. The length is that of the message, so a prefixed packet may be two
+// bytes shorter than its header.
+class LogMessage {
+public:
+    static constexpr std::uint8_t kTypeBaseband = 1;
+    static constexpr std::uint8_t kTypeExtra = 255;
+
+    explicit LogMessage(ByteView message)
+        : _isComplete(message.size() >= kPacketHeaderLength)
+        , _packet(_isComplete && message[0] == kPrefixMark ? message.subspan(kPrefixLength) : message)
+    {
+    }
+
+    // False when the message is too short to be looked at.
+    bool isComplete() const { return _isComplete; }
+    Packet packet() const { return _packet.bytes(); }
+    std::uint8_t logType() const { return _packet.u8(0); }
+    LogCode logCode() const { return _packet.u16(3) | (logType() == kTypeExtra ? kExtraCodeBase : 0); }
+
+private:
+    static constexpr std::uint8_t kPrefixMark = 0x81;
+    static constexpr std::size_t kPrefixLength = 2;
+
+    bool _isComplete;
+    PacketReader _packet;
+};
+
+} // namespace orvex

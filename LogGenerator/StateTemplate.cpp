@@ -1,0 +1,37 @@
+#include "StateTemplate.h"
+
+namespace orvex {
+
+namespace {
+constexpr const char* kTemplate = "Template";
+constexpr const char* kTemplateName = "TemplateName";
+} // namespace
+
+bool StateTemplate::isNamedIn(const Dictionary& state) const
+{
+    return state[kTemplateName] == Value(_name);
+}
+
+DictionaryRef StateTemplate::in(const Dictionary& state) const
+{
+    const bool isOwn = state[kTemplateName].isNull() || isNamedIn(state);
+    return isOwn ? state[kTemplate].dictionary() : nullptr;
+}
+
+DictionaryRef StateTemplate::loadInto(Dictionary& state, const Resources& resources) const
+{
+    auto skeleton = _name.empty() ? nullptr : resources.dictionaryNamed(_name);
+    if (skeleton) {
+        state.set(kTemplate, skeleton);
+        state.set(kTemplateName, _name);
+    }
+    return skeleton;
+}
+
+void StateTemplate::removeFrom(Dictionary& state)
+{
+    state.remove(kTemplate);
+    state.remove(kTemplateName);
+}
+
+} // namespace orvex
