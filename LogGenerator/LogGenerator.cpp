@@ -1,5 +1,6 @@
 #include "LogGenerator.h"
 
+#include "C2K/C2KLogGenerator.h"
 #include "GSM/MRL_GSMLogGenerator.h"
 #include "LTE/LTELogGenerator.h"
 #include "UTRAN/UTRANLogGenerator.h"
@@ -44,7 +45,7 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
     static constexpr Choice kChoices[] = {
         {telephony::kTechnologyIFX, nullptr},
         {telephony::kTechnologyMRL_GSM, &MRL_GSMLogGenerator::generator},
-        {telephony::kTechnologyMRL_CDMA, nullptr},
+        {telephony::kTechnologyMRL_CDMA, &C2KLogGenerator::generator},
         {telephony::kTechnologyMRL_LTE, &LTELogGenerator::generator},
         {telephony::kTechnologyMRL_UTRAN2, &UTRANLogGenerator::generator},
     };

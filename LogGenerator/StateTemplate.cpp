@@ -7,14 +7,10 @@ constexpr const char* kTemplate = "Template";
 constexpr const char* kTemplateName = "TemplateName";
 } // namespace
 
-bool StateTemplate::isNamedIn(const Dictionary& state) const
-{
-    return state[kTemplateName] == Value(_name);
-}
-
 DictionaryRef StateTemplate::in(const Dictionary& state) const
 {
-    const bool isOwn = state[kTemplateName].isNull() || isNamedIn(state);
+    const Value& name = state[kTemplateName];
+    const bool isOwn = name.isNull() || name == Value(_name);
     return isOwn ? state[kTemplate].dictionary() : nullptr;
 }
 

@@ -18,8 +18,6 @@ public:
     }
 
     const std::string& name() const { return _name; }
-    // True when the state names this template as the one in use.
-    bool isNamedIn(const Dictionary& state) const;
     // The state's template; null when it has none, or another technology's. One without a name is taken.
     DictionaryRef in(const Dictionary& state) const;
     // The template of the resource, put into the state. Null, and the state as it was, when there is none.

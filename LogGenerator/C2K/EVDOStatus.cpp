@@ -1,0 +1,62 @@
+#include "C2K/EVDOStatus.h"
+
+#include "C2K/BandClass.h"
+#include "C2K/LogCode_0x1183.h"
+#include "EnumTable.h"
+
+#include "SystemLog.h"
+#include "TextFormat.h"
+
+namespace orvex {
+
+namespace {
+
+constexpr int kAccess = 4;
+
+constexpr EnumText kDeviceStates[] = {{0, "Inactive [0]"}, {1, "Acquisition [1]"}, {2, "Sync [2]"},
+    {3, "Idle [3]"}, {kAccess, "Access [4]"}, {5, "Connected [5]"}};
+
+constexpr EnumText kSessionStates[] = {{0, "Closed [0]"}, {1, "AMP setup [1]"}, {2, "AT-initiated neg [2]"},
+    {3, "Initiated neg [3]"}, {4, "Open [4]"}};
+
+std::string stateText(int value, std::span<const EnumText> states)
+{
+    const char* name = textFor(value, states, nullptr);
+    return name ? name : text("[Reserved %d]", value);
+}
+
+// Antenna 1 and the transmitter are off outside access and connection, and their fields left over.
+std::string powerText(int dBm, bool isOn)
+{
+    return isOn ? text("%+d dBm", dBm) : "N/A";
+}
+
+std::string pnOffsetText(int offset)
+{
+    return offset == LogCode_0x1183::kNoPNOffset ? "Invalid Value" : text("%d × 64chips", offset);
+}
+
+} // namespace
+
+void EVDOStatus::decode(Packet packet, Dictionary&, const Publisher& publisher)
+{
+    if (packet.size() != LogCode_0x1183::kLength) {
+        systemLog(Priority::error, "Log code 0x1183 is %u bytes long but should be %lu bytes.",
+            static_cast<unsigned>(packet.size()), static_cast<unsigned long>(LogCode_0x1183::kLength));
+        return;
+    }
+    const LogCode_0x1183 status(packet);
+    const bool transmits = status.deviceState() >= kAccess;
+    publisher.print("kChannel", "%d", status.channel());
+    publisher.publish("k1xEVDODeviceState", stateText(status.deviceState(), kDeviceStates));
+    publisher.publish("kBandClass", bandClassText(status.bandClass()));
+    publisher.publish("kRxAGC0", powerText(status.rxAGC0(), true));
+    publisher.publish("kRxAGC1", powerText(status.rxAGC1(), transmits));
+    publisher.publish("kTxAGC", powerText(status.txAGC(), transmits));
+    publisher.publish("kServingPNOffset", pnOffsetText(status.servingPNOffset()));
+    publisher.publish("kSessionState", stateText(status.sessionState(), kSessionStates));
+    publisher.print("kUATI24", "0x%06x", status.uati24());
+    publisher.print("kColorCode", "%d", status.colorCode());
+}
+
+} // namespace orvex

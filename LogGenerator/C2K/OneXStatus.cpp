@@ -1,0 +1,120 @@
+#include "C2K/OneXStatus.h"
+
+#include "C2K/BandClass.h"
+#include "C2K/LogCode_0x119C.h"
+#include "C2K/LogCode_0x119C_ActiveSet.h"
+#include "C2K/PacketLength.h"
+#include "C2K/PilotList.h"
+#include "C2K/TrafficFER.h"
+#include "EnumTable.h"
+
+#include "TextFormat.h"
+
+namespace orvex {
+
+namespace {
+
+constexpr int kTraffic = 8;
+
+constexpr EnumText kDeviceStates[] = {
+    {0, "Inactive [0]"},
+    {1, "Deep sleep in start state [1]"},
+    {2, "Initial state for CDMA operation [2]"},
+    {3, "Acquisition [3]"},
+    {4, "Sync [4]"},
+    {5, "Slew [5]"},
+    {6, "Paging [6]"},
+    {7, "Slotted mode sleep state [7]"},
+    {kTraffic, "Traffic [8]"},
+    {9, "UnSlew [9]"},
+    {10, "Operation in PCG state [10]"},
+    {11, "Powerup state [11]"},
+};
+
+// Rows of what works in traffic alone.
+constexpr const char* kTrafficRows[] = {"k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1", "k1xTxAGC"};
+
+std::string deviceStateText(int state)
+{
+    const char* name = textFor(state, kDeviceStates, nullptr);
+    return name ? name : text("[Bad Value %d]", state);
+}
+
+std::string channelText(int channel)
+{
+    return text("%d", channel);
+}
+
+std::string powerText(double dBm)
+{
+    return text("%+.2f dBm", dBm);
+}
+
+// A field that the packet does not hold leaves its row as it is.
+template <typename Field>
+void publishField(const Publisher& publisher, const char* internalKey, const std::optional<Field>& field,
+    std::string (*textOf)(Field))
+{
+    if (field)
+        publisher.publish(internalKey, textOf(*field));
+}
+
+void publishTrafficRows(const LogCode_0x119C::RF& rf, const Publisher& publisher)
+{
+    publishField(publisher, "k1xRx1BandClass", rf.rx1BandClass(), bandClassText);
+    publishField(publisher, "k1xRx1ChanNum", rf.rx1Channel(), channelText);
+    publishField(publisher, "k1xRxAGC1", rf.rx1AGC(), powerText);
+    publishField(publisher, "k1xTxAGC", rf.txAGC(), powerText);
+}
+
+void publishActiveSet(const LogCode_0x119C_ActiveSet& set, const Publisher& publisher)
+{
+    if (!set.isReadable())
+        return;
+    PilotList pilots;
+    for (int index = 0; index < set.count(); ++index) {
+        const auto pilot = set.pilot(index);
+        if (!pilot)
+            break;
+        const char* mark = pilot->pn == set.referencePN() ? "(ref pilot) " : "";
+        pilots.add(index, pilot->pn, mark + decibelText(pilot->strength));
+    }
+    publisher.publish("k1xActiveSetInfo", pilots.rows());
+}
+
+} // namespace
+
+void OneXStatus::decode(Packet packet, Dictionary& state, const Publisher& publisher)
+{
+    if (!hasMinimumLength<LogCode_0x119C>(packet))
+        return;
+    const LogCode_0x119C status(packet);
+    const auto systemState = status.systemState();
+    const auto rf = status.rf();
+    const auto activeSet = status.activeSet();
+    const auto fingerInfo = status.fingerInfo();
+    if (!systemState || !rf || !activeSet || !fingerInfo) {
+        systemLog(Priority::warning, "Log code 0x119c: missing subpacket (ss=%d,rf=%d,ai=%d,fi=%d).",
+            systemState ? 1 : 0, rf ? 1 : 0, activeSet ? 1 : 0, fingerInfo ? 1 : 0);
+        return;
+    }
+    const auto deviceState = LogCode_0x119C::SystemState(*systemState).deviceState();
+    publishField(publisher, "k1xDeviceState", deviceState, deviceStateText);
+
+    const LogCode_0x119C::RF radio(*rf);
+    publishField(publisher, "k1xRx0BandClass", radio.rx0BandClass(), bandClassText);
+    publishField(publisher, "k1xRx0ChanNum", radio.rx0Channel(), channelText);
+    publishField(publisher, "k1xRxAGC0", radio.rx0AGC(), powerText);
+    if (deviceState == kTraffic) {
+        publishTrafficRows(radio, publisher);
+    } else if (deviceState) {
+        for (const char* row : kTrafficRows)
+            publisher.publish(row, "N/A");
+    }
+
+    publishActiveSet(LogCode_0x119C_ActiveSet(*activeSet), publisher);
+    if (deviceState && deviceState != kTraffic)
+        TrafficFER(state, publisher).endTraffic();
+}
+
+} // namespace orvex

@@ -1,0 +1,63 @@
+#include "C2K/OneXSystemIdentity.h"
+
+#include "C2K/LogCode_0x134F.h"
+#include "C2K/PacketLength.h"
+#include "EnumTable.h"
+
+#include "TextFormat.h"
+
+namespace orvex {
+
+namespace {
+
+// Enhanced roaming indicator.
+constexpr EnumText kRoamingIndicators[] = {
+    {0, "OFF [0]"},
+    {1, "ON [1]"},
+    {2, "Flashing [2]"},
+    {3, "Out of Neighborhood [3]"},
+    {4, "Out of Building [4]"},
+    {5, "Preferred system [5]"},
+    {6, "Available system [6]"},
+    {7, "Alliance partner [7]"},
+    {8, "Premium partner [8]"},
+    {9, "Full service functionality [9]"},
+    {10, "Partial service functionality [10]"},
+    {11, "Banner ON [11]"},
+    {12, "Banner OFF [12]"},
+};
+
+std::string roamingText(int indicator)
+{
+    const char* name = textFor(indicator, kRoamingIndicators, nullptr);
+    return name ? name : text("ERI - %d", indicator);
+}
+
+} // namespace
+
+void OneXSystemIdentity::decode(Packet packet, Dictionary&, const Publisher& publisher)
+{
+    if (!hasMinimumLength<LogCode_0x134F>(packet))
+        return;
+    const LogCode_0x134F identity(packet);
+    if (identity.version() < LogCode_0x134F::kLowestVersion) {
+        systemLog(Priority::error,
+            "Log code 0x134f has version=%d; only version 2 or higher expected; dropping.",
+            identity.version());
+        return;
+    }
+    publisher.publish("k1xRoamingHome", roamingText(identity.roamingIndicator()));
+    if (identity.systemType() == LogCode_0x134F::kSystemTypeCDMA) {
+        publisher.print("kSystemId", "%d", identity.systemIdentity());
+        publisher.print("kNetworkId", "%d", identity.networkIdentity());
+    } else {
+        for (const char* row : {"kSystemId", "kNetworkId"})
+            publisher.print(row, "(unknown system type %d)", identity.systemType());
+    }
+    publisher.print("kPacketZoneId", "%d", identity.packetZoneIdentity());
+    if (const auto base = identity.baseIdentity())
+        publisher.print("kBaseId", "%d", *base);
+    publisher.print("kProtocolRevision", "%d", identity.protocolRevision());
+}
+
+} // namespace orvex
