@@ -1,6 +1,7 @@
 #include "LogGenerator.h"
 
 #include "C2K/C2KLogGenerator.h"
+#include "GSM/GSMLogGenerator.h"
 #include "GSM/MRL_GSMLogGenerator.h"
 #include "LTE/LTELogGenerator.h"
 #include "UTRAN/UTRANLogGenerator.h"
@@ -43,7 +44,7 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
         Maker generator; // null while this build does not decode the technology
     };
     static constexpr Choice kChoices[] = {
-        {telephony::kTechnologyIFX, nullptr},
+        {telephony::kTechnologyIFX, &GSMLogGenerator::generator},
         {telephony::kTechnologyMRL_GSM, &MRL_GSMLogGenerator::generator},
         {telephony::kTechnologyMRL_CDMA, &C2KLogGenerator::generator},
         {telephony::kTechnologyMRL_LTE, &LTELogGenerator::generator},
