@@ -1,4 +1,6 @@
 #include "LogGenerator.h"
+#include "C2K/C2KLogGenerator.h"
+#include "GSM/GSMLogGenerator.h"
 #include "GSM/MRL_GSMLogGenerator.h"
 #include "LTE/LTELogGenerator.h"
 #include "UTRAN/UTRANLogGenerator.h"
@@ -26,6 +28,10 @@ TEST(LogGenerator, ChoosesByTheTextOfTheTechnology)
     EXPECT_NE(dynamic_cast<MRL_GSMLogGenerator*>(gsm.get()), nullptr);
     const auto utran = LogGenerator::generatorFromTechnology(telephony::kTechnologyMRL_UTRAN2, environment);
     EXPECT_NE(dynamic_cast<UTRANLogGenerator*>(utran.get()), nullptr);
+    const auto c2k = LogGenerator::generatorFromTechnology(telephony::kTechnologyMRL_CDMA, environment);
+    EXPECT_NE(dynamic_cast<C2KLogGenerator*>(c2k.get()), nullptr);
+    const auto ifx = LogGenerator::generatorFromTechnology(telephony::kTechnologyIFX, environment);
+    EXPECT_NE(dynamic_cast<GSMLogGenerator*>(ifx.get()), nullptr);
     for (const Value& unknown : {Value("MRL_LTE "), Value("mrl_lte"), Value(""), Value(), Value(1)})
         EXPECT_EQ(LogGenerator::generatorFromTechnology(unknown, environment), nullptr);
 }

@@ -1,3 +1,4 @@
+#include "C2K/C2KFixture.h"
 #include "GSM/MRL_GSMClassIndex.h"
 #include "LTE/LTEClassIndex.h"
 #include "UTRAN/UTRANClassIndex.h"
@@ -202,6 +203,35 @@ TEST(Template, LaysOutTheRowsThatItsSectionsWrite)
     expectRows<LTEClassIndex>("LTE", {{"Serving Cell Info", {"UARFCN"}}});
     expectRows<UTRANClassIndex>("MRL_UTRAN2", {});
     expectRows<MRL_GSMClassIndex>("MRL_GSM", {{"UMTS RR Info", {"UARFCN"}}});
+}
+
+// The texts of a template of texts and dictionaries.
+void collectTexts(const Dictionary& dictionary, std::set<std::string>& texts)
+{
+    for (const auto& entry : dictionary) {
+        if (const auto section = entry.value.dictionary())
+            collectTexts(*section, texts);
+        else
+            texts.insert(*entry.value.string());
+    }
+}
+
+TEST(Template, OfCDMA2000NamesTheKeysThatItsDecodersPublish)
+{
+    std::set<std::string> named;
+    collectTexts(*readTemplate("C2KTemplate"), named);
+    EXPECT_EQ(named, (std::set<std::string>(kInternalKeys.begin(), kInternalKeys.end())));
+
+    C2KFixture fixture;
+    const Bytes frame(30, 1);
+    for (const Bytes& bytes :
+        {packet(0x1183, Bytes(37)), packet(0x12B6, Bytes(12)), packet(0x108A, Bytes(10)),
+            packet(0x134F, Bytes(173, 2)), packet(0x1192, Bytes(228)), packet(0x127E, Bytes(1737)),
+            packetOf(
+                0x119C, {subpacket(1, frame), subpacket(2, frame), subpacket(3, frame), subpacket(4, {})}),
+            packetOf(0x119D, {subpacket(11, frame)})})
+        fixture.feed(bytes);
+    EXPECT_EQ(rowNames(*fixture.display), named) << "each has its decoder";
 }
 
 } // namespace

@@ -2,7 +2,10 @@
 
 #include "PacketReader.h"
 
+#include <algorithm>
 #include <string_view>
+#include <utility>
+#include <vector>
 
 namespace orvex::test {
 
@@ -15,6 +18,20 @@ inline Bytes packet(LogCode code, const Bytes& payload)
     result[3] = static_cast<std::uint8_t>(code);
     result[4] = static_cast<std::uint8_t>(code >> 8);
     result.insert(result.end(), payload.begin(), payload.end());
+    return result;
+}
+
+// A packet of that length with these bytes at these offsets, both counted from packet byte 0, as far as they
+// fit. What is not given is 0xEE.
+inline Bytes packetWith(
+    LogCode code, std::size_t length, const std::vector<std::pair<std::size_t, Bytes>>& fields)
+{
+    Bytes result = packet(code, {});
+    for (const auto& [offset, bytes] : fields) {
+        result.resize(std::max(result.size(), offset + bytes.size()), 0xEE);
+        std::ranges::copy(bytes, result.begin() + static_cast<std::ptrdiff_t>(offset));
+    }
+    result.resize(length, 0xEE);
     return result;
 }
 

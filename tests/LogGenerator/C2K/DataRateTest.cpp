@@ -1,0 +1,111 @@
+// Decoders of the forward and reverse link's data rates.
+
+#include "C2KFixture.h"
+
+namespace orvex::test {
+namespace {
+
+using Lines = std::vector<std::string>;
+
+Bytes littleEndian(std::uint32_t value)
+{
+    return {static_cast<std::uint8_t>(value), static_cast<std::uint8_t>(value >> 8),
+        static_cast<std::uint8_t>(value >> 16), static_cast<std::uint8_t>(value >> 24)};
+}
+
+// One packet counter that stands for 128 bits, the others at zero.
+Bytes forward(std::uint32_t sequence, std::uint32_t packets)
+{
+    return packetWith(
+        0x1192, 241, {{13, littleEndian(sequence)}, {17, Bytes(224)}, {17, littleEndian(packets)}});
+}
+Bytes reverse(std::uint32_t sequence, std::uint32_t packets)
+{
+    return packetWith(
+        0x127E, 1750, {{14, littleEndian(sequence)}, {18, Bytes(1732)}, {18, littleEndian(packets)}});
+}
+
+struct Link {
+    const char* prefix;
+    Bytes (*packet)(std::uint32_t sequence, std::uint32_t packets);
+};
+constexpr Link kLinks[] = {{"FL", forward}, {"RL", reverse}};
+
+TEST(DataRate, IsThatSinceThePacketBefore)
+{
+    const struct {
+        const char* name;
+        std::uint32_t sequence;
+        std::uint32_t packets;
+        const char* rate;
+    } steps[] = {
+        {"first", 10, 0, ""},
+        {"two steps on", 12, 64, "4.00 kbps"},
+        {"rounded", 15, 65, "0.04 kbps"},
+        {"same sequence number", 15, 165, "0.04 kbps"},
+        {"backwards", 13, 265, "0.04 kbps"},
+        {"since the packet that showed none", 14, 273, "1.00 kbps"},
+        {"fewer packets", 16, 173, "-6.25 kbps"},
+        {"half the range on, as a step back", 0x80000010, 500, "-6.25 kbps"},
+        {"across the sign", 0x7FFFFFFF, 500, "-6.25 kbps"},
+        {"and over it", 0x80000001, 516, "1.00 kbps"},
+        {"to the last", 0xFFFFFFFF, 516, "0.00 kbps"},
+        {"wrapped", 1, 532, "1.00 kbps"},
+        {"counter at its highest", 2, 0xFFFFFFFF, "536870845.38 kbps"},
+    };
+    for (const Link& link : kLinks) {
+        C2KFixture fixture;
+        fixture.state.set("ExtraInfo", Dictionary::make());
+        const std::string key = std::string("k") + link.prefix + "DataRate";
+        for (const auto& [name, sequence, packets, rate] : steps) {
+            fixture.feed(link.packet(sequence, packets));
+            EXPECT_EQ(textOf(rowsOf(fixture.display), key.c_str()), rate) << link.prefix << ": " << name;
+        }
+        EXPECT_EQ(fixture.log.take(), Lines{});
+    }
+}
+
+TEST(DataRate, CountersGoIntoStateAndSnapshot)
+{
+    for (const Link& link : kLinks) {
+        C2KFixture fixture;
+        const auto extraInfo = Dictionary::make();
+        fixture.state.set("ExtraInfo", extraInfo);
+        const auto named = [&link](const char* name) { return link.prefix + std::string(name); };
+        fixture.feed(link.packet(0xFFFFFFFE, 1));
+        EXPECT_EQ(*extraInfo, Dictionary({{named("DataSeqNum1"), -2}, {named("DataSent1"), 128}}));
+        fixture.feed(link.packet(0xFFFFFFFE, 3));
+        EXPECT_EQ(*extraInfo,
+            Dictionary({{named("DataSeqNum1"), -2}, {named("DataSent1"), 384}, {named("DataSeqNum2"), -2},
+                {named("DataSent2"), 128}}))
+            << "without a rate too";
+        EXPECT_EQ(fixture.state[named("DataSeqNum")], Value(-2));
+        EXPECT_EQ(fixture.state[named("DataSent")], Value(384));
+    }
+}
+
+TEST(DataRate, WeighsEachCounterByItsPacketSize)
+{
+    Bytes flat = forward(1, 0);
+    for (std::size_t format = 0; format < 56; ++format)
+        flat[17 + 4 * format] = static_cast<std::uint8_t>(format + 1);
+    C2KFixture fixture;
+    fixture.feed(flat);
+    EXPECT_EQ(fixture.state["FLDataSent"], Value(1886592));
+
+    // Every number has a value of its own, those between the counters included.
+    Bytes mixed = reverse(1, 0);
+    for (std::size_t offset = 18; offset + 4 <= mixed.size(); offset += 4)
+        std::ranges::copy(littleEndian(static_cast<std::uint32_t>(offset * offset % 9973)),
+            mixed.begin() + static_cast<std::ptrdiff_t>(offset));
+    fixture.feed(mixed);
+    EXPECT_EQ(fixture.state["RLDataSent"], Value(4919904768));
+
+    fixture.feed(packetWith(0x1192, 241, {{17, Bytes(224, 0xFF)}}));
+    EXPECT_EQ(fixture.state["FLDataSent"], Value(std::int64_t{48896} * 0xFFFFFFFF));
+    fixture.feed(packetWith(0x127E, 1750, {{18, Bytes(1732, 0xFF)}}));
+    EXPECT_EQ(fixture.state["RLDataSent"], Value(std::int64_t{24} * 40064 * 0xFFFFFFFF));
+}
+
+} // namespace
+} // namespace orvex::test
