@@ -92,7 +92,7 @@ DictionaryRef C2KLogGenerator::getDisplayFromState(Dictionary& state, const Reso
     const StateTemplate ownTemplate("C2KTemplate");
     auto skeleton = ownTemplate.in(state);
     auto display = state["Display"].dictionary();
-    if (display && skeleton && state["Lookup"].dictionary())
+    if (display && skeleton)
         return display;
     if (!skeleton)
         skeleton = ownTemplate.loadInto(state, resources);

@@ -2,8 +2,6 @@
 
 #include "C2KFixture.h"
 
-#include <gmock/gmock.h>
-
 namespace orvex::test {
 namespace {
 
