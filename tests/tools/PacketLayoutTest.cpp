@@ -10,30 +10,12 @@
 #include "packets/UTRANServingCellPacket.h"
 #include "packets/UTRANTransportChannelPacket.h"
 
-#include "Decoding.h"
-
-#include <gtest/gtest.h>
+#include "ExpectRows.h"
 
 namespace orvex::korat {
 namespace {
 
 constexpr Microseconds kTime{1};
-
-struct LayoutCase {
-    LogMessage message;
-    const char* section;
-    std::vector<test::RowTexts> rows;
-};
-
-// What goes in as engineering values comes out of the receiver's own decoders as text.
-void expectRows(const char* technology, const std::vector<LayoutCase>& cases)
-{
-    for (const auto& [message, section, rows] : cases) {
-        test::Decoding decoding(technology);
-        decoding.feed(message.bytes);
-        EXPECT_EQ(decoding.rows(section), rows) << section;
-    }
-}
 
 TEST(PacketLayout, OfLTE)
 {
