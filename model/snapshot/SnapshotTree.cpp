@@ -4,9 +4,6 @@
 
 namespace orvex {
 
-namespace {
-
-// Rows of one name would hide each other: from the second on they are numbered.
 void setUnderFreeName(Dictionary& rows, const std::string& name, const Value& value)
 {
     std::string free = name;
@@ -15,13 +12,11 @@ void setUnderFreeName(Dictionary& rows, const std::string& name, const Value& va
     rows.set(free, value);
 }
 
-std::string describe(const Dictionary& entry)
+std::string snapshotEntryName(const Dictionary& entry)
 {
     const std::string* description = entry["Description"].string();
     return description ? *description : "(no description)";
 }
-
-} // namespace
 
 OrvexModelNodeRef snapshotTree(const Snapshot& snapshot)
 {
@@ -30,7 +25,7 @@ OrvexModelNodeRef snapshotTree(const Snapshot& snapshot)
     for (const Value& element : *snapshot.data) {
         const Dictionary& entry = *element.dictionary();
         if (const Value& display = entry["Display"]; display.dictionary() || display.array())
-            setUnderFreeName(rows, describe(entry), display);
+            setUnderFreeName(rows, snapshotEntryName(entry), display);
         if (const BytesRef dlf = entry["DLF"].data())
             dlfBytes += dlf->size();
     }

@@ -5,6 +5,7 @@
 #include <QCommandLineParser>
 
 #include <algorithm>
+#include <fstream>
 
 namespace orvex {
 
@@ -19,6 +20,17 @@ DecodeOptions wrongUsage(const QString& error)
     result.action = DecodeOptions::Action::wrongUsage;
     result.error = error.toStdString();
     return result;
+}
+
+// A property list, or what is called a snapshot whatever it is.
+bool isSnapshotFile(const std::string& path)
+{
+    if (path.ends_with(".orvex"))
+        return true;
+    std::string beginning(6, '\0');
+    std::ifstream(path, std::ios::binary)
+        .read(beginning.data(), static_cast<std::streamsize>(beginning.size()));
+    return beginning.starts_with("<?xml") || beginning.starts_with("<plist") || beginning == "bplist";
 }
 
 std::optional<std::string> valueOf(const QCommandLineParser& parser, const QCommandLineOption& option)
@@ -43,8 +55,12 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
     const QCommandLineOption resources = withValue("resources");
     const QCommandLineOption output = withValue("output");
     const QCommandLineOption log = withValue("log");
+    const QCommandLineOption snapshot = withValue("snapshot");
+    const QCommandLineOption description = withValue("description");
+    const QCommandLineOption dlf = withValue("dlf");
     QCommandLineParser parser;
-    parser.addOptions({help, version, technology, format, refreshEvery, resources, output, log});
+    parser.addOptions({help, version, technology, format, refreshEvery, resources, output, log, snapshot,
+        description, dlf});
 
     QStringList list;
     for (int i = 0; i < count; ++i)
@@ -59,9 +75,18 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
         return result;
     }
     result.technology = parser.value(technology).toStdString();
-    if (result.technology.empty())
+    for (const QString& capture : parser.positionalArguments())
+        result.captures.push_back(capture.toLocal8Bit().toStdString());
+    if (result.captures.empty())
+        return wrongUsage(QStringLiteral("No capture is named."));
+    const auto snapshots = std::ranges::count_if(result.captures, isSnapshotFile);
+    result.areSnapshots = snapshots > 0;
+    if (result.areSnapshots && snapshots < std::ssize(result.captures))
+        return wrongUsage(QStringLiteral("Snapshots and captures do not go together."));
+    if (result.technology.empty() && !result.areSnapshots)
         return wrongUsage(QStringLiteral("--technology is missing."));
-    if (std::ranges::find(kTechnologies, result.technology) == std::end(kTechnologies))
+    if (!result.technology.empty()
+        && std::ranges::find(kTechnologies, result.technology) == std::end(kTechnologies))
         return wrongUsage(QStringLiteral("Unknown technology '%1'.").arg(parser.value(technology)));
     if (parser.isSet(format)) {
         if (parser.value(format) == QLatin1String("json"))
@@ -78,19 +103,28 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
     result.resources = valueOf(parser, resources);
     result.outputFile = valueOf(parser, output);
     result.logFile = valueOf(parser, log);
-    for (const QString& capture : parser.positionalArguments())
-        result.captures.push_back(capture.toLocal8Bit().toStdString());
-    if (result.captures.empty())
-        return wrongUsage(QStringLiteral("No capture is named."));
+    result.snapshotFile = valueOf(parser, snapshot);
+    result.description = parser.value(description).toStdString();
+    result.dlfFile = valueOf(parser, dlf);
+    if (result.snapshotFile && result.areSnapshots)
+        return wrongUsage(QStringLiteral("--snapshot saves what captures hold, not another snapshot."));
+    if (parser.isSet(description) && !result.snapshotFile)
+        return wrongUsage(QStringLiteral("--description goes with --snapshot."));
+    if (result.dlfFile && (!result.areSnapshots || result.captures.size() > 1))
+        return wrongUsage(QStringLiteral("--dlf takes the binary log out of one snapshot."));
     return result;
 }
 
 const char* DecodeOptions::usage()
 {
     return "Usage: orvex-decode --technology T [options] CAPTURE...\n"
+           "       orvex-decode [--technology T] [options] SNAPSHOT...\n"
            "Decodes the log messages of captures, in order, and prints the display tree.\n"
+           "Of snapshots it prints what they store; with --technology also what their raw\n"
+           "messages are decoded to now.\n"
            "\n"
-           "A capture is a pcap file with link type 147 (USER0), one log message per packet.\n"
+           "A capture is a pcap file with link type 147 (USER0), one log message per packet, or\n"
+           "a DLF file. A snapshot is an .orvex file.\n"
            "T is IFX, MRL_GSM, MRL_CDMA, MRL_LTE or MRL_UTRAN2.\n"
            "\n"
            "Options:\n"
@@ -100,6 +134,9 @@ const char* DecodeOptions::usage()
            "  --output FILE        Print into this file.\n"
            "  --log FILE           Write every line of the system log into this file, as\n"
            "                       <PRIORITY>TEXT.\n"
+           "  --snapshot FILE      Save the session at its end as a snapshot.\n"
+           "  --description TEXT   What to say in the snapshot.\n"
+           "  --dlf FILE           Write the binary log of the snapshot into this file.\n"
            "  --resources DIR      Take the section templates from this directory.\n"
            "  -h, --help           Show this help and exit.\n"
            "  -v, --version        Show the version and exit.\n";

@@ -16,10 +16,4 @@ void OfflineSession::take(ByteView message)
         _generator->generateLogUsingState(_state);
 }
 
-OrvexModelNodeRef OfflineSession::finish()
-{
-    NodesByPath nodesByPath;
-    return OrvexModelNode::makeTreeFromObject(_generator->generateLogUsingState(_state), nodesByPath);
-}
-
 } // namespace orvex

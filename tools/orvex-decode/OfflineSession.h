@@ -1,7 +1,6 @@
 #pragma once
 
 #include "LogGenerator.h"
-#include "OrvexModelNode.h"
 
 #include <memory>
 
@@ -11,12 +10,14 @@ namespace orvex {
 // the refresh of a live session does.
 class OfflineSession {
 public:
-    // With `refreshEvery` 0 the display is asked for by finish() alone.
+    // With `refreshEvery` 0 the display is asked for by display() alone.
     OfflineSession(std::unique_ptr<LogGenerator> generator, std::size_t refreshEvery);
 
     void take(ByteView message);
-    // Asks for the display once more and returns its tree.
-    OrvexModelNodeRef finish();
+    // Asks for the display once more.
+    Value display() { return _generator->generateLogUsingState(_state); }
+    // What a snapshot of the session stores.
+    ArrayRef saveContents() const { return _generator->getSaveContentsFromState(_state); }
 
     std::size_t messageCount() const { return _messageCount; }
 

@@ -22,9 +22,14 @@ Json jsonOf(const OrvexModelNode& node, const std::string& path)
 }
 } // namespace
 
-std::string treeJson(const OrvexModelNode& root)
+Json treeJson(const OrvexModelNode& root)
 {
-    return jsonOf(root, "/").dump(2, ' ', false, Json::error_handler_t::replace) + "\n";
+    return jsonOf(root, "/");
+}
+
+std::string documentText(const Json& document)
+{
+    return document.dump(2, ' ', false, Json::error_handler_t::replace) + "\n";
 }
 
 } // namespace orvex

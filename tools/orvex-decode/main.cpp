@@ -2,6 +2,7 @@
 #include "DecodeOptions.h"
 #include "OfflineSession.h"
 #include "Progress.h"
+#include "SnapshotDocument.h"
 #include "TreeJson.h"
 
 #include "DisplayTreePrinter.h"
@@ -11,6 +12,9 @@
 #include "SystemClock.h"
 
 #include "Console.h"
+#include "Snapshot.h"
+
+#include <nlohmann/json.hpp>
 
 #include <cerrno>
 #include <cstdio>
@@ -50,30 +54,58 @@ bool feed(OfflineSession& session, const std::string& path, Progress& progress)
         reader->error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
 }
 
-bool print(const OrvexModelNode& root, const DecodeOptions& options)
+bool write(const std::string& path, std::string_view content)
 {
-    const std::string document =
-        options.format == DecodeOptions::Format::json ? treeJson(root) : DisplayTreePrinter::text(root);
-    if (!options.outputFile) {
-        std::cout << document << std::flush;
-        return std::cout ? true : complain("standard output: could not be written");
-    }
-    std::ofstream file(*options.outputFile, std::ios::binary);
-    file << document << std::flush;
-    return file ? true : complain(*options.outputFile + ": " + std::strerror(errno));
+    std::ofstream file(path, std::ios::binary);
+    file << content << std::flush;
+    return file ? true : complain(path + ": " + std::strerror(errno));
 }
 
-int decode(const DecodeOptions& options)
+bool print(const std::string& document, const DecodeOptions& options)
 {
-    const FileResources resources(options.resources.value_or(FileResources::defaultDirectory()));
-    const SystemClock clock;
-    auto generator = LogGenerator::generatorFromTechnology(
-        options.technology, GeneratorEnvironment{resources, clock, ORVEX_VERSION});
-    if (!generator) {
-        complain("this build does not decode " + options.technology);
-        return kFailure;
+    if (options.outputFile)
+        return write(*options.outputFile, document);
+    std::cout << document << std::flush;
+    return std::cout ? true : complain("standard output: could not be written");
+}
+
+std::string textOf(const Value& display, DecodeOptions::Format format)
+{
+    NodesByPath paths;
+    const auto tree = OrvexModelNode::makeTreeFromObject(display, paths);
+    return format == DecodeOptions::Format::json ? documentText(treeJson(*tree))
+                                                 : DisplayTreePrinter::text(*tree);
+}
+
+// What decoding takes from the platform.
+struct Platform {
+    explicit Platform(const DecodeOptions& options)
+        : resources(options.resources.value_or(FileResources::defaultDirectory()))
+    {
     }
-    OfflineSession session(std::move(generator), options.refreshEvery);
+
+    std::unique_ptr<LogGenerator> generatorFor(const std::string& technology) const
+    {
+        return LogGenerator::generatorFromTechnology(
+            technology, GeneratorEnvironment{resources, clock, ORVEX_VERSION});
+    }
+
+    FileResources resources;
+    SystemClock clock;
+};
+
+bool save(const OfflineSession& session, Date begun, const DecodeOptions& options)
+{
+    const Snapshot snapshot{dateText(begun), session.saveContents(), options.description};
+    return writeSnapshot(snapshot, *options.snapshotFile)
+        || complain(*options.snapshotFile + ": the snapshot could not be written");
+}
+
+int decodeCaptures(const DecodeOptions& options)
+{
+    const Platform platform(options);
+    const Date begun = platform.clock.now();
+    OfflineSession session(platform.generatorFor(options.technology), options.refreshEvery);
     bool isGood = true;
     {
         Progress progress(options.captures);
@@ -83,7 +115,48 @@ int decode(const DecodeOptions& options)
     // What could be read is shown, whatever could not; but nothing at all is no document.
     if (!isGood && session.messageCount() == 0)
         return kFailure;
-    return print(*session.finish(), options) && isGood ? 0 : kFailure;
+    isGood = print(textOf(session.display(), options.format), options) && isGood;
+    if (options.snapshotFile)
+        isGood = save(session, begun, options) && isGood;
+    return isGood ? 0 : kFailure;
+}
+
+bool extractDlf(const SnapshotDocument& document, const DecodeOptions& options)
+{
+    if (!document.dlf())
+        return complain(options.captures.front() + ": holds no binary log");
+    return write(
+        *options.dlfFile, {reinterpret_cast<const char*>(document.dlf()->data()), document.dlf()->size()});
+}
+
+int showSnapshots(const DecodeOptions& options)
+{
+    const Platform platform(options);
+    const bool isJson = options.format == DecodeOptions::Format::json;
+    std::string tree;
+    auto json = nlohmann::ordered_json::array();
+    bool isGood = true;
+    for (const std::string& path : options.captures) {
+        const auto [snapshot, error] = readSnapshot(path);
+        if (!snapshot) {
+            isGood = complain(error);
+            continue;
+        }
+        SnapshotDocument document(*snapshot);
+        if (!options.technology.empty())
+            document.decodeAnew(platform.generatorFor(options.technology));
+        for (const std::string& omission : document.omissions())
+            complain(path + ": " + omission);
+        if (options.dlfFile)
+            isGood = extractDlf(document, options) && isGood;
+        if (isJson)
+            json.push_back(document.json());
+        else
+            tree += document.tree();
+    }
+    if (tree.empty() && json.empty())
+        return kFailure;
+    return print(isJson ? documentText({{"snapshots", json}}) : tree, options) && isGood ? 0 : kFailure;
 }
 
 } // namespace
@@ -109,7 +182,9 @@ int main(int argc, char** argv)
         SystemLog::install(log.get());
     }
     const bool canLog = !log || log->error().empty() || complain(log->error());
-    int status = canLog ? decode(options) : kFailure;
+    int status = kFailure;
+    if (canLog)
+        status = options.areSnapshots ? showSnapshots(options) : decodeCaptures(options);
     SystemLog::install(nullptr);
     if (log && canLog) {
         log->flush();

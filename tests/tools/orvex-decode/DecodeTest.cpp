@@ -1,6 +1,6 @@
+#include "DecodeProgram.h"
 #include "LogPackets.h"
 #include "PcapFile.h"
-#include "Program.h"
 
 #include "TextFormat.h"
 
@@ -20,22 +20,8 @@ Bytes antennas(std::uint8_t count)
     return packet(0xB0C1, {0, 1, 2, 3, 4, 5, 6, count, 8});
 }
 
-class DecodeTest : public testing::Test {
+class DecodeTest : public DecodeProgram, public testing::Test {
 public:
-    struct Result {
-        int status;
-        std::string output;
-        std::string errors;
-    };
-
-    static Result decode(const QStringList& arguments)
-    {
-        const ProgramFolder folder;
-        Program program(folder, ORVEX_DECODE, arguments);
-        const int status = program.waitForEnd();
-        return {status, program.output(), program.errors()};
-    }
-
     Result decodeCaptures(const std::vector<Bytes>& captures, QStringList arguments = {}) const
     {
         arguments << "--technology"
@@ -46,18 +32,6 @@ public:
                 file(text("%d.pcap", static_cast<int>(i)).c_str(), captures[i]));
         return decode(arguments);
     }
-
-    std::string file(const char* name, const Bytes& bytes) const { return writeFile(path(name), bytes); }
-    std::string path(const char* name) const { return _folder.path(name); }
-
-    static std::string contentsOf(const std::string& path)
-    {
-        std::ifstream stream(path, std::ios::binary);
-        return {std::istreambuf_iterator<char>(stream), {}};
-    }
-
-private:
-    ProgramFolder _folder;
 };
 
 TEST_F(DecodeTest, PrintsTheTreeOfWhatTheCapturesHold)
@@ -197,7 +171,10 @@ TEST_F(DecodeTest, WrongUsageIsAnsweredWithTheRightOne)
 {
     const std::vector<QStringList> cases = {{}, {"x.pcap"}, {"--technology", "MRL_LTE"},
         {"--technology", "GSM", "x.pcap"}, {"--technology", "MRL_LTE", "--format", "xml", "x.pcap"},
-        {"--technology", "MRL_LTE", "--refresh-every", "0", "x.pcap"}, {"--nonsense"}};
+        {"--technology", "MRL_LTE", "--refresh-every", "0", "x.pcap"}, {"--nonsense"},
+        {"--technology", "MRL_LTE", "x.orvex", "x.pcap"}, {"--snapshot", "y.orvex", "x.orvex"},
+        {"--technology", "MRL_LTE", "--dlf", "y", "x.pcap"}, {"--dlf", "y", "x.orvex", "z.orvex"},
+        {"--technology", "MRL_LTE", "--description", "y", "x.pcap"}, {"--technology", "GSM", "x.orvex"}};
     for (const QStringList& arguments : cases) {
         const Result result = decode(arguments);
         EXPECT_EQ(result.status, 2) << arguments.join(' ').toStdString();

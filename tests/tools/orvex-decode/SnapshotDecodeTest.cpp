@@ -1,0 +1,139 @@
+// Snapshots written from captures, and read again.
+
+#include "scenarios/ScenarioTable.h"
+
+#include "DecodeProgram.h"
+#include "LogPackets.h"
+#include "PcapFile.h"
+
+#include "TextFormat.h"
+
+#include <nlohmann/json.hpp>
+
+#include <gmock/gmock.h>
+
+namespace orvex::test {
+namespace {
+
+using Json = nlohmann::ordered_json;
+using testing::HasSubstr;
+
+class SnapshotDecodeTest : public DecodeProgram, public testing::Test {
+protected:
+    // The first seconds of a scenario as a capture.
+    std::string drive(const korat::ScenarioEntry& entry) const
+    {
+        PcapFile capture;
+        const auto scenario = entry.make({7, {}});
+        for (auto item = scenario->next(); item.due < std::chrono::seconds(20); item = scenario->next())
+            capture.add(item.message.bytes);
+        return file("drive.pcap", capture.bytes());
+    }
+    static Json parsed(const Result& result)
+    {
+        EXPECT_EQ(result.status, 0) << result.errors;
+        return Json::parse(result.output);
+    }
+    QString name(const char* file) const { return QString::fromStdString(path(file)); }
+};
+
+TEST_F(SnapshotDecodeTest, HoldsWhatTheCaptureHeldForEveryTechnology)
+{
+    for (const korat::ScenarioEntry& entry : korat::scenarioTable()) {
+        const QString capture = QString::fromStdString(drive(entry));
+        const QStringList options{"--technology", entry.technology, "--resources", ORVEX_RESOURCES,
+            "--format", "json", "--refresh-every", "4"};
+        const Json shown = parsed(decode(options
+            + QStringList{"--snapshot", name("saved.orvex"), "--description", "öst & <west>", capture}));
+
+        const Json document = parsed(decode(options + QStringList{name("saved.orvex")}));
+        ASSERT_EQ(document["snapshots"].size(), 1U);
+        const Json& saved = document["snapshots"][0];
+        EXPECT_EQ(saved["description"], "öst & <west>");
+        const std::size_t dlfEntries = entry.technology == std::string("IFX") ? 0 : 1;
+        ASSERT_EQ(saved["entries"].size(), 5 + dlfEntries) << entry.technology;
+        const Json& last = saved["entries"][4];
+        EXPECT_THAT(last["description"].get<std::string>(), testing::StartsWith("Snapshot (2"));
+        EXPECT_EQ(last["display"], shown) << entry.technology;
+        // The five intervals alone, without what came before; of CDMA2000 and IFX that is everything.
+        EXPECT_EQ(last["decoded"].size(), 3U) << entry.technology;
+        if (dlfEntries == 0) {
+            EXPECT_EQ(last["decoded"], shown);
+        }
+    }
+}
+
+TEST_F(SnapshotDecodeTest, TheBinaryLogDecodesToTheSameTree)
+{
+    const QString capture =
+        QString::fromStdString(drive(*korat::findScenario("MRL_CDMA", ""))); // has no extra packets
+    const QStringList options{"--technology", "MRL_CDMA", "--resources", ORVEX_RESOURCES};
+    const Result shown = decode(options + QStringList{"--snapshot", name("saved.orvex"), capture});
+    ASSERT_EQ(shown.status, 0) << shown.errors;
+    const Result saved = decode(options + QStringList{"--dlf", name("saved.dlf"), name("saved.orvex")});
+    EXPECT_THAT(saved.output, HasSubstr("Decoded anew"));
+    const Result log = decode(options + QStringList{name("saved.dlf")});
+    EXPECT_EQ(log.status, 0);
+    EXPECT_EQ(log.errors, "");
+    EXPECT_EQ(log.output, shown.output);
+
+    const Result ifx = decode({"--technology", "IFX", "--snapshot", name("ifx.orvex"),
+        QString::fromStdString(drive(*korat::findScenario("IFX", "")))});
+    ASSERT_EQ(ifx.status, 0);
+    const Result none = decode({"--dlf", name("none.dlf"), name("ifx.orvex")});
+    EXPECT_EQ(none.status, 1);
+    EXPECT_EQ(none.errors, "orvex-decode: " + path("ifx.orvex") + ": holds no binary log\n");
+}
+
+TEST_F(SnapshotDecodeTest, SaysInOneLineWhyASnapshotCannotBeRead)
+{
+    const auto bytesOf = [](const std::string& text) { return Bytes(text.begin(), text.end()); };
+    std::string nested = "<plist version=\"1.0\">";
+    for (int i = 0; i < 1'000'000; ++i)
+        nested += "<array>";
+    const struct {
+        const char* name;
+        std::string content;
+    } cases[] = {
+        {"empty", ""},
+        {"cut", "<?xml version=\"1.0\"?><plist version=\"1.0\"><dict><key>Data</key><arr"},
+        {"another kind", "<plist version=\"1.0\"><string>Data</string></plist>"},
+        {"a million nested lists", nested},
+    };
+    for (const auto& [name, content] : cases) {
+        const Result result = decode({QString::fromStdString(file("broken.orvex", bytesOf(content)))});
+        EXPECT_EQ(result.status, 1) << name;
+        EXPECT_EQ(result.output, "") << name;
+        EXPECT_THAT(result.errors, testing::StartsWith("orvex-decode: " + path("broken.orvex") + ": "));
+        EXPECT_EQ(std::count(result.errors.begin(), result.errors.end(), '\n'), 1) << result.errors;
+    }
+}
+
+TEST_F(SnapshotDecodeTest, MessagesWhoseLengthLeadsNowhereAreLeftOut)
+{
+    Bytes messages = packet(0xB0C1, {0, 1, 2, 3, 4, 5, 6, 4, 8});
+    messages[1] = 21;
+    messages[2] = 0;
+    messages.insert(messages.end(), 30, 0); // a packet of no length
+    std::string base64;
+    static constexpr const char* kDigits = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
+    while (messages.size() % 3 != 0)
+        messages.push_back(0);
+    for (std::size_t i = 0; i < messages.size(); i += 3) {
+        const unsigned group = messages[i] << 16U | messages[i + 1] << 8U | messages[i + 2];
+        for (int shift = 18; shift >= 0; shift -= 6)
+            base64 += kDigits[group >> shift & 63U];
+    }
+    const std::string list = "<plist version=\"1.0\"><dict><key>Timestamp</key><string>t</string>"
+                             "<key>Description</key><string/><key>Data</key><array><dict>"
+                             "<key>Description</key><string>one</string><key>DisplayState</key><data>"
+        + base64 + "</data></dict></array></dict></plist>";
+    const Result result = decode({"--technology", "MRL_LTE", "--resources", ORVEX_RESOURCES,
+        QString::fromStdString(file("odd.orvex", Bytes(list.begin(), list.end())))});
+    EXPECT_EQ(result.status, 0);
+    EXPECT_THAT(result.output, HasSubstr("Num Tx Antennas: 4\n"));
+    EXPECT_THAT(result.errors, HasSubstr("one: 32 bytes that make no message were left out\n"));
+}
+
+} // namespace
+} // namespace orvex::test

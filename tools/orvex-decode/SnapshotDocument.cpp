@@ -1,0 +1,101 @@
+#include "SnapshotDocument.h"
+
+#include "OfflineSession.h"
+#include "TreeJson.h"
+
+#include "DisplayTreePrinter.h"
+#include "PropertyList.h"
+#include "RawMessages.h"
+#include "SnapshotTree.h"
+#include "TextFormat.h"
+
+#include <nlohmann/json.hpp>
+
+#include <utility>
+
+namespace orvex {
+
+namespace {
+
+// Feeds the messages that an entry keeps. Returns the number of bytes that make none.
+std::size_t feed(OfflineSession& session, const Value& kept)
+{
+    if (const BytesRef packets = kept.data()) {
+        RawMessages messages(*packets);
+        while (const auto message = messages.next())
+            session.take(*message);
+        return messages.rest();
+    }
+    // A technology whose messages are property lists keeps the last one as what it says.
+    if (const auto message = propertyListXML(kept))
+        session.take(*message);
+    return 0;
+}
+
+OrvexModelNodeRef treeOf(const Value& display)
+{
+    NodesByPath paths;
+    return OrvexModelNode::makeTreeFromObject(display, paths);
+}
+
+} // namespace
+
+SnapshotDocument::SnapshotDocument(const Snapshot& snapshot)
+    : _timestamp(snapshot.timestamp)
+    , _description(snapshot.description)
+{
+    for (const Value& element : *snapshot.data) {
+        const Dictionary& entry = *element.dictionary();
+        _entries.push_back(
+            {snapshotEntryName(entry), entry["Date"], entry["Display"], entry["DisplayState"], {}});
+        if (const BytesRef dlf = entry["DLF"].data())
+            _dlf = dlf;
+    }
+}
+
+void SnapshotDocument::decodeAnew(std::unique_ptr<LogGenerator> generator)
+{
+    OfflineSession session(std::move(generator), 0);
+    for (Entry& entry : _entries) {
+        if (entry.messages.isNull())
+            continue;
+        if (const std::size_t rest = feed(session, entry.messages))
+            _omissions.push_back(
+                text("%s: %zu bytes that make no message were left out", entry.description.c_str(), rest));
+        entry.decoded = session.display().deepCopy(); // the next entry goes on writing into it
+    }
+}
+
+std::string SnapshotDocument::tree() const
+{
+    Dictionary rows{{"Timestamp", _timestamp}, {"Description", _description}};
+    for (const Entry& entry : _entries) {
+        auto shown = Dictionary::make();
+        for (const auto& [name, value] : {std::pair<const char*, Value>{"Date", entry.date},
+                 {"Display", entry.display}, {"Decoded anew", entry.decoded}}) {
+            if (!value.isNull())
+                shown->set(name, value);
+        }
+        setUnderFreeName(rows, entry.description, shown);
+    }
+    return DisplayTreePrinter::text(*treeOf(rows.shallowCopy()));
+}
+
+nlohmann::ordered_json SnapshotDocument::json() const
+{
+    using Json = nlohmann::ordered_json;
+    Json entries = Json::array();
+    for (const Entry& entry : _entries) {
+        Json item = {{"description", entry.description}};
+        if (const std::string* date = entry.date.string())
+            item["date"] = *date;
+        if (!entry.display.isNull())
+            item["display"] = treeJson(*treeOf(entry.display));
+        if (!entry.decoded.isNull())
+            item["decoded"] = treeJson(*treeOf(entry.decoded));
+        entries.push_back(std::move(item));
+    }
+    return {{"timestamp", _timestamp}, {"description", _description}, {"entries", std::move(entries)}};
+}
+
+} // namespace orvex
