@@ -1,4 +1,4 @@
-// What every section does with a packet that is not for it: too short, or of another code.
+// What every section says and does with a packet that is too short, just long enough, or of another code.
 
 #include "GSM/MRL_GSMClassIndex.h"
 #include "LTE/LTEClassIndex.h"
@@ -46,7 +46,7 @@ const std::vector<Guard> kUTRAN = {
     {"SIM Info", kExtraCodeSimFiles, 0, "<4>SimInfo", OtherCode::isIgnored},
 };
 
-// Process CO goes by the name of Process CS in the log.
+// Process CO goes by the name of Process CS in the log, Coding Scheme by that of Cell Change Counters.
 const std::vector<Guard> kGSM = {
     {"GPRS Information", 0x51F5, 18, "<4>GPRSInformation", OtherCode::isReported},
     {"GPRS Information", 0x7135, 32, "<4>GPRSInformation", OtherCode::isReported},
@@ -86,6 +86,11 @@ const std::vector<Guard> kGSM = {
     {"UMTS RR Info", 0x4157, 19, "<4>UMTSRRInfo", OtherCode::isReported},
     {"BLER", 0x4116, 16, "<4>BLER", OtherCode::isReported},
     {"HSDPA Info", 0x4221, 18, "<4>HSDPA Info", OtherCode::isIgnored},
+    {"Coding Scheme", 0, 0, "<4>CellChangeCounters", OtherCode::isIgnored},
+    {"Cell Change Counters", 0, 0, "<4>CellChangeCounters", OtherCode::isIgnored},
+    {"UMTS RR Measurement", 0, 0, "<4>UMTSRRMeasurement", OtherCode::isIgnored},
+    {"Non-Ranked GSM Set", 0, 0, "<4>NonRankedGSMSet", OtherCode::isIgnored},
+    {"Non-Ranked UMTS Set", 0, 0, "<4>NonRankedUMTSSet", OtherCode::isIgnored},
 };
 
 using Lines = std::vector<std::string>;
@@ -106,6 +111,18 @@ Lines linesOfRefusal(Base& section, const Bytes& packet, LogCode code)
     return lines;
 }
 
+// True when the section wrote rows or emptied its list.
+bool takes(Base& section, const Bytes& packet, LogCode code)
+{
+    const auto rows = Dictionary::make();
+    section.updateSectionRef(rows);
+    section.updateWithData(packet, code);
+    const auto list = Array::make({"stale"});
+    section.updateSectionRef(list);
+    section.updateWithData(packet, code);
+    return *rows != Dictionary() || *list != Array({"stale"});
+}
+
 void expectGuards(const ClassIndex& index, const std::vector<Guard>& guards)
 {
     for (const auto& [name, code, minimumLength, entryLine, otherCode] : guards) {
@@ -114,6 +131,8 @@ void expectGuards(const ClassIndex& index, const std::vector<Guard>& guards)
         for (std::size_t length = 0; length < minimumLength; ++length)
             EXPECT_EQ(linesOfRefusal(*section, Bytes(length, 0xFF), code), Lines{entryLine})
                 << name << length;
+        const bool isShown = minimumLength > 0 && code != 0x51FF; // which is only remembered
+        EXPECT_TRUE(!isShown || takes(*section, Bytes(minimumLength, 0xFF), code)) << name << " " << code;
 
         const LogCode foreign = 0x1234;
         Lines expected = {entryLine};

@@ -76,10 +76,16 @@ TEST(NeighboringCells, ListsNeighborsWithTheBSICThatIsKnownForTheirChannel)
     second.emplace_back("BSIC", "63");
     EXPECT_EQ(fixture.listAfter(surroundPacket(2, records), 0x5137), (std::vector<RowTexts>{first, second}));
 
-    fixture.listAfter(packet(0x51FF, {0xAA, 1, 0x0A, 0x00, 63}), 0x51FF);
     second.pop_back();
-    EXPECT_EQ(fixture.listAfter(surroundPacket(2, records), 0x5137), (std::vector<RowTexts>{first, second}))
-        << "a new map without the record that was cut";
+    const Bytes none = {0xAA, 0};
+    const Bytes cut = {0xAA, 1, 0x0A, 0x00, 63};
+    for (const Bytes& codes : {none, cut}) {
+        fixture.listAfter(packet(0x51FF, twoCodes), 0x51FF);
+        fixture.listAfter(packet(0x51FF, codes), 0x51FF);
+        EXPECT_EQ(
+            fixture.listAfter(surroundPacket(2, records), 0x5137), (std::vector<RowTexts>{first, second}))
+            << "a new map after each packet";
+    }
 }
 
 TEST(NeighboringCells, ShowsTheRecordsThatFit)
