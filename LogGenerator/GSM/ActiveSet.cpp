@@ -1,7 +1,5 @@
 #include "GSM/ActiveSet.h"
 
-#include <algorithm>
-
 namespace orvex {
 
 ActiveSet::ActiveSet(ClassDictionary& dict, CodeDictionary& codeDict)
@@ -15,8 +13,8 @@ void ActiveSet::update(const LogCode_0x417A& report)
     const auto cells = report.cells();
     const auto energies = report.energies();
     Array list;
-    // A cell is shown when both its records are in the packet; its energies stand behind all cells.
-    for (std::size_t i = 0; i < std::min(cells.countInside(), energies.countInside()); ++i) {
+    // Energies stand behind all cells: where a cell's energies are in the packet, so is the cell.
+    for (std::size_t i = 0; i < energies.countInside(); ++i) {
         if (!cells[i].isActive())
             continue;
         const int ecNo = lookUpECNO(energies[i].ecIo());

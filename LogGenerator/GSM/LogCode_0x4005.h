@@ -21,7 +21,7 @@ public:
 
     //   0  s16  downlink UARFCN
     //   2  u16  primary scrambling code
-    //   4  s8   RSCP, dBm above -21
+    //   4  s8   RSCP plus 21, dBm
     //   5  s16  RSCP in the ranking, dB
     //   7  s8   Ec/No, half dB
     //   8  s16  ranking value

@@ -8,7 +8,7 @@ namespace orvex {
 // WCDMA block errors of the downlink transport channels.
 //
 //   13     u8   number of transport channels
-//   14     u16  window, in blocks
+//   14     u16  window size
 //   16+9i       transport channel i
 class LogCode_0x4116 {
 public:

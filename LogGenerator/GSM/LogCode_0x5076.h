@@ -17,7 +17,7 @@ public:
     {
     }
 
-    // ARFCN modulo 256. This is all that has ever been told of it.
+    // ARFCN modulo 256: the display has never shown more of it.
     int arfcnLowByte() const { return _packet.u16(13) & 0xFF; }
 
 private:

@@ -20,7 +20,8 @@ const char* registrationStateText(int state)
 
 const char* mmStateText(int state)
 {
-    // The values of 3GPP TS 24.008, 4.1.2.1. The blanks inside two of the names are the modem's own.
+    // Numbered after the states of 3GPP TS 24.008, 4.1.2.1, hence the gaps. The blanks inside two of the
+    // names are the modem's own.
     static constexpr EnumText kStates[] = {
         {0, "MM_NULL"},
         {3, "MM_LOCATION_UPDATE_INITIATED"},
