@@ -7,8 +7,8 @@ namespace orvex {
 // Packet system information of the cell.
 //
 //   13  u8  packet PSI status supported
-//   14  u8  count of low repetition (PSI1_COUNT_LR)
-//   15  u8  count of high repetition (PSI1_COUNT_HR)
+//   14  u8  PSI messages of low repetition rate (PSI_COUNT_LR)
+//   15  u8  PSI messages of high repetition rate (PSI_COUNT_HR)
 //   16  u8  extended measurement order
 //   33  u8  packet SI status: 0 not supported
 class LogCode_0x51FD {
