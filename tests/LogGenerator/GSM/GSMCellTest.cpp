@@ -18,7 +18,7 @@ using Lines = std::vector<std::string>;
 Bytes surroundPacket(std::uint8_t count, const Bytes& records)
 {
     Bytes bytes = packet(0x5137,
-        {0xAA, 0xAA, 200, 0x02, 0x00, 0x01, 0x00, 0xFE, 0xFF, 0xFF, 0xFF, 0xAA, 0xAA, 1, 0xAA, count});
+        {0xAA, 0xAA, 200, 0x02, 0x80, 0x01, 0x00, 0xFE, 0xFF, 0xFE, 0xFF, 0xAA, 0xAA, 2, 0xAA, count});
     bytes.insert(bytes.end(), records.begin(), records.end());
     return bytes;
 }
@@ -27,10 +27,10 @@ TEST(GSMServingCell, ReadsEachFieldFromItsOwnBytes)
 {
     SectionFixture<GSMServingCell> fixture;
     EXPECT_EQ(
-        fixture.rowsAfter(packet(0x5134, {0x34, 0x12, 0x3F, 0x00, 0xFE, 0xFF, 0, 0, 0, 0, 0, 0, 0}), 0x5134),
-        (RowTexts{{"Cell ID", "65534"}, {"ARFCN", "4660"}, {"BSIC", "63"}}));
+        fixture.rowsAfter(packet(0x5134, {0x34, 0x12, 0x3F, 0x80, 0xFE, 0xFF, 0, 0, 0, 0, 0, 0, 0}), 0x5134),
+        (RowTexts{{"Cell ID", "65534"}, {"ARFCN", "4660"}, {"BSIC", "32831"}}));
     EXPECT_EQ(fixture.rowsAfter(surroundPacket(0, {}), 0x5137),
-        (RowTexts{{"RSSI", "200 dBm"}, {"C1 Value", "2"}, {"C2 Value", "65534"}}))
+        (RowTexts{{"RSSI", "200 dBm"}, {"C1 Value", "32770"}, {"C2 Value", "65534"}}))
         << "low 16 bits, without sign";
     EXPECT_EQ(fixture.rowsAfter(packet(0x5076, {0x23, 0x01, 0, 0}), 0x5076),
         (RowTexts{{"MA Dedicated ARFCN", "35"}}));
@@ -207,7 +207,7 @@ TEST(GSMRRInfo, ReadsEachFieldFromItsOwnBytes)
             {{"RR State", "RR_CELL_REEST"}, {"RR Sub State", "255"}, {"RR Status", "254"},
                 {"RR Mode", "Voice"}}},
         {0x5137, surroundPacket(0, {}),
-            {{"Serving Rx Level", "200"}, {"Rx Quality Full", "65538"}, {"Rx Quality Sub", "-2"}}},
+            {{"Serving Rx Level", "200"}, {"Rx Quality Full", "98306"}, {"Rx Quality Sub", "-65538"}}},
         {0x5072, dtx, {{"DTX Used", "ON"}}},
         {0x5072, packet(0x5072, ten), {{"DTX Used", "OFF"}}},
         {0x51F6, drx, {{"DRX Used", "7 sec"}}},

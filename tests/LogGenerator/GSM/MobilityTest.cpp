@@ -117,12 +117,14 @@ TEST(ServingPLMN, TakesTheFirstServingCellOfEitherTechnology)
         return fixture.rowsAfter(cellList(cells), kExtraCodeCellMonitorList);
     };
     const std::string gsm = cell("GSM", "Serving", {{"MCC", 260}, {"MNC", 1}, {"LAC", 4660}});
-    const std::string umts = cell("UMTS", "Serving", {{"MCC", 310}, {"MNC", 410}, {"LAC", 7}});
+    const std::string umts = cell("UMTS", "Serving", {{"MCC", 70310}, {"MNC", 70410}, {"LAC", -7}});
     const std::string others = cell("LTE", "Serving", {{"MCC", 1}}) + cell("GSM", "Neighbor", {{"MCC", 2}});
     const RowTexts gsmRows = {
         {"Mobile Country Code", "260"}, {"Mobile Network Code", "1"}, {"Location Area Code", "4660"}};
     EXPECT_EQ(rows(others + gsm + umts), gsmRows);
-    EXPECT_EQ(textOf(rows(others + umts + gsm), "Mobile Network Code"), "410");
+    EXPECT_EQ(rows(others + umts + gsm),
+        (RowTexts{{"Mobile Country Code", "70310"}, {"Mobile Network Code", "70410"},
+            {"Location Area Code", "-7"}}));
     EXPECT_EQ(rows(others), RowTexts{});
     EXPECT_EQ(fixture.log.take(), Lines{"<4>Serving PLMN"});
     rows(cell("UMTS", "Serving", {}));
@@ -146,6 +148,9 @@ TEST(EquivalentPLMNList, ReadsEntriesThatReachIntoTheNext)
     EXPECT_EQ(fixture.listAfter(packet(0x7150, two), 0x7150),
         (std::vector<RowTexts>{rowsOfPLMN("301", "105"), rowsOfPLMN("56", "129")}));
     EXPECT_EQ(fixture.log.take(), Lines{"<4>Equivalent PLMN List"});
+    EXPECT_EQ(fixture.listAfter(packet(0x7150, {0, 0, 0, 1, 0, 0, 2, 0, 6, 7}), 0x7150),
+        std::vector<RowTexts>{rowsOfPLMN("26", "7")})
+        << "numbers, not digits";
 
     const struct {
         const char* name;

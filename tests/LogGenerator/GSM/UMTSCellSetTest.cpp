@@ -54,7 +54,7 @@ TEST(ActiveSet, ListsTheCellsOfSetTypeZeroWithTheirOwnEnergies)
 {
     SectionFixture<ActiveSet> fixture;
     const Bytes bytes = searcherPacket(-1000, 4,
-        {cellEntry(1, 1), cellEntry(8191, 0), cellEntry(0x123, 0), cellEntry(4, 7), energies(1000, 0, 0),
+        {cellEntry(1, 1), cellEntry(8191, 0), cellEntry(0x123, 0), cellEntry(4, 4), energies(1000, 0, 0),
             energies(0, 524287, 9), energies(66436, 1, 1), energies(0, 0, 0)});
     EXPECT_EQ(fixture.listAfter(bytes, 0x417A),
         (Rows{activeCell("8191", "-155 dB", "-1 dB"), activeCell("291", "-163 dB", "-9 dB")}))
@@ -66,7 +66,7 @@ TEST(ActiveSet, ListsTheCellsOfSetTypeZeroWithTheirOwnEnergies)
         std::uint32_t ratios[3];
         RowTexts cell;
     } cases[] = {
-        {-512, {0, 0, 706}, activeCell("7", "-137 dB", "-31 dB")},
+        {-1, {0, 0, 706}, activeCell("7", "-86 dB", "-31 dB")},
         {-521, {0, 524288, 1}, activeCell("7", "-106 dB", "0 dB")},
         {32767, {1, 0, 0}, activeCell("7", "3221 dB", "0 dB")},
         {-32768, {0, 0, 0}, activeCell("7", "-3331 dB", "0 dB")},
@@ -172,7 +172,7 @@ TEST(UMTSSet, ListsTheNeighborsOfTheCellMonitorList)
 TEST(GSMSet, ListsRankedCellsFromTheSameBytes)
 {
     SectionFixture<GSMSet> fixture;
-    EXPECT_EQ(fixture.listAfter(rankedPacket(0, 2, kRanked), 0x4005),
+    EXPECT_EQ(fixture.listAfter(rankedPacket(2, 2, kRanked), 0x4005),
         (Rows{{{"ARFCN", "10728"}, {"BSIC", "511"}, {"RSSI", "-80 dBm"}, {"Ranking Value", "-100"}},
             {{"ARFCN", "65265"}, {"BSIC", "255"}, {"RSSI", "-128 dBm"}, {"Ranking Value", "-1"}}}));
     EXPECT_EQ(fixture.log.take(), Lines{"<4>GSMSet"});

@@ -14,7 +14,7 @@ using Lines = std::vector<std::string>;
 
 TEST(UMTSRRInfo, ReadsEachFieldFromItsOwnBytes)
 {
-    const Bytes cell = {0x04, 0x03, 0x02, 0x01, 0xE8, 0x29, 0, 0, 0xFF, 0xFF, 0xFF, 0xFF, 0x34, 0x92, 0, 0};
+    const Bytes cell = {0x04, 0x03, 0x02, 0x01, 0xE8, 0x29, 1, 0, 0xFF, 0xFF, 0xFF, 0xFF, 0x34, 0x92, 1, 0};
     const struct {
         LogCode code;
         Bytes payload;
@@ -22,7 +22,7 @@ TEST(UMTSRRInfo, ReadsEachFieldFromItsOwnBytes)
     } cases[] = {
         {0x4125, {3}, {{"RRC State", "CELL_DCH"}}},
         {0x4127, cell,
-            {{"Cell ID", "-1"}, {"Downlink Frequency", "10728"}, {"Uplink Frequency", "16909060"},
+            {{"Cell ID", "-1"}, {"Downlink Frequency", "76264"}, {"Uplink Frequency", "16909060"},
                 {"URA ID", "37428"}}},
         {0x4157, {2, 0, 0, 0, 0, 0}, {{"Ciphering", "Enabled"}}},
         {0x4157, {0, 1, 1, 1, 1, 1}, {{"Ciphering", "Disabled"}}},
@@ -81,13 +81,14 @@ TEST(UMTSRRInfo, TakesTheServingCellOfTheListUntilTheNextServingCellPacket)
     fixture.section.updateSectionRef(bound);
     fixture.section.updateWithData(
         cellList(cell("GSM", "Serving", {{"CellID", 1}}) + cell("UMTS", "Neighbor", {{"CellID", 2}})
-            + cell("UMTS", "Serving", {{"CellID", 3}, {"UARFCN", 10728}, {"ScramblingCode", 511}})
+            + cell("UMTS", "Serving", {{"CellID", 65539}, {"UARFCN", 76264}, {"ScramblingCode", 66047}})
             + cell("UMTS", "Serving", {{"CellID", 4}})),
         kExtraCodeCellMonitorList);
-    EXPECT_EQ(rowsOf(bound), (RowTexts{{"Cell ID", "3"}, {"UARFCN", "10728"}, {"Scrambling Code", "511"}}));
+    EXPECT_EQ(
+        rowsOf(bound), (RowTexts{{"Cell ID", "65539"}, {"UARFCN", "76264"}, {"Scrambling Code", "66047"}}));
     fixture.section.updateWithData(packet(0x4127, Bytes(16, 0)), 0x4127);
     EXPECT_EQ(rowsOf(bound),
-        (RowTexts{{"Cell ID", "0"}, {"Scrambling Code", "511"}, {"Downlink Frequency", "0"},
+        (RowTexts{{"Cell ID", "0"}, {"Scrambling Code", "66047"}, {"Downlink Frequency", "0"},
             {"Uplink Frequency", "0"}, {"URA ID", "0"}}));
 
     EXPECT_EQ(
@@ -117,13 +118,13 @@ TEST(BLER, ListsTheTransportChannelsThatFit)
     const auto bound = Dictionary::make();
     fixture.section.updateSectionRef(bound);
     Bytes bytes = packet(0x4116,
-        {2, 0x34, 0x12, 7, 1, 2, 3, 4, 0xFF, 0xFF, 0xFF, 0xFF, 8, 0, 0, 0, 0x80, 0xFF, 0xFF, 0xFF, 0x7F});
+        {2, 0x34, 0x92, 7, 1, 2, 3, 4, 0xFF, 0xFF, 0xFF, 0xFF, 8, 0, 0, 0, 0x80, 0xFF, 0xFF, 0xFF, 0x7F});
     const RowTexts first = {
         {"Transport Channel ID", "7"}, {"CRC Received", "67305985"}, {"CRC Received in Error", "-1"}};
     const RowTexts second = {{"Transport Channel ID", "8"}, {"CRC Received", "-2147483648"},
         {"CRC Received in Error", "2147483647"}};
     fixture.section.updateWithData(bytes, 0x4116);
-    EXPECT_EQ(textOf((*bound)["Window Size"]), "4660");
+    EXPECT_EQ(textOf((*bound)["Window Size"]), "37428");
     EXPECT_EQ(recordsOf(*bound, "Transport Channels"), (std::vector<RowTexts>{first, second}));
     EXPECT_EQ(fixture.log.take().back(), "<4>BLER");
 
