@@ -15,18 +15,22 @@ namespace {
 
 constexpr std::int16_t kNotMeasured = 32767;
 
+void printLevel(Rows& row, const char* name, std::int32_t number, int unitsPerStep, const char* unit)
+{
+    const auto steps = static_cast<std::int16_t>(number);
+    if (steps == kNotMeasured)
+        row.set(name, "");
+    else
+        row.print(name, "%d%s", steps * unitsPerStep, unit);
+}
+
 void printNumber(Rows& row, const char* name, const CellEntry& entry, std::int32_t number)
 {
     switch (entry.form) {
     case CellNumber::whole: row.print(name, "%d", number); break;
     case CellNumber::low16Bits: row.print(name, "%d", static_cast<std::uint16_t>(number)); break;
-    case CellNumber::level:
-        const auto steps = static_cast<std::int16_t>(number);
-        if (steps == kNotMeasured)
-            row.set(name, "");
-        else
-            row.print(name, "%d%s", steps * entry.unitsPerStep, entry.unit);
-        break;
+    case CellNumber::level: printLevel(row, name, number, 1, entry.unit); break;
+    case CellNumber::levelBy2: printLevel(row, name, number, 2, entry.unit); break;
     }
 }
 

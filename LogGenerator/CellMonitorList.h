@@ -36,6 +36,7 @@ enum class CellNumber {
     whole,
     low16Bits, // unsigned
     level,     // the low 16 bits with sign; 32767 stands for not measured and is shown as an empty text
+    levelBy2,  // the same, in steps of two units
 };
 
 // A number of a cell record and where it is shown.
@@ -45,7 +46,6 @@ struct CellEntry {
     const char* nameInMessage;
     CellNumber form = CellNumber::whole;
     const char* unit = "";          // of a level, the blank before it included
-    int unitsPerStep = 1;           // of a level
     const char* otherRow = nullptr; // shows the same number too; null when there is none
 };
 

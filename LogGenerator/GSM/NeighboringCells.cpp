@@ -9,7 +9,7 @@ namespace {
 // The list counts levels in steps of 2 dB.
 constexpr CellEntry kCellEntries[] = {
     {telephony::kCellARFCN, "ARFCN", "ARFCN", CellNumber::low16Bits},
-    {telephony::kCellRSSI, "RSSI", "RSSI", CellNumber::level, " dBm", 2},
+    {telephony::kCellRSSI, "RSSI", "RSSI", CellNumber::levelBy2, " dBm"},
 };
 
 DictionaryRef rowsOfCell(const CellRecord& cell)

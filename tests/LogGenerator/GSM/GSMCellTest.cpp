@@ -90,7 +90,7 @@ TEST(NeighboringCells, ListsNeighborsWithTheBSICThatIsKnownForTheirChannel)
 
 TEST(NeighboringCells, ShowsTheRecordsThatFit)
 {
-    const Bytes three(3 * 14, 1);
+    const Bytes three(42, 1);
     const struct {
         const char* name;
         Bytes packet;
@@ -98,8 +98,8 @@ TEST(NeighboringCells, ShowsTheRecordsThatFit)
     } cases[] = {
         {"none", surroundPacket(0, three), 0},
         {"one of three", surroundPacket(1, three), 1},
-        {"the last one cut in bytes that nobody reads", surroundPacket(3, Bytes(3 * 14 - 1, 1)), 2},
-        {"all that is counted", surroundPacket(255, Bytes(255 * 14, 1)), 255},
+        {"the last one cut in bytes that nobody reads", surroundPacket(3, Bytes(41, 1)), 2},
+        {"all that is counted", surroundPacket(255, Bytes(3570, 1)), 255},
         {"none of those counted", surroundPacket(255, {}), 0},
     };
     SectionFixture<NeighboringCells> fixture;
