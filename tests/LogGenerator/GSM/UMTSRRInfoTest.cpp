@@ -185,10 +185,15 @@ TEST(HSDPAInformation, ReadsProcessesOfBothCarriersFromTheirPlaces)
     EXPECT_EQ(recordsOf(*bound, "Primary HARQ Process"), (Records{rowsOfProcess(1), rowsOfProcess(2)}));
     EXPECT_EQ(recordsOf(*bound, "Secondary HARQ Process"), (Records{rowsOfProcess(3), rowsOfProcess(4)}));
 
+    update(harqPacket(0x0C, std::vector<std::uint8_t>(255, 1), {}));
+    EXPECT_EQ(textOf((*bound)["Carrier Info"]), "Reserved");
+    EXPECT_EQ(recordsOf(*bound, "Primary HARQ Process").size(), 255U);
+    EXPECT_EQ(recordsOf(*bound, "Secondary HARQ Process").size(), 2U) << "the list it had";
+
     update(harqPacket(0x04, {}, {5}));
     EXPECT_EQ(textOf((*bound)["Carrier Info"]), "MIMO");
     EXPECT_EQ(textOf((*bound)["Sub Frames"]), "33");
-    EXPECT_EQ(recordsOf(*bound, "Primary HARQ Process").size(), 2U) << "the list it had";
+    EXPECT_EQ(recordsOf(*bound, "Primary HARQ Process").size(), 255U) << "the list it had";
     EXPECT_EQ(recordsOf(*bound, "Secondary HARQ Process"), Records{rowsOfProcess(5)});
 
     Bytes cut = harqPacket(0xF0, {6, 7}, {8});
@@ -197,9 +202,9 @@ TEST(HSDPAInformation, ReadsProcessesOfBothCarriersFromTheirPlaces)
     EXPECT_EQ(textOf((*bound)["Carrier Info"]), "Single Carrier");
     EXPECT_EQ(recordsOf(*bound, "Primary HARQ Process"), (Records{rowsOfProcess(6), rowsOfProcess(7)}));
     EXPECT_EQ(recordsOf(*bound, "Secondary HARQ Process"), Records{});
-    update(harqPacket(0x0C, std::vector<std::uint8_t>(255, 1), {}));
-    EXPECT_EQ(textOf((*bound)["Carrier Info"]), "Reserved");
-    EXPECT_EQ(recordsOf(*bound, "Primary HARQ Process").size(), 255U);
+    cut.resize(18);
+    update(cut);
+    EXPECT_EQ(recordsOf(*bound, "Primary HARQ Process"), Records{});
 
     EXPECT_THROW(LogCode_0x4221(both).primaryProcesses()[2], ArrayOutOfBoundsException);
     EXPECT_THROW(LogCode_0x4221(both).secondaryProcesses()[2], ArrayOutOfBoundsException);
