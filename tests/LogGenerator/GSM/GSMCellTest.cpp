@@ -71,9 +71,9 @@ TEST(NeighboringCells, ListsNeighborsWithTheBSICThatIsKnownForTheirChannel)
     EXPECT_EQ(fixture.listAfter(surroundPacket(2, records), 0x5137), (std::vector<RowTexts>{first, second}));
 
     const std::vector<RowTexts> kept = {{{"", "stale"}}};
-    const Bytes twoCodes = {0xAA, 2, 0x0A, 0x00, 63, 0xAA, 0x35, 0x12, 7, 0xAA};
+    const Bytes twoCodes = {0xAA, 2, 0x0A, 0x00, 5, 0xAA, 0x35, 0x12, 7, 0xAA};
     EXPECT_EQ(fixture.listAfter(packet(0x51FF, twoCodes), 0x51FF), kept) << "shows nothing by itself";
-    second.emplace_back("BSIC", "63");
+    second.emplace_back("BSIC", "5");
     EXPECT_EQ(fixture.listAfter(surroundPacket(2, records), 0x5137), (std::vector<RowTexts>{first, second}));
 
     second.pop_back();
