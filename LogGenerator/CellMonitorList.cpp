@@ -82,11 +82,10 @@ CellMonitorList::CellMonitorList(Packet packet)
     }
 }
 
-bool CellMonitorList::isPresentOrReported() const
+void CellMonitorList::reportIfAbsent() const
 {
     if (!_isPresent)
         systemLog(Priority::error, "Failed to get Cell Array\n");
-    return _isPresent;
 }
 
 const CellRecord* CellMonitorList::find(

@@ -69,10 +69,8 @@ public:
     // Says "Cell Info Array data could not be constructed" in the log when there is no property list.
     explicit CellMonitorList(Packet packet);
 
-    // False, after the log line "Failed to get Cell Array", when there was no property list.
-    bool isPresentOrReported() const;
-    // The records in order; an element that is no dictionary is left out.
-    const std::vector<CellRecord>& cells() const { return _cells; }
+    // Says "Failed to get Cell Array" in the log when there was no property list. Then it has no cells.
+    void reportIfAbsent() const;
     // The first cell of the type in one of the technologies; null when there is none.
     const CellRecord* find(
         std::initializer_list<const char*> radioAccessTechnologies, const char* cellType) const;

@@ -34,7 +34,7 @@ protected:
 template <typename... Readers>
 class PacketSection : public Base, protected PacketTaker<Readers>... {
 public:
-    void updateWithData(Packet packet, LogCode logCode) final
+    void updateWithData([[maybe_unused]] Packet packet, LogCode logCode) final
     {
         systemLog(_entryLine.priority, "%s", _entryLine.word);
         const bool isTaken = (offer<Readers>(packet, logCode) || ...);
@@ -45,8 +45,13 @@ public:
 protected:
     // Says its name for every packet and reports those of other codes.
     PacketSection(const char* sectionName, ClassDictionary& dict, CodeDictionary& codeDict)
-        : PacketSection(
-            sectionName, {Priority::warning, sectionName}, OtherCodes::areReported, dict, codeDict)
+        : PacketSection(sectionName, sectionName, dict, codeDict)
+    {
+    }
+    // The same under another name.
+    PacketSection(
+        const char* sectionName, const char* entryWord, ClassDictionary& dict, CodeDictionary& codeDict)
+        : PacketSection(sectionName, {Priority::warning, entryWord}, OtherCodes::areReported, dict, codeDict)
     {
     }
     PacketSection(const char* sectionName, EntryLine entryLine, OtherCodes otherCodes, ClassDictionary& dict,

@@ -3,7 +3,7 @@
 namespace orvex {
 
 ActiveSet::ActiveSet(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection("Active Set", {Priority::warning, "ActiveSet"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("Active Set", "ActiveSet", dict, codeDict)
 {
 }
 

@@ -4,7 +4,7 @@ namespace orvex {
 
 EmptyCellSet::EmptyCellSet(
     const char* sectionName, const char* entryWord, ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection(sectionName, {Priority::warning, entryWord}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection(sectionName, entryWord, dict, codeDict)
 {
 }
 

@@ -26,8 +26,7 @@ constexpr EnumText kSI13Positions[] = {
 } // namespace
 
 GPRSInformation::GPRSInformation(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection(
-        "GPRS Information", {Priority::warning, "GPRSInformation"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("GPRS Information", "GPRSInformation", dict, codeDict)
 {
 }
 

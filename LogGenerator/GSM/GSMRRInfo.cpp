@@ -35,7 +35,7 @@ constexpr EnumText kStates[] = {
 } // namespace
 
 GSMRRInfo::GSMRRInfo(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection("GSM RR Info", {Priority::warning, "GSMRRInfo"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("GSM RR Info", "GSMRRInfo", dict, codeDict)
 {
 }
 

@@ -14,8 +14,7 @@ constexpr CellEntry kCellEntries[] = {
 } // namespace
 
 GSMServingCell::GSMServingCell(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection(
-        "GSM Serving Cell", {Priority::warning, "GSMServingCell"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("GSM Serving Cell", "GSMServingCell", dict, codeDict)
 {
 }
 
@@ -42,8 +41,7 @@ void GSMServingCell::update(const LogCode_0x5076& report)
 
 void GSMServingCell::update(const CellMonitorList& list)
 {
-    if (!list.isPresentOrReported())
-        return;
+    list.reportIfAbsent();
     Rows row = rows();
     if (const CellRecord* cell = list.find({telephony::kRadioGSM}, telephony::kCellTypeServing))
         printCell(row, *cell, kCellEntries, "GSMServingCell");

@@ -17,7 +17,7 @@ DictionaryRef rowsOf(const LogCode_0x4005::GSMCell& cell)
 } // namespace
 
 GSMSet::GSMSet(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection("GSM Set", {Priority::warning, "GSMSet"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("GSM Set", "GSMSet", dict, codeDict)
 {
 }
 

@@ -5,8 +5,7 @@
 namespace orvex {
 
 MobileAllocation::MobileAllocation(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection(
-        "Mobile Allocation", {Priority::warning, "MobileAllocation"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("Mobile Allocation", "MobileAllocation", dict, codeDict)
 {
 }
 

@@ -22,8 +22,7 @@ DictionaryRef rowsOfCell(const CellRecord& cell)
 } // namespace
 
 NeighboringCells::NeighboringCells(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection(
-        "Neighboring Cells", {Priority::warning, "NeighboringCells"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("Neighboring Cells", "NeighboringCells", dict, codeDict)
 {
 }
 
@@ -52,9 +51,7 @@ void NeighboringCells::update(const LogCode_0x51FF& report)
 
 void NeighboringCells::update(const CellMonitorList& list)
 {
-    clearSection();
-    if (!list.isPresentOrReported())
-        return;
+    list.reportIfAbsent();
     refillSection(list.findAll(telephony::kRadioGSM, telephony::kCellTypeNeighbor), rowsOfCell);
 }
 

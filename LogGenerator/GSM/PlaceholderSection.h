@@ -1,29 +1,17 @@
 #pragma once
 
-#include "Base.h"
-
-#include "SystemLog.h"
+#include "PacketSection.h"
 
 namespace orvex {
 
 // A section that wants no packets: what the template gives it stays.
-class PlaceholderSection : public Base {
-public:
-    void updateWithData(Packet /*packet*/, LogCode /*logCode*/) final
-    {
-        systemLog(Priority::warning, "%s", _entryWord);
-    }
-
+class PlaceholderSection : public PacketSection<> {
 protected:
     PlaceholderSection(
         const char* sectionName, const char* entryWord, ClassDictionary& dict, CodeDictionary& codeDict)
-        : Base(sectionName, {}, dict, codeDict)
-        , _entryWord(entryWord)
+        : PacketSection(sectionName, {Priority::warning, entryWord}, OtherCodes::areIgnored, dict, codeDict)
     {
     }
-
-private:
-    const char* _entryWord;
 };
 
 } // namespace orvex

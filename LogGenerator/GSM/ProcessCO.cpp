@@ -6,7 +6,7 @@ namespace orvex {
 
 // In the log it has always gone by the name of Process CS.
 ProcessCO::ProcessCO(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection("Process CO", {Priority::warning, "ProcessCS"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("Process CO", "ProcessCS", dict, codeDict)
 {
 }
 

@@ -29,7 +29,7 @@ constexpr EnumText kUpdateStatuses[] = {
 } // namespace
 
 ProcessCS::ProcessCS(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection("Process CS", {Priority::warning, "ProcessCS"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("Process CS", "ProcessCS", dict, codeDict)
 {
 }
 

@@ -43,7 +43,7 @@ constexpr EnumText kUpdateStatuses[] = {
 } // namespace
 
 ProcessPS::ProcessPS(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection("Process PS", {Priority::warning, "ProcessPS"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("Process PS", "ProcessPS", dict, codeDict)
 {
 }
 

@@ -49,8 +49,7 @@ void ServingPLMN::update(const LogCode_0x7132& report)
 
 void ServingPLMN::update(const CellMonitorList& list)
 {
-    if (!list.isPresentOrReported())
-        return;
+    list.reportIfAbsent();
     Rows row = rows();
     if (const CellRecord* cell =
             list.find({telephony::kRadioUMTS, telephony::kRadioGSM}, telephony::kCellTypeServing))

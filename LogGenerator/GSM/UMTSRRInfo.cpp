@@ -37,8 +37,7 @@ double averageTransmitPower(const LogCode_0x4031& report)
 } // namespace
 
 UMTSRRInfo::UMTSRRInfo(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection(
-        "UMTS RR Info", {Priority::warning, "UMTSRRInfo"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("UMTS RR Info", "UMTSRRInfo", dict, codeDict)
 {
 }
 
@@ -69,8 +68,7 @@ void UMTSRRInfo::update(const LogCode_0x4157& report)
 
 void UMTSRRInfo::update(const CellMonitorList& list)
 {
-    if (!list.isPresentOrReported())
-        return;
+    list.reportIfAbsent();
     Rows row = rows();
     if (const CellRecord* cell = list.find({telephony::kRadioUMTS}, telephony::kCellTypeServing))
         printCell(row, *cell, kCellEntries, "UMTSRRInfo");

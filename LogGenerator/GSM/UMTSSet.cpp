@@ -35,7 +35,7 @@ DictionaryRef rowsOfRankedCell(const LogCode_0x4005::UMTSCell& cell)
 } // namespace
 
 UMTSSet::UMTSSet(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection("UMTS Set", {Priority::warning, "UMTSSet"}, OtherCodes::areReported, dict, codeDict)
+    : PacketSection("UMTS Set", "UMTSSet", dict, codeDict)
 {
 }
 
@@ -46,9 +46,7 @@ void UMTSSet::update(const LogCode_0x4005& report)
 
 void UMTSSet::update(const CellMonitorList& list)
 {
-    clearSection();
-    if (!list.isPresentOrReported())
-        return;
+    list.reportIfAbsent();
     refillSection(list.findAll(telephony::kRadioUMTS, telephony::kCellTypeNeighbor), rowsOfCell);
 }
 

@@ -28,8 +28,7 @@ constexpr CellEntry kCellEntries[] = {
 } // namespace
 
 LTEServingCellInfo::LTEServingCellInfo(ClassDictionary& dict, CodeDictionary& codeDict)
-    : PacketSection("Serving Cell Info", {Priority::warning, "LTE Serving Cell Info"},
-        OtherCodes::areReported, dict, codeDict)
+    : PacketSection("Serving Cell Info", "LTE Serving Cell Info", dict, codeDict)
 {
 }
 
@@ -57,8 +56,7 @@ void LTEServingCellInfo::update(const LogCode_0xB0C2& cell)
 
 void LTEServingCellInfo::update(const CellMonitorList& list)
 {
-    if (!list.isPresentOrReported())
-        return;
+    list.reportIfAbsent();
     Rows row = rows();
     if (const CellRecord* cell = list.find({telephony::kRadioLTE}, telephony::kCellTypeServing))
         printCell(row, *cell, kCellEntries, "Serving Cell Info");
