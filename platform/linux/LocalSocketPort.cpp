@@ -82,7 +82,7 @@ void LocalSocketPort::acceptPeers()
     while (QLocalSocket* peer = _server->nextPendingConnection()) {
         std::unique_ptr<QLocalSocket> socket(peer);
         socket->setParent(nullptr); // it is ours, not the server's
-        if (isWelcome(*socket))
+        if (isWelcome(*socket) && makeRoom())
             _connections.push_back(std::make_unique<PortConnection>(_name, std::move(socket), _receiver,
                 [this](PortConnection* connection) { remove(connection); }));
     }
@@ -101,11 +101,22 @@ bool LocalSocketPort::isWelcome(const QLocalSocket& socket) const
         systemLog(Priority::error, "Message port %s: a peer of user %u was refused", _name.c_str(), peer.uid);
         return false;
     }
-    if (_connections.size() >= kMostConnections) {
+    return true;
+}
+
+bool LocalSocketPort::makeRoom()
+{
+    if (_connections.size() < kMostConnections)
+        return true;
+    const auto idle = std::ranges::find_if(_connections, &PortConnection::isIdle);
+    if (idle == _connections.end()) {
         systemLog(Priority::error, "Message port %s: a peer was refused, %zu are connected", _name.c_str(),
             _connections.size());
         return false;
     }
+    systemLog(Priority::warning, "Message port %s: a silent peer was closed, %zu are connected",
+        _name.c_str(), _connections.size());
+    _connections.erase(idle);
     return true;
 }
 

@@ -14,7 +14,8 @@ class QLocalSocket;
 namespace orvex {
 
 // The receiving end of a message channel: a socket file in the port directory, and any number of peers up to
-// a limit, all of them this user or root. Messages of one peer keep their order.
+// a limit, all of them this user or root. Messages of one peer keep their order. Beyond the limit a new peer
+// takes the place of one that connected and kept silent; a peer that speaks keeps its place.
 class LocalSocketPort final : public LocalPort {
 public:
     enum class ListenResult { listening, alreadyExists, failed };
@@ -36,6 +37,8 @@ public:
 private:
     void acceptPeers();
     bool isWelcome(const QLocalSocket& socket) const;
+    // Where all places are taken, makes one by closing the oldest connection that never said anything.
+    bool makeRoom();
     void remove(PortConnection* connection);
     void close();
 

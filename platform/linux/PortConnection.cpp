@@ -61,6 +61,7 @@ void PortConnection::handleMessages()
             break;
         }
         ++handled;
+        _hasSpoken = true;
         if (message->kind == FrameKind::reply)
             continue; // nobody asked
         const auto receiver = _receiver;

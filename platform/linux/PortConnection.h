@@ -29,6 +29,9 @@ public:
         std::string portName, std::unique_ptr<QLocalSocket> socket, Receiver receiver, EndHandler onEnd);
     ~PortConnection() override;
 
+    // True when it can be given up for another: it has never sent a whole message.
+    bool isIdle() const { return !_hasSpoken && !_isHandling; }
+
 private:
     void timerEvent(QTimerEvent*) noexcept override;
     void wake();
@@ -44,6 +47,7 @@ private:
     EndHandler _onEnd;
     QBasicTimer _turn;
     bool _isHandling = false;
+    bool _hasSpoken = false;
 };
 
 } // namespace orvex

@@ -1,6 +1,8 @@
 #include "PortTest.h"
 #include "QtRunLoop.h"
 
+#include <deque>
+
 #include <sys/fsuid.h>
 
 namespace orvex {
@@ -61,19 +63,55 @@ TEST_F(HostilePeerTest, NumberOfPeersIsBounded)
 {
     const auto local = ports.createLocalPort("a", collector());
     std::vector<std::unique_ptr<RawPeer>> peers;
-    for (int i = 0; i < 65; ++i) {
+    const auto connect = [&](const char* word) {
         peers.push_back(std::make_unique<RawPeer>());
         ASSERT_TRUE(peers.back()->connectTo(pathOf("a")));
+        ASSERT_TRUE(peers.back()->write({1, FrameKind::oneWay, 0, bytesOf(word)}));
         turnFor(1ms);
-    }
+    };
+    for (int i = 0; i < 64; ++i)
+        connect("x");
+    EXPECT_TRUE(waitUntil([&] { return received.size() == 64 * 4; }));
+    received.clear();
+    connect("one too many");
     EXPECT_TRUE(waitUntil([&] { return peers.back()->isClosedByOther(); }));
-    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("64 are connected")));
+    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("a peer was refused, 64 are connected")));
     peers.erase(peers.begin());
     turnFor(20ms);
-    RawPeer next;
-    ASSERT_TRUE(next.connectTo(pathOf("a")));
-    ASSERT_TRUE(next.write({1, FrameKind::oneWay, 0, bytesOf("next")}));
+    connect("next");
     EXPECT_TRUE(waitUntil([&] { return received == "1:next "; })) << "the place of the one that left is free";
+}
+
+TEST_F(HostilePeerTest, SilentPeersDoNotKeepOthersOut)
+{
+    const auto local = ports.createLocalPort("a", collector());
+    RawPeer real;
+    ASSERT_TRUE(real.connectTo(pathOf("a")));
+    ASSERT_TRUE(real.write({1, FrameKind::oneWay, 0, bytesOf("here")}));
+    RawPeer slow; // a byte now and then
+    ASSERT_TRUE(slow.connectTo(pathOf("a")));
+    const Bytes frame = encodedFrame({2, FrameKind::oneWay, 0, bytesOf("slow")});
+    ASSERT_TRUE(slow.write(ByteView(frame).first(frame.size() - 1)));
+    EXPECT_TRUE(waitUntil([&] { return received == "1:here "; }));
+
+    std::deque<RawPeer> silent;
+    for (int i = 0; i < 10'000; ++i) {
+        silent.emplace_back();
+        ASSERT_TRUE(silent.back().connectTo(pathOf("a")));
+        QCoreApplication::processEvents();
+        if (silent.size() > 200)
+            silent.pop_front(); // the test has its limits too
+        if (i % 1000 == 0) {
+            ASSERT_TRUE(real.write({1, FrameKind::oneWay, 0, bytesOf("on")}));
+        }
+    }
+    EXPECT_TRUE(slow.isClosedByOther());
+    RawPeer late;
+    ASSERT_TRUE(late.connectTo(pathOf("a")));
+    ASSERT_TRUE(late.write({3, FrameKind::oneWay, 0, bytesOf("late")}));
+    EXPECT_TRUE(waitUntil([&] { return received.ends_with("3:late "); })) << received;
+    EXPECT_EQ(received.size(), 7U + 10 * 5 + 7);
+    EXPECT_THAT(log.take(), testing::Each(HasSubstr("a silent peer was closed, 64 are connected")));
 }
 
 TEST_F(HostilePeerTest, FloodLeavesTheEventLoopItsTurns)
