@@ -12,6 +12,16 @@ if(ORVEX_SANITIZE)
     target_link_options(orvex_build_flags INTERFACE -fsanitize=address,undefined)
 endif()
 
+# What everybody trusts has its lines counted: the generators and the model.
+function(orvex_count_coverage)
+    if(ORVEX_COVERAGE)
+        foreach(target ${ARGN})
+            target_compile_options(${target} PRIVATE --coverage -fprofile-update=atomic)
+            target_link_options(${target} PUBLIC --coverage)
+        endforeach()
+    endif()
+endfunction()
+
 # orvex_add_floor(TARGET BASE <folder> HEADERS ... SOURCES ... LINKS ...)
 # BASE is the one folder the target exports. Every header is also compiled alone by the target
 # all_verify_interface_header_sets.
