@@ -4,7 +4,7 @@
 
 #include "PacketReader.h"
 
-#include <chrono>
+#include <array>
 #include <optional>
 
 namespace orvex {
@@ -16,11 +16,14 @@ namespace orvex {
 //   4   u64  time
 //   12       payload
 //
-// A DLF that a snapshot holds is not so clean: of the messages of each refresh interval only the first stands
-// there as such a record, the others still have their log type (1 or 255), and its prefix of two bytes where
-// there is one, in front. Whether a byte is a log type or the low half of a length cannot be told from the
-// byte alone; of the readings that are possible the one is taken under which the next records fit best too,
-// by their lengths and by times that are near to each other. Bytes under which nothing fits are skipped.
+// A DLF that a snapshot holds is not so clean. It was written by dropping the first byte of each refresh
+// interval, so that only the first message of an interval stands there as such a record. The others still
+// have their log type (1 or 255) in front, and before it, where there is one, a prefix of two bytes, 0x81 and
+// any other; of a prefix that begins an interval the second byte is left.
+//
+// Whether a byte is a log type or the low half of a length cannot be told from the byte alone; of the
+// readings that are possible the one is taken under which the next records fit best too, by their lengths and
+// by times that are near to each other. Bytes under which nothing fits are skipped.
 class DlfRecords {
 public:
     explicit DlfRecords(ByteView bytes);
@@ -39,24 +42,32 @@ public:
     bool beginsWithRecord() const { return fits(0); }
 
 private:
-    // How a record may begin at a place.
+    // What may stand before a record: so many bytes of a prefix, and a log type.
+    struct Form {
+        std::size_t prefix;
+        bool hasLogType;
+    };
+    static const std::array<Form, 4> kFormsInSnapshots;
+    static const std::array<Form, 4> kForms;
+
+    // How the record at a place may begin.
     struct Reading {
         std::size_t start;
         bool hasLogType;
     };
-    static constexpr std::size_t kReadings = 3;
-
     bool fits(std::size_t start) const;
     std::size_t endOf(std::size_t start) const { return start + _bytes.u16(start); }
-    std::optional<Reading> readingAt(std::size_t place, std::size_t number) const;
+    std::optional<Reading> readingAt(std::size_t place, const Form& form) const;
     int scoreOf(const Reading& reading, std::optional<std::size_t> before, int depth) const;
     int bestScoreAt(std::size_t place, std::size_t before, int depth) const;
+    std::uint64_t timeOf(std::size_t start) const;
     bool timesAreNear(std::size_t one, std::size_t other) const;
 
     PacketReader _bytes;
     bool _isSnapshotDLF; // begins with the version report that this system writes
+    const std::array<Form, 4>& _forms;
     std::size_t _place = 0;
-    std::optional<std::size_t> _last; // start of the record before
+    std::optional<std::size_t> _last; // start of the record before, when that has a time
     bool _isLost = false;             // the bytes before made no record
     std::size_t _skipped = 0;
 };
