@@ -41,7 +41,6 @@ DlfRecords::DlfRecords(ByteView bytes)
     : _bytes(bytes)
     , _isSnapshotDLF(
           _bytes.u16(0) == kMTLDLFVersionReportLength && _bytes.u16(kCodeOffset) == kVersionReportCode)
-    , _forms(_isSnapshotDLF ? kFormsInSnapshots : kForms)
 {
 }
 
@@ -87,7 +86,7 @@ int DlfRecords::scoreOf(const Reading& reading, std::optional<std::size_t> befor
 int DlfRecords::bestScoreAt(std::size_t place, std::size_t before, int depth) const
 {
     int best = 0;
-    for (const Form& form : _forms) {
+    for (const Form& form : forms()) {
         if (const auto reading = readingAt(place, form))
             best = std::max(best, scoreOf(*reading, before, depth));
     }
@@ -99,7 +98,7 @@ std::optional<DlfRecords::Record> DlfRecords::next()
     for (; _place < _bytes.size(); ++_place, ++_skipped) {
         std::optional<Reading> best;
         int bestScore = _isLost ? kFoundAgain : 0;
-        for (const Form& form : _forms) {
+        for (const Form& form : forms()) {
             const auto reading = readingAt(_place, form);
             const int score = reading ? scoreOf(*reading, _last, kDepth) : 0;
             if (score > bestScore) {

@@ -55,6 +55,7 @@ private:
         std::size_t start;
         bool hasLogType;
     };
+    const std::array<Form, 4>& forms() const { return _isSnapshotDLF ? kFormsInSnapshots : kForms; }
     bool fits(std::size_t start) const;
     std::size_t endOf(std::size_t start) const { return start + _bytes.u16(start); }
     std::optional<Reading> readingAt(std::size_t place, const Form& form) const;
@@ -65,7 +66,6 @@ private:
 
     PacketReader _bytes;
     bool _isSnapshotDLF; // begins with the version report that this system writes
-    const std::array<Form, 4>& _forms;
     std::size_t _place = 0;
     std::optional<std::size_t> _last; // start of the record before, when that has a time
     bool _isLost = false;             // the bytes before made no record
