@@ -2,18 +2,21 @@
 
 #include <pcap/pcap.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstring>
 
 namespace orvex {
 
 namespace {
-constexpr int kLongestMessage = 16 << 20; // what a message port carries
+// Readers refuse a file with a longer packet. What a message has beyond it is left out, and its true length
+// says so.
+constexpr std::size_t kLongestPacket = 262'144;
 } // namespace
 
 struct PcapWriter::Dump {
     explicit Dump(std::FILE* file)
-        : handle(pcap_open_dead(DLT_USER0, kLongestMessage))
+        : handle(pcap_open_dead(DLT_USER0, kLongestPacket))
         , dumper(pcap_dump_fopen(handle, file))
     {
     }
@@ -43,13 +46,16 @@ PcapWriter::~PcapWriter() = default;
 
 void PcapWriter::write(ByteView message, std::chrono::microseconds time)
 {
-    if (!_dump)
+    if (!_dump || !_error.empty())
         return;
     pcap_pkthdr header{};
     header.ts.tv_sec = static_cast<time_t>(time.count() / 1'000'000);
     header.ts.tv_usec = static_cast<suseconds_t>(time.count() % 1'000'000);
-    header.caplen = header.len = static_cast<bpf_u_int32>(message.size());
+    header.caplen = static_cast<bpf_u_int32>(std::min(message.size(), kLongestPacket));
+    header.len = static_cast<bpf_u_int32>(message.size());
     pcap_dump(reinterpret_cast<u_char*>(_dump->dumper), &header, message.data());
+    if (std::ferror(pcap_dump_file(_dump->dumper)) != 0)
+        _error = _path + ": " + std::strerror(errno);
 }
 
 void PcapWriter::flush()

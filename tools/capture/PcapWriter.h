@@ -9,6 +9,7 @@
 namespace orvex {
 
 // Writes log messages as a pcap file with microseconds and link type 147 (USER0), one message per packet.
+// After the first failure nothing more is written.
 class PcapWriter {
 public:
     // An existing file is overwritten.
