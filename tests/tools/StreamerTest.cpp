@@ -82,7 +82,7 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
     EXPECT_EQ(streamer->sent(), client->received.size());
     const auto scenario = findScenario("MRL_LTE", "")->make({});
     for (const Bytes& message : client->received)
-        ASSERT_EQ(message, scenario->next().message.bytes);
+        ASSERT_EQ(message, scenario->next()->message.bytes);
 }
 
 TEST_F(StreamerTest, NaturalPaceIsThatOfTheScenario)
@@ -92,7 +92,7 @@ TEST_F(StreamerTest, NaturalPaceIsThatOfTheScenario)
     ASSERT_TRUE(tickUntil([&] { return std::chrono::steady_clock::now() - start > 1500ms; }));
     const auto scenario = findScenario("MRL_LTE", "")->make({});
     std::size_t due = 0;
-    while (scenario->next().due <= 1500ms)
+    while (scenario->next()->due <= 1500ms)
         ++due;
     EXPECT_NEAR(static_cast<double>(client->received.size()), static_cast<double>(due), 6);
 }

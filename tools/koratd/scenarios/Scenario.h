@@ -1,8 +1,6 @@
 #pragma once
 
-#include "packets/LogMessage.h"
-
-#include <vector>
+#include "packets/MessageSource.h"
 
 namespace orvex::korat {
 
@@ -11,21 +9,7 @@ struct ScenarioSettings {
     Microseconds start{};   // the time of the first packet, since 1970
 };
 
-// What happens to a handset, as the messages that its baseband would log. It runs on a clock of its own, as
-// fast as it is asked, and never ends.
-class Scenario {
-public:
-    struct Item {
-        Microseconds due{}; // since the scenario's start
-        LogMessage message;
-    };
-
-    virtual ~Scenario() = default;
-
-    // The next message; their times never go back.
-    virtual Item next() = 0;
-    // The codes of all messages that can come; empty when they carry none.
-    virtual std::vector<LogCode> codes() const = 0;
-};
+// What happens to a handset, as the messages that its baseband would log. It never ends.
+class Scenario : public MessageSource { };
 
 } // namespace orvex::korat

@@ -4,7 +4,7 @@
 
 namespace orvex::korat {
 
-Scenario::Item SteppedScenario::next()
+std::optional<MessageSource::Item> SteppedScenario::next()
 {
     while (_due.empty()) {
         step();

@@ -14,7 +14,7 @@ public:
     {
     }
 
-    Item next() final;
+    std::optional<Item> next() final;
 
 protected:
     static constexpr std::int64_t kStepsPerSecond = 10;

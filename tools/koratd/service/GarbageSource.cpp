@@ -25,7 +25,7 @@ bool isReadAsPropertyList(const Bytes& message)
 
 Bytes GarbageSource::pass(Bytes message)
 {
-    if (!_randomness.chance(_share))
+    if (message.empty() || !_randomness.chance(_share))
         return message;
     Bytes result = garbage(message);
     while (isReadAsPropertyList(result))

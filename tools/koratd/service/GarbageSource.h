@@ -18,7 +18,7 @@ public:
     {
     }
 
-    // The message or, by chance, what comes in its place.
+    // The message or, by chance, what comes in its place. An empty one is bad enough as it is.
     Bytes pass(Bytes message);
 
 private:

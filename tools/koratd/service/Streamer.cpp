@@ -1,6 +1,7 @@
 #include "Streamer.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace orvex::korat {
 
@@ -21,16 +22,18 @@ double seconds(std::chrono::duration<double> duration)
 }
 } // namespace
 
-Streamer::Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client, std::unique_ptr<Scenario> scenario,
-    Subscription subscription, GarbageSource garbage, Pace pace)
+Streamer::Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client,
+    std::unique_ptr<MessageSource> source, Subscription subscription, GarbageSource garbage, Pace pace,
+    Listener listener)
     : _client(std::move(client))
-    , _scenario(std::move(scenario))
+    , _source(std::move(source))
     , _subscription(std::move(subscription))
     , _garbage(garbage)
     , _pace(pace)
+    , _listener(std::move(listener))
     , _lastTick(SteadyClock::now())
 {
-    if (_subscription.wantsAny(_scenario->codes()))
+    if (_subscription.wantsAny(_source->codes()))
         _timer = runLoop.startTimer(kTick, [this] { tick(); });
 }
 
@@ -66,13 +69,26 @@ bool Streamer::isDue() const
 void Streamer::findNext(SteadyClock::time_point deadline)
 {
     while (SteadyClock::now() < deadline) {
-        auto item = _scenario->next();
-        if (_subscription.wants(item.message.code)) {
-            item.message.bytes = _garbage.pass(std::move(item.message.bytes));
+        auto item = _source->next();
+        if (!item) {
+            if (goOnAfterTheEnd())
+                continue;
+            _timer.reset();
+            return;
+        }
+        if (_subscription.wants(item->message.code)) {
+            item->message.bytes = _garbage.pass(std::move(item->message.bytes));
             _next = std::move(item);
+            _foundSomething = true;
             return;
         }
     }
+}
+
+bool Streamer::goOnAfterTheEnd()
+{
+    // Where nothing was wanted once, nothing ever will be, however often it comes by.
+    return std::exchange(_foundSomething, false) && _source->restart();
 }
 
 bool Streamer::sendNext()
@@ -80,6 +96,8 @@ bool Streamer::sendNext()
     // A message that the port does not take now stays the next one.
     if (_client->send(kLogMessageId, _next->message.bytes, 0ms) != RemotePort::Status::success)
         return false;
+    if (_listener)
+        _listener(*_next);
     _next.reset();
     _allowance -= 1;
     ++_sent;

@@ -3,17 +3,18 @@
 #include "GarbageSource.h"
 #include "Subscription.h"
 
-#include "scenarios/Scenario.h"
+#include "packets/MessageSource.h"
 
 #include "MessagePort.h"
 #include "RunLoop.h"
 
+#include <functional>
 #include <optional>
 
 namespace orvex::korat {
 
-// Sends a scenario's messages to a client: those it wants, when they are due, or at a given rate. While the
-// client is slow, the scenario stands still; nothing is dropped.
+// Sends a source's messages to a client: those it wants, when they are due, or at a given rate. While the
+// client is slow, the source stands still; nothing is dropped. After the end of the source the stream rests.
 class Streamer {
 public:
     struct Pace {
@@ -21,8 +22,11 @@ public:
         std::optional<std::uint64_t> count; // messages in all
     };
 
-    Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client, std::unique_ptr<Scenario> scenario,
-        Subscription subscription, GarbageSource garbage, Pace pace);
+    // Is told of every message that was sent.
+    using Listener = std::function<void(const MessageSource::Item& item)>;
+
+    Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client, std::unique_ptr<MessageSource> source,
+        Subscription subscription, GarbageSource garbage, Pace pace, Listener listener = {});
 
     // Messages sent so far.
     std::uint64_t sent() const { return _sent; }
@@ -34,17 +38,20 @@ private:
     bool isDue() const;
     bool sendNext();
     void findNext(SteadyClock::time_point deadline);
+    bool goOnAfterTheEnd();
 
     std::shared_ptr<RemotePort> _client;
-    std::unique_ptr<Scenario> _scenario;
+    std::unique_ptr<MessageSource> _source;
     Subscription _subscription;
     GarbageSource _garbage;
     Pace _pace;
+    Listener _listener;
 
     SteadyClock::time_point _lastTick;
-    Microseconds _elapsed{};             // on the scenario's clock
-    double _allowance = 0;               // messages that the rate allows now
-    std::optional<Scenario::Item> _next; // the next message that the client wants
+    Microseconds _elapsed{};                  // on the source's clock
+    double _allowance = 0;                    // messages that the rate allows now
+    std::optional<MessageSource::Item> _next; // the next message that the client wants
+    bool _foundSomething = false;             // since the source's first message
     std::uint64_t _sent = 0;
     std::unique_ptr<RunLoop::Timer> _timer;
 };
