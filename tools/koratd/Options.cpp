@@ -3,6 +3,7 @@
 #include <QCommandLineParser>
 
 #include <cmath>
+#include <filesystem>
 
 namespace orvex::korat {
 
@@ -82,16 +83,42 @@ QStringList list(const std::vector<std::string>& arguments)
     return result;
 }
 
+std::optional<std::string> file(const QCommandLineParser& parser, const char* option)
+{
+    return parser.isSet(option) ? std::optional(parser.value(option).toStdString()) : std::nullopt;
+}
+
+// Reads what is played and recorded; why it makes no sense, or nothing.
+std::string readCaptures(const QCommandLineParser& parser, Options& options)
+{
+    options.replay = file(parser, "replay");
+    options.record = file(parser, "record");
+    options.isLooped = parser.isSet("loop");
+    if (!options.replay)
+        return options.isLooped ? "--loop goes with --replay" : "";
+    for (const char* option : {"scenario", "seed"}) {
+        if (parser.isSet(option))
+            return std::string("--replay and --") + option + " exclude each other";
+    }
+    std::error_code notThere;
+    if (options.record && std::filesystem::equivalent(*options.replay, *options.record, notThere))
+        return "--record would overwrite the capture that is replayed";
+    options.scenario = nullptr;
+    return {};
+}
+
 // The options as they stand; the error is empty when all of them make sense.
 std::string read(const QCommandLineParser& parser, Options& options)
 {
-    const std::string technology = parser.value("technology").toStdString();
+    const std::string technology = options.technology = parser.value("technology").toStdString();
     const std::string scenario = parser.value("scenario").toStdString();
     options.scenario = findScenario(technology, scenario);
     if (!findScenario(technology, {}))
         return "no scenario for the technology \"" + technology + "\"; known are: " + knownTechnologies();
     if (!options.scenario)
         return technology + " has no scenario \"" + scenario + "\"; known are: " + knownScenarios(technology);
+    if (const std::string error = readCaptures(parser, options); !error.empty())
+        return error;
     if (parser.isSet("rate")) {
         options.rate = realIn(parser.value("rate"), 0, kLargestRate);
         if (options.rate.value_or(0) <= 0)
@@ -121,7 +148,7 @@ OptionsResult optionsFromArguments(const std::vector<std::string>& arguments)
     QCommandLineParser parser;
     parser.setApplicationDescription(
         "Stands in for a handset's telephony service: opens the log channel to a "
-        "monitor and streams a scenario's log messages to it.");
+        "monitor and streams the log messages of a scenario or a capture to it.");
     parser.addOptions({
         {{"h", "help"}, "Shows this help."},
         {{"v", "version"}, "Shows the version."},
@@ -129,7 +156,11 @@ OptionsResult optionsFromArguments(const std::vector<std::string>& arguments)
             QString::fromStdString("Log technology (default: MRL_LTE): " + knownTechnologies() + "."), "T",
             "MRL_LTE"},
         {"scenario", "What happens to the handset (default: the technology's first).", "NAME"},
-        {"rate", "Streams as many packets per second, instead of the scenario's own pace.",
+        {"replay", "Plays a capture, pcap or DLF, in place of a scenario.", "FILE"},
+        {"loop", "Plays the capture again and again."},
+        {"record", "Writes what is streamed into a pcap file, at the scenario's or the capture's own pace.",
+            "FILE"},
+        {"rate", "Streams as many packets per second, instead of the scenario's or the capture's own pace.",
             "PACKETS_PER_SECOND"},
         {"count", "Rests after that many packets to a client.", "N"},
         {"seed", "Another seed makes another drive.", "N", "1"},

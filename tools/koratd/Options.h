@@ -11,9 +11,13 @@ namespace orvex::korat {
 
 // What the command line asks for.
 struct Options {
-    const ScenarioEntry* scenario = nullptr; // names the technology too
-    std::optional<double> rate;              // messages per second; none: the scenario's natural pace
-    std::optional<std::uint64_t> count;      // messages to a client, after which its stream rests
+    std::string technology;
+    const ScenarioEntry* scenario = nullptr; // what is played; none: the capture
+    std::optional<std::string> replay;       // file of the capture to play
+    bool isLooped = false;                   // the capture is played again and again
+    std::optional<std::string> record;       // file of the capture to write of what is streamed
+    std::optional<double> rate;         // messages per second; none: the scenario's or capture's own pace
+    std::optional<std::uint64_t> count; // messages to a client, after which its stream rests
     std::uint64_t seed = 1;
     Faults faults;
 };

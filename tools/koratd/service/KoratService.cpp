@@ -2,6 +2,8 @@
 
 #include "Report.h"
 
+#include "replay/ReplaySource.h"
+
 #include "Dictionary.h"
 #include "PropertyList.h"
 #include "TelephonyConstants.h"
@@ -41,6 +43,11 @@ KoratService::~KoratService()
 
 bool KoratService::start()
 {
+    const std::string fault = _options.replay ? ReplaySource::faultOf(*_options.replay) : std::string();
+    if (!fault.empty()) {
+        report("%s", fault.c_str());
+        return false;
+    }
     auto local = _platform.ports.createLocalPort(telephony::kServicePortName,
         [this](std::int32_t messageId, ByteView data) { return receive(messageId, data); });
     if (!local.port || local.alreadyExisted) {
@@ -49,9 +56,16 @@ bool KoratService::start()
         return false;
     }
     _port = std::move(local.port);
+    if (_options.record) { // not earlier: another koratd may be writing that file
+        _recorder = std::make_unique<Recorder>(*_options.record);
+        if (!_recorder->isRecording())
+            return false;
+    }
     _watch = _platform.runLoop.startTimer(kWatchPeriod, [this] {
         if (_channel && !_channel->isClientThere())
             closeChannel();
+        if (_recorder)
+            _recorder->flush();
     });
     return true;
 }
@@ -60,6 +74,7 @@ void KoratService::stop()
 {
     _watch.reset();
     closeChannel();
+    _recorder.reset();
     if (_port)
         _port->invalidate();
     _port.reset();
@@ -91,7 +106,7 @@ Bytes KoratService::openChannel(const std::string& clientPortName)
         return channelReply(EBUSY);
     }
     const std::string channelPortName = kChannelPortPrefix + std::to_string(++_channelNumber);
-    _channel = LogChannel::open(_platform, _options, clientPortName, channelPortName);
+    _channel = LogChannel::open(_platform, _options, _recorder.get(), clientPortName, channelPortName);
     if (!_channel)
         return channelReply(ENOENT);
     report("serving %s", clientPortName.c_str());

@@ -13,9 +13,10 @@ public:
     KoratService(const KoratService&) = delete;
     KoratService& operator=(const KoratService&) = delete;
 
-    // Serves the port. False when it cannot be had; why is reported.
+    // Serves the port. False when it cannot be had, the capture to replay cannot be read or the one to record
+    // cannot be written; why is reported.
     bool start();
-    // Closes all ports.
+    // Closes all ports and the recorded capture.
     void stop();
 
     // Messages sent to all clients together.
@@ -30,10 +31,11 @@ private:
     LogChannel::Platform _platform;
     Options _options;
     std::shared_ptr<LocalPort> _port;
+    std::unique_ptr<Recorder> _recorder; // outlives the channels
     std::unique_ptr<LogChannel> _channel;
     std::uint64_t _sentBefore = 0; // over channels that are closed
     int _channelNumber = 0;
-    std::unique_ptr<RunLoop::Timer> _watch; // for a client that has gone
+    std::unique_ptr<RunLoop::Timer> _watch; // for a client that has gone, and on the disk
 };
 
 } // namespace orvex::korat

@@ -1,5 +1,7 @@
 #include "LogChannel.h"
 
+#include "replay/ReplaySource.h"
+
 #include "Dictionary.h"
 #include "PropertyList.h"
 #include "TelephonyConstants.h"
@@ -17,12 +19,19 @@ Microseconds timeNow()
 {
     return std::chrono::duration_cast<Microseconds>(std::chrono::system_clock::now().time_since_epoch());
 }
+
+std::unique_ptr<MessageSource> sourceFor(const Options& options, Microseconds start)
+{
+    if (options.replay)
+        return std::make_unique<ReplaySource>(*options.replay, options.isLooped);
+    return options.scenario->make({options.seed, start});
+}
 } // namespace
 
 std::unique_ptr<LogChannel> LogChannel::open(const Platform& platform, const Options& options,
-    const std::string& clientPortName, const std::string& channelPortName)
+    Recorder* recorder, const std::string& clientPortName, const std::string& channelPortName)
 {
-    std::unique_ptr<LogChannel> channel(new LogChannel(platform, options, clientPortName));
+    std::unique_ptr<LogChannel> channel(new LogChannel(platform, options, recorder, clientPortName));
     channel->_client = platform.ports.createRemotePort(clientPortName);
     if (!channel->_client)
         return nullptr;
@@ -37,9 +46,11 @@ std::unique_ptr<LogChannel> LogChannel::open(const Platform& platform, const Opt
     return channel;
 }
 
-LogChannel::LogChannel(const Platform& platform, const Options& options, std::string clientPortName)
+LogChannel::LogChannel(
+    const Platform& platform, const Options& options, Recorder* recorder, std::string clientPortName)
     : _platform(platform)
     , _options(options)
+    , _recorder(recorder)
     , _clientPortName(std::move(clientPortName))
 {
 }
@@ -73,18 +84,24 @@ std::optional<Bytes> LogChannel::technologyReply() const
         return std::nullopt;
     if (_options.faults.badReply)
         return Bytes(kNoPropertyList.begin(), kNoPropertyList.end());
-    const char* technology =
-        _options.faults.unknownTechnology ? kUnheardOfTechnology : _options.scenario->technology;
+    const std::string technology =
+        _options.faults.unknownTechnology ? kUnheardOfTechnology : _options.technology;
     return propertyListXML(Dictionary::make({{telephony::kGetTechnology, technology}}));
 }
 
 void LogChannel::startStream(const Dictionary& command)
 {
     _sentBefore = sent();
-    const ScenarioSettings settings{_options.seed, timeNow()};
-    _streamer = std::make_unique<Streamer>(_platform.runLoop, _client, _options.scenario->make(settings),
+    const Microseconds start = timeNow();
+    Streamer::Listener listener;
+    if (_recorder) {
+        listener = [recorder = _recorder, start](const MessageSource::Item& item) {
+            recorder->write(item.message.bytes, start + item.due);
+        };
+    }
+    _streamer = std::make_unique<Streamer>(_platform.runLoop, _client, sourceFor(_options, start),
         Subscription(command), GarbageSource(_options.faults.garbagePercent, _options.seed),
-        Streamer::Pace{_options.rate, _options.count});
+        Streamer::Pace{_options.rate, _options.count}, std::move(listener));
 }
 
 } // namespace orvex::korat

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Recorder.h"
 #include "Streamer.h"
 
 #include "Options.h"
@@ -15,8 +16,9 @@ public:
     };
 
     // Opens the way to the client's port and serves a port of the given name. Null when one of the two fails.
+    // What is streamed goes to the recorder too, when there is one.
     static std::unique_ptr<LogChannel> open(const Platform& platform, const Options& options,
-        const std::string& clientPortName, const std::string& channelPortName);
+        Recorder* recorder, const std::string& clientPortName, const std::string& channelPortName);
 
     ~LogChannel();
     LogChannel(const LogChannel&) = delete;
@@ -27,7 +29,8 @@ public:
     std::uint64_t sent() const { return _sentBefore + (_streamer ? _streamer->sent() : 0); }
 
 private:
-    LogChannel(const Platform& platform, const Options& options, std::string clientPortName);
+    LogChannel(
+        const Platform& platform, const Options& options, Recorder* recorder, std::string clientPortName);
 
     std::optional<Bytes> receive(std::int32_t messageId, ByteView data);
     std::optional<Bytes> technologyReply() const;
@@ -35,6 +38,7 @@ private:
 
     Platform _platform;
     Options _options;
+    Recorder* _recorder;
     std::string _clientPortName;
     std::shared_ptr<RemotePort> _client;
     std::shared_ptr<LocalPort> _port;
