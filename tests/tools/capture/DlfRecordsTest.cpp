@@ -1,0 +1,161 @@
+#include "DlfRecords.h"
+
+#include "DlfBytes.h"
+
+#include <gmock/gmock.h>
+
+#include <algorithm>
+#include <random>
+
+namespace orvex {
+namespace {
+
+using namespace test;
+
+constexpr int kNoType = -1;
+
+struct Found {
+    int logType;
+    Bytes bytes;
+
+    bool operator==(const Found&) const = default;
+    friend void PrintTo(const Found& found, std::ostream* out)
+    {
+        *out << "type " << found.logType << ", " << found.bytes.size() << " bytes";
+    }
+};
+
+// Walks all records. Each byte belongs to a record, to what stands before one, or was skipped.
+std::vector<Found> recordsOf(const Bytes& dlf, std::size_t& skipped)
+{
+    const Bytes exact(dlf); // without spare capacity, in which reads beyond the end would go unseen
+    DlfRecords records(exact);
+    std::vector<Found> result;
+    std::size_t place = 0;
+    std::size_t skippedBefore = 0;
+    while (const auto record = records.next()) {
+        const std::size_t front = record->start - place - (records.skippedBytes() - skippedBefore);
+        EXPECT_LE(front, 3U) << "at " << place;
+        EXPECT_EQ(front > 0, record->logType.has_value()) << "at " << place;
+        skippedBefore = records.skippedBytes();
+        place = record->start + record->bytes.size();
+        EXPECT_EQ(exact.data() + record->start, record->bytes.data());
+        result.push_back({record->logType ? *record->logType : kNoType,
+            Bytes(record->bytes.begin(), record->bytes.end())});
+    }
+    skipped = records.skippedBytes();
+    EXPECT_EQ(place + skipped - skippedBefore, exact.size());
+    return result;
+}
+
+TEST(DlfRecords, AreFoundInEachForm)
+{
+    const Bytes a = dlfRecord(12, 1);
+    const Bytes b = dlfRecord(40, 2);
+    const auto typed = [](Bytes front, const Bytes& record) { return front += record; };
+    const struct {
+        const char* name;
+        std::vector<Bytes> parts;
+        std::vector<Found> records; // without the version report
+    } cases[] = {
+        {"clean", {a, b, a}, {{kNoType, a}, {kNoType, b}, {kNoType, a}}},
+        {"clean, lengths that look like log types", {dlfRecord(257, 1), dlfRecord(511, 2), dlfRecord(255, 3)},
+            {{kNoType, dlfRecord(257, 1)}, {kNoType, dlfRecord(511, 2)}, {kNoType, dlfRecord(255, 3)}}},
+        {"interval of one message", {versionReport(), a, b}, {{kNoType, a}, {kNoType, b}}},
+        {"interval of several messages", {versionReport(), a, typed({1}, b), typed({255}, a), b},
+            {{kNoType, a}, {1, b}, {255, a}, {kNoType, b}}},
+        {"prefixes, the second byte of which looks like something",
+            {versionReport(), a, typed({0x81, 0, 1}, b), typed({0x81, 1, 1}, a), typed({0x81, 0x81, 255}, b),
+                typed({0x81, 255, 1}, a)},
+            {{kNoType, a}, {1, b}, {1, a}, {255, b}, {1, a}}},
+        {"intervals that begin within a prefix",
+            {versionReport(), typed({7, 1}, a), typed({1, 255}, b), typed({0x81, 1}, a), typed({1}, b)},
+            {{1, a}, {255, b}, {1, a}, {1, b}}},
+        {"snapshot, lengths that look like log types",
+            {versionReport(), dlfRecord(257, 1), typed({1}, dlfRecord(511, 2)), dlfRecord(255, 3),
+                typed({255}, dlfRecord(513, 4))},
+            {{kNoType, dlfRecord(257, 1)}, {1, dlfRecord(511, 2)}, {kNoType, dlfRecord(255, 3)},
+                {255, dlfRecord(513, 4)}}},
+        {"payloads that look like records", {versionReport(), dlfRecord(257, 1, 1), dlfRecord(257, 2, 1)},
+            {{kNoType, dlfRecord(257, 1, 1)}, {kNoType, dlfRecord(257, 2, 1)}}},
+    };
+    for (const auto& [name, parts, expected] : cases) {
+        SCOPED_TRACE(name);
+        Bytes dlf;
+        for (const Bytes& part : parts)
+            dlf += part;
+        std::size_t skipped = 0;
+        auto records = recordsOf(dlf, skipped);
+        if (parts.front() == versionReport())
+            records.erase(records.begin());
+        EXPECT_EQ(records, expected);
+        EXPECT_EQ(skipped, 0U);
+    }
+}
+
+TEST(DlfRecords, CutFileGivesWhatIsWholeAndSaysWhatIsNot)
+{
+    std::vector<Bytes> messages;
+    for (std::uint8_t i = 0; i < 6; ++i) {
+        messages.push_back(i % 3 == 2 ? Bytes{0x81, 0x22, 1} : Bytes{1});
+        messages.back() += dlfRecord(std::size_t{20} + i, i);
+    }
+    const Bytes whole = snapshotDlf(messages, 4);
+    std::size_t skipped = 0;
+    const std::vector<Found> all = recordsOf(whole, skipped);
+    ASSERT_EQ(all.size(), 7U);
+    for (std::size_t length = whole.size(); length-- > 0;) {
+        const auto some =
+            recordsOf(Bytes(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(length)), skipped);
+        ASSERT_LT(some.size(), all.size()) << length;
+        EXPECT_TRUE(std::ranges::equal(some, std::span(all).first(some.size()))) << length;
+        std::size_t used = 0;
+        for (const Found& found : some)
+            used += found.bytes.size();
+        EXPECT_LE(length - used - skipped, 3 * some.size()) << length;
+        EXPECT_LT(skipped, kMTLDLFVersionReportLength) << length;
+    }
+}
+
+TEST(DlfRecords, AreFoundAgainBehindALengthThatLies)
+{
+    for (const std::uint8_t lie : Bytes{0, 1, 11, 255}) { // the last one leads beyond the end
+        Bytes wrong = dlfRecord(30, 2);
+        wrong[0] = lie;
+        wrong[1] = lie == 255 ? 255 : 0;
+        Bytes dlf = dlfRecord(40, 1);
+        dlf += wrong;
+        dlf += dlfRecord(20, 3);
+        dlf += dlfRecord(25, 4);
+        std::size_t skipped = 0;
+        EXPECT_THAT(recordsOf(dlf, skipped),
+            testing::ElementsAre(Found{kNoType, dlfRecord(40, 1)}, Found{kNoType, dlfRecord(20, 3)},
+                Found{kNoType, dlfRecord(25, 4)}))
+            << int{lie};
+        EXPECT_EQ(skipped, 30U);
+    }
+}
+
+TEST(DlfRecords, AnythingComesToAnEnd)
+{
+    constexpr std::size_t kLength = std::size_t{3} << 20;
+    std::size_t skipped = 0;
+    EXPECT_TRUE(recordsOf(Bytes(kLength, 0), skipped).empty());
+    EXPECT_EQ(skipped, kLength);
+    for (const std::uint8_t byte : Bytes{0x01, 0x0C, 0x81, 0xFF})
+        EXPECT_FALSE(recordsOf(Bytes(kLength, byte), skipped).empty()) << int{byte};
+
+    std::mt19937 random(7);
+    for (const std::size_t length : {kLength, std::size_t{5000}, std::size_t{100}, std::size_t{1}}) {
+        for (const bool isSnapshot : {false, true}) {
+            Bytes bytes = isSnapshot ? versionReport() : Bytes();
+            std::generate_n(
+                std::back_inserter(bytes), length, [&] { return static_cast<std::uint8_t>(random()); });
+            recordsOf(bytes, skipped);
+            EXPECT_LE(skipped, length);
+        }
+    }
+}
+
+} // namespace
+} // namespace orvex

@@ -1,0 +1,69 @@
+#include "PcapWriter.h"
+
+#include "CaptureReader.h"
+
+#include <gmock/gmock.h>
+
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+
+namespace orvex {
+namespace {
+
+using namespace std::chrono_literals;
+
+class PcapWriterTest : public testing::Test {
+protected:
+    void TearDown() override { std::filesystem::remove(path); }
+
+    std::string path = testing::TempDir() + "orvex-pcap-writer-test.pcap";
+};
+
+TEST_F(PcapWriterTest, WritesTheFormatByteForByte)
+{
+    {
+        PcapWriter writer(path);
+        writer.write(Bytes{0x01, 0xFF, 0x81}, 1'700'000'000s + 654'321us);
+        writer.write({}, 0s);
+        EXPECT_EQ(writer.error(), "");
+    }
+    const Bytes expected = {0xD4, 0xC3, 0xB2, 0xA1, 2, 0, 4, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 4, 0, 147, 0, 0,
+        0, // file header
+        0x00, 0xF1, 0x53, 0x65, 0xF1, 0xFB, 0x09, 0x00, 3, 0, 0, 0, 3, 0, 0, 0, 0x01, 0xFF, 0x81, //
+        0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0};
+    std::ifstream file(path, std::ios::binary);
+    EXPECT_EQ(Bytes(std::istreambuf_iterator<char>(file), {}), expected);
+}
+
+TEST_F(PcapWriterTest, MessageLongerThanReadersTakeSpoilsNothing)
+{
+    constexpr std::size_t kLongest = 262'144;
+    {
+        PcapWriter writer(path);
+        for (const std::size_t length : {kLongest, kLongest + 1, std::size_t{5}})
+            writer.write(Bytes(length, 7), 1s);
+    }
+    const auto reader = CaptureReader::open(path);
+    for (const std::size_t length : {kLongest, std::size_t{5}}) {
+        ASSERT_EQ(reader->next(), CaptureReader::Status::message) << reader->error();
+        EXPECT_EQ(reader->message().size(), length);
+    }
+    EXPECT_EQ(reader->next(), CaptureReader::Status::end) << reader->error();
+    EXPECT_THAT(reader->omissions(), testing::HasSubstr("1 packets"));
+}
+
+TEST_F(PcapWriterTest, SaysWhatCannotBeWritten)
+{
+    EXPECT_EQ(PcapWriter("/no/such/folder/file").error(), "/no/such/folder/file: No such file or directory");
+    PcapWriter full("/dev/full");
+    full.write(Bytes(10'000), 1s); // more than is kept back in memory
+    EXPECT_EQ(full.error(), "/dev/full: No space left on device");
+    PcapWriter flushed("/dev/full");
+    EXPECT_EQ(flushed.error(), "");
+    flushed.flush();
+    EXPECT_EQ(flushed.error(), "/dev/full: No space left on device");
+}
+
+} // namespace
+} // namespace orvex
