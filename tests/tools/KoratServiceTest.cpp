@@ -54,7 +54,7 @@ TEST(GarbageSource, NothingOfItIsFatalToAGenerator)
             continue; // what is no property list is fatal to whoever expects one
         int changed = 0;
         for (int i = 0; i < 20'000; ++i) {
-            const LogMessage message = scenario->next()->message;
+            const LogMessage message = scenario->next().message;
             const Bytes spoilt = garbage.pass(message.bytes);
             changed += spoilt == message.bytes ? 0 : 1;
             ASSERT_NO_THROW(decoding.feed(spoilt)) << entry.technology << " message " << i;

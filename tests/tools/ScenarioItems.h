@@ -12,8 +12,8 @@ inline std::vector<Scenario::Item> itemsOf(
 {
     std::vector<Scenario::Item> items;
     const auto scenario = entry.make({seed, kStart});
-    for (auto item = scenario->next(); item->due <= duration; item = scenario->next())
-        items.push_back(std::move(*item));
+    for (auto item = scenario->next(); item.due <= duration; item = scenario->next())
+        items.push_back(std::move(item));
     return items;
 }
 

@@ -43,8 +43,14 @@ class StreamerTest : public testing::Test {
 protected:
     void stream(const DictionaryRef& command, const Streamer::Pace& pace)
     {
-        streamer = std::make_unique<Streamer>(runLoop, client, findScenario("MRL_LTE", "")->make({}),
-            Subscription(*command), GarbageSource(0, 1), pace);
+        stream(command, pace, findScenario("MRL_LTE", "")->make({}));
+    }
+    void stream(
+        const DictionaryRef& command, const Streamer::Pace& pace, std::unique_ptr<MessageSource> source)
+    {
+        streamer = std::make_unique<Streamer>(runLoop, client, std::move(source), Subscription(*command),
+            GarbageSource(0, 1), pace,
+            [this](const MessageSource::Item& item) { told.push_back(item.message.bytes); });
     }
     // Lets the run loop tick while real time goes on.
     bool tickUntil(const std::function<bool()>& condition, int times = 2000)
@@ -62,7 +68,37 @@ protected:
 
     test::ManualRunLoop runLoop;
     std::shared_ptr<SlowClient> client = std::make_shared<SlowClient>();
+    std::vector<Bytes> told; // by the streamer, of what it sent
     std::unique_ptr<Streamer> streamer;
+};
+
+// A few messages of code 1, again and again, or not.
+class Rounds final : public MessageSource {
+public:
+    Rounds(std::size_t length, bool isLooped)
+        : _length(length)
+        , _isLooped(isLooped)
+    {
+    }
+
+    std::optional<Item> nextIfAny() override
+    {
+        if (_place == _length)
+            return std::nullopt;
+        ++_place;
+        return Item{{}, {1, Bytes(20, static_cast<std::uint8_t>(_place))}};
+    }
+    bool restart() override
+    {
+        _place = 0;
+        return _isLooped;
+    }
+    std::vector<LogCode> codes() const override { return {}; }
+
+private:
+    std::size_t _length;
+    bool _isLooped;
+    std::size_t _place = 0;
 };
 
 TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
@@ -80,9 +116,10 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
     client->pending = 0;
     ASSERT_TRUE(tickUntil([&] { return client->received.size() > sent + 100; }));
     EXPECT_EQ(streamer->sent(), client->received.size());
+    EXPECT_EQ(told, client->received);
     const auto scenario = findScenario("MRL_LTE", "")->make({});
     for (const Bytes& message : client->received)
-        ASSERT_EQ(message, scenario->next()->message.bytes);
+        ASSERT_EQ(message, scenario->next().message.bytes);
 }
 
 TEST_F(StreamerTest, NaturalPaceIsThatOfTheScenario)
@@ -92,7 +129,7 @@ TEST_F(StreamerTest, NaturalPaceIsThatOfTheScenario)
     ASSERT_TRUE(tickUntil([&] { return std::chrono::steady_clock::now() - start > 1500ms; }));
     const auto scenario = findScenario("MRL_LTE", "")->make({});
     std::size_t due = 0;
-    while (scenario->next()->due <= 1500ms)
+    while (scenario->next().due <= 1500ms)
         ++due;
     EXPECT_NEAR(static_cast<double>(client->received.size()), static_cast<double>(due), 6);
 }
@@ -109,6 +146,37 @@ TEST_F(StreamerTest, OnlyMessagesThatTheClientWantsCount)
     EXPECT_EQ(runLoop.timerCount(), 0U); // it rests
     stream(Dictionary::make({{"SetMarlinLogCodes", Array::make({0x1234})}}), {2000, std::nullopt});
     EXPECT_EQ(runLoop.timerCount(), 0U); // as nothing wanted can come
+}
+
+TEST_F(StreamerTest, RestsAfterTheEndAndLoopsOnlyWhatIsWanted)
+{
+    const auto wanted = Dictionary::make({{"SetMarlinLogCodes", Array::make({1})}});
+    const auto unwanted = Dictionary::make({{"SetMarlinLogCodes", Array::make({2})}});
+    const struct {
+        const char* name;
+        DictionaryRef command;
+        std::size_t length;
+        bool isLooped;
+        std::size_t atLeast;
+        bool rests;
+    } cases[] = {
+        {"one round", wanted, 3, false, 3, true},
+        {"endless", wanted, 3, true, 30, false},
+        {"endless, nothing in it", wanted, 0, true, 0, true},
+        {"endless, nothing wanted in it", unwanted, 3, true, 0, true},
+    };
+    for (const auto& [name, command, length, isLooped, atLeast, rests] : cases) {
+        client->received.clear();
+        stream(command, {2000, std::nullopt}, std::make_unique<Rounds>(length, isLooped));
+        tick(30);
+        EXPECT_EQ(runLoop.timerCount(), rests ? 0U : 1U) << name;
+        ASSERT_GE(client->received.size(), atLeast) << name;
+        for (std::size_t i = 0; i < client->received.size(); ++i)
+            EXPECT_EQ(client->received[i].at(0), i % length + 1) << name;
+        if (rests) {
+            EXPECT_EQ(client->received.size(), atLeast) << name;
+        }
+    }
 }
 
 } // namespace

@@ -17,7 +17,7 @@ public:
     virtual ~MessageSource() = default;
 
     // The next message; their times never go back. None at the end.
-    virtual std::optional<Item> next() = 0;
+    virtual std::optional<Item> nextIfAny() = 0;
     // After the end: begins again with the first message, while the times go on. False when it was the end
     // for good.
     virtual bool restart() { return false; }

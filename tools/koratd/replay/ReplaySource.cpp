@@ -37,7 +37,7 @@ ReplaySource::ReplaySource(const std::string& path, bool isLooped)
 {
 }
 
-std::optional<MessageSource::Item> ReplaySource::next()
+std::optional<MessageSource::Item> ReplaySource::nextIfAny()
 {
     const CaptureReader::Status status = _reader->next();
     if (status != CaptureReader::Status::message) {

@@ -24,7 +24,7 @@ public:
 
     ReplaySource(const std::string& path, bool isLooped);
 
-    std::optional<Item> next() override;
+    std::optional<Item> nextIfAny() override;
     bool restart() override;
     // Nobody knows before the end.
     std::vector<LogCode> codes() const override { return {}; }

@@ -10,6 +10,10 @@ struct ScenarioSettings {
 };
 
 // What happens to a handset, as the messages that its baseband would log. It never ends.
-class Scenario : public MessageSource { };
+class Scenario : public MessageSource {
+public:
+    virtual Item next() = 0;
+    std::optional<Item> nextIfAny() final { return next(); }
+};
 
 } // namespace orvex::korat

@@ -4,7 +4,7 @@
 
 namespace orvex::korat {
 
-std::optional<MessageSource::Item> SteppedScenario::next()
+Scenario::Item SteppedScenario::next()
 {
     while (_due.empty()) {
         step();

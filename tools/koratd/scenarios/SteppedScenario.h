@@ -14,7 +14,7 @@ public:
     {
     }
 
-    std::optional<Item> next() final;
+    Item next() final;
 
 protected:
     static constexpr std::int64_t kStepsPerSecond = 10;

@@ -69,7 +69,7 @@ bool Streamer::isDue() const
 void Streamer::findNext(SteadyClock::time_point deadline)
 {
     while (SteadyClock::now() < deadline) {
-        auto item = _source->next();
+        auto item = _source->nextIfAny();
         if (!item) {
             if (goOnAfterTheEnd())
                 continue;
