@@ -24,7 +24,7 @@ DlfReader::DlfReader(const std::string& path)
     }
     _file.assign(std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>());
     DlfRecords records(_file);
-    if (records.beginsWithRecord())
+    if (records.beginsWithRecords())
         _records = records;
     else
         breakOff("neither a pcap nor a DLF file");

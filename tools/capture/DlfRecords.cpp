@@ -93,6 +93,24 @@ int DlfRecords::bestScoreAt(std::size_t place, std::size_t before, int depth) co
     return best;
 }
 
+bool DlfRecords::beginsWithRecords() const
+{
+    // Two bytes that could be a length stand at the beginning of many a file, and again where they lead to.
+    // But such lengths hardly lead to the very end, nor from one time to another that is near.
+    std::size_t end = 0;
+    std::size_t neighbours = 0;
+    std::size_t nearOnes = 0;
+    for (std::size_t place = 0; fits(place); place = end) {
+        end = endOf(place);
+        if (fits(end)) {
+            ++neighbours;
+            nearOnes += timesAreNear(place, end) ? 1U : 0U;
+        }
+    }
+    const bool makesSense = end == _bytes.size() || (neighbours > 0 && nearOnes * 2 >= neighbours);
+    return end > 0 && (_isSnapshotDLF || makesSense);
+}
+
 std::optional<DlfRecords::Record> DlfRecords::next()
 {
     for (; _place < _bytes.size(); ++_place, ++_skipped) {

@@ -38,8 +38,8 @@ public:
     std::optional<Record> next();
 
     std::size_t skippedBytes() const { return _skipped; }
-    // Whether the first bytes make a record: otherwise this is something else than a DLF.
-    bool beginsWithRecord() const { return fits(0); }
+    // Whether the first bytes make records that belong together: otherwise this is something else than a DLF.
+    bool beginsWithRecords() const;
 
 private:
     // What may stand before a record: so many bytes of a prefix, and a log type.

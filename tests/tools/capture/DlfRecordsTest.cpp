@@ -136,6 +136,33 @@ TEST(DlfRecords, AreFoundAgainBehindALengthThatLies)
     }
 }
 
+TEST(DlfRecords, AreToldFromOtherFiles)
+{
+    const auto isDlf = [](std::initializer_list<Bytes> parts) {
+        Bytes bytes;
+        for (const Bytes& part : parts)
+            bytes += part;
+        return DlfRecords(bytes).beginsWithRecords();
+    };
+    const Bytes far = [] {
+        Bytes record = dlfRecord(20, 1);
+        record[11] = 0x80;
+        return record;
+    }();
+    EXPECT_TRUE(isDlf({dlfRecord(20, 1)}));
+    EXPECT_TRUE(isDlf({dlfRecord(20, 1), far}));
+    EXPECT_TRUE(isDlf({dlfRecord(20, 1), dlfRecord(20, 2), Bytes(500, 0)}));
+    EXPECT_TRUE(isDlf({far, dlfRecord(20, 1), dlfRecord(20, 2), Bytes(500, 0)}));
+    EXPECT_TRUE(isDlf({dlfRecord(20, 1), far, dlfRecord(20, 1), far, dlfRecord(20, 1), far}));
+    EXPECT_TRUE(isDlf({versionReport()}));
+    EXPECT_TRUE(isDlf({versionReport(), Bytes(500, 0)}));
+    EXPECT_FALSE(isDlf({}));
+    EXPECT_FALSE(isDlf({Bytes(500, 0)}));
+    EXPECT_FALSE(isDlf({dlfRecord(20, 1), Bytes(500, 0)}));
+    EXPECT_FALSE(isDlf({dlfRecord(20, 1), far, Bytes(500, 0)}));
+    EXPECT_FALSE(isDlf({Bytes(kMTLDLFVersionReportLength - 1, 161)}));
+}
+
 TEST(DlfRecords, AnythingComesToAnEnd)
 {
     constexpr std::size_t kLength = std::size_t{3} << 20;
