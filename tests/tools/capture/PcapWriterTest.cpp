@@ -1,10 +1,10 @@
 #include "PcapWriter.h"
 
 #include "CaptureReader.h"
+#include "TemporaryFile.h"
 
 #include <gmock/gmock.h>
 
-#include <filesystem>
 #include <fstream>
 #include <iterator>
 
@@ -15,9 +15,8 @@ using namespace std::chrono_literals;
 
 class PcapWriterTest : public testing::Test {
 protected:
-    void TearDown() override { std::filesystem::remove(path); }
-
-    std::string path = testing::TempDir() + "orvex-pcap-writer-test.pcap";
+    const test::TemporaryFile file;
+    const std::string& path = file.path;
 };
 
 TEST_F(PcapWriterTest, WritesTheFormatByteForByte)
@@ -32,8 +31,8 @@ TEST_F(PcapWriterTest, WritesTheFormatByteForByte)
         0, // file header
         0x00, 0xF1, 0x53, 0x65, 0xF1, 0xFB, 0x09, 0x00, 3, 0, 0, 0, 3, 0, 0, 0, 0x01, 0xFF, 0x81, //
         0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0};
-    std::ifstream file(path, std::ios::binary);
-    EXPECT_EQ(Bytes(std::istreambuf_iterator<char>(file), {}), expected);
+    std::ifstream stream(path, std::ios::binary);
+    EXPECT_EQ(Bytes(std::istreambuf_iterator<char>(stream), {}), expected);
 }
 
 TEST_F(PcapWriterTest, MessageLongerThanReadersTakeSpoilsNothing)

@@ -1,0 +1,26 @@
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <string>
+#include <unistd.h>
+
+namespace orvex::test {
+
+// A file name of the running test's own; what stands under it goes with the object.
+class TemporaryFile {
+public:
+    TemporaryFile()
+        : path(testing::TempDir() + "orvex-" + testing::UnitTest::GetInstance()->current_test_info()->name()
+            + "-" + std::to_string(::getpid()))
+    {
+    }
+    ~TemporaryFile() { std::filesystem::remove(path); }
+    TemporaryFile(const TemporaryFile&) = delete;
+    TemporaryFile& operator=(const TemporaryFile&) = delete;
+
+    const std::string path;
+};
+
+} // namespace orvex::test

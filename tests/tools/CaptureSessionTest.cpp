@@ -1,0 +1,216 @@
+// koratd with captures: recording what it streams, and replaying it to the monitor and to itself.
+
+#include "KoratClient.h"
+#include "KoratProgram.h"
+
+#include "Array.h"
+#include "CaptureReader.h"
+#include "PcapWriter.h"
+
+#include <QFile>
+
+#include <gmock/gmock.h>
+
+#include <algorithm>
+
+namespace orvex::test {
+namespace {
+
+using namespace std::chrono_literals;
+using testing::HasSubstr;
+
+struct Captured {
+    std::chrono::microseconds time; // since the first message
+    Bytes message;
+
+    bool operator==(const Captured&) const = default;
+};
+
+std::vector<Captured> messagesIn(const std::string& path)
+{
+    std::vector<Captured> result;
+    const auto reader = CaptureReader::open(path);
+    std::optional<std::chrono::microseconds> start;
+    while (reader->next() == CaptureReader::Status::message) {
+        start = start.value_or(reader->time());
+        result.push_back(
+            {reader->time() - *start, Bytes(reader->message().begin(), reader->message().end())});
+    }
+    return result;
+}
+
+DictionaryRef everything()
+{
+    return Dictionary::make({{"SetState", "Streaming"}});
+}
+
+class CaptureSession : public testing::Test {
+protected:
+    QString path(const char* name) const { return QString::fromStdString(folder.path(name)); }
+    std::size_t countIn(const char* name) const { return messagesIn(folder.path(name)).size(); }
+
+    // A capture of packets with one code each, a millisecond apart.
+    QString writeCapture(const char* name, const std::vector<std::uint8_t>& codes) const
+    {
+        PcapWriter writer(folder.path(name));
+        std::chrono::microseconds time = 1s;
+        for (const std::uint8_t code : codes)
+            writer.write(Bytes{1, 12, 0, code, 0, 0, 0, 0, 0, 0, 0, 0, 0}, time += 1ms);
+        return path(name);
+    }
+
+    // The tree that the monitor shows last, in a session with koratd that records so many messages.
+    std::string lastTreeOfMonitor(const QStringList& arguments, const char* record, std::size_t count) const
+    {
+        const KoratProgram korat(folder, arguments + QStringList{"--record", path(record)});
+        Program monitor(folder, ORVEX_PATH, {"--console"});
+        EXPECT_TRUE(waitUntil([&] { return countIn(record) == count; }, 30s)) << countIn(record);
+        turnFor(2500ms); // a refresh comes every two seconds
+        EXPECT_EQ(monitor.terminate(), 0);
+        const std::string output = monitor.output();
+        const auto status = output.rfind("Updated ");
+        return status == std::string::npos ? output : output.substr(output.find('\n', status) + 1);
+    }
+
+    const ProgramFolder folder;
+};
+
+TEST_F(CaptureSession, RecordedReplayedAndRecordedAgainItIsTheSame)
+{
+    constexpr std::size_t kCount = 2000;
+    for (const char* technology : {"MRL_LTE", "MRL_GSM", "MRL_UTRAN2", "MRL_CDMA", "IFX"}) {
+        SCOPED_TRACE(technology);
+        const auto record = [&](const char* name, const QStringList& arguments) {
+            KoratProgram korat(folder,
+                arguments
+                    + QStringList{"--technology", technology, "--rate", "20000", "--record", path(name)});
+            KoratClient client(folder.ports());
+            EXPECT_EQ(client.open(), 0);
+            EXPECT_EQ(client.technology(), Value(technology));
+            client.send(everything());
+            EXPECT_TRUE(waitUntil([&] { return client.messages.size() >= kCount; }, 20s));
+            EXPECT_EQ(korat.terminateAndCount(), kCount);
+            return client.messages;
+        };
+        const auto received = record("first", {"--count", QString::number(kCount)});
+        const auto receivedAgain = record("second", {"--replay", path("first")});
+        EXPECT_TRUE(received == receivedAgain);
+
+        const auto first = messagesIn(folder.path("first"));
+        ASSERT_EQ(first.size(), kCount);
+        EXPECT_TRUE(std::ranges::equal(first, received, {}, &Captured::message));
+        EXPECT_TRUE(first == messagesIn(folder.path("second")));
+        // Messages stand at the scenario's times, however fast they went.
+        EXPECT_GT(first.back().time, 20s);
+    }
+}
+
+TEST_F(CaptureSession, MonitorAndDecoderShowTheSameOfIt)
+{
+    constexpr std::size_t kCount = 3000;
+    for (const char* technology : {"MRL_LTE", "MRL_CDMA"}) {
+        SCOPED_TRACE(technology);
+        const QStringList arguments = {"--technology", technology, "--rate", "10000"};
+        const std::string live =
+            lastTreeOfMonitor(arguments + QStringList{"--count", QString::number(kCount)}, "live", kCount);
+        const std::string replayed =
+            lastTreeOfMonitor(arguments + QStringList{"--replay", path("live")}, "replayed", kCount);
+        Program decoder(folder, ORVEX_DECODE, {"--technology", technology, path("live")});
+        EXPECT_EQ(decoder.waitForEnd(), 0) << decoder.errors();
+        EXPECT_GT(live.size(), 500U);
+        EXPECT_EQ(live, decoder.output());
+        EXPECT_EQ(replayed, decoder.output());
+    }
+}
+
+TEST_F(CaptureSession, ReplayStandsSilentAfterTheEndOrLoops)
+{
+    const QString capture = writeCapture("capture", {1, 2, 3});
+    const auto command = Dictionary::make({{"SetState", "Streaming"},
+        {"SetMarlinLogCodes", Array::make({1, 3})}, {"SetKoratExtraCodes", Array::make()}});
+    {
+        KoratProgram korat(folder, {"--replay", capture});
+        KoratClient client(folder.ports());
+        ASSERT_EQ(client.open(), 0);
+        client.send(command);
+        ASSERT_TRUE(waitUntil([&] { return client.messages.size() == 2; }));
+        turnFor(300ms);
+        EXPECT_EQ(client.messages.size(), 2U);
+        EXPECT_TRUE(client.isServed());
+        EXPECT_EQ(client.technology(), Value("MRL_LTE"));
+        client.send(command);
+        EXPECT_TRUE(waitUntil([&] { return client.messages.size() == 4; })) << "each stream begins anew";
+    }
+    KoratProgram korat(folder, {"--replay", capture, "--loop", "--rate", "500"});
+    KoratClient client(folder.ports());
+    ASSERT_EQ(client.open(), 0);
+    client.send(command);
+    ASSERT_TRUE(waitUntil([&] { return client.messages.size() >= 100; }));
+    for (std::size_t i = 0; i < client.messages.size(); ++i)
+        EXPECT_EQ(client.messages[i].at(3), i % 2 == 0 ? 1 : 3);
+}
+
+TEST_F(CaptureSession, FilesThatAreOfNoUseEndItAtTheStart)
+{
+    const QString cut = writeCapture("cut", {1});
+    ASSERT_TRUE(QFile::resize(cut, QFile(cut).size() - 1));
+    const QString zeros = path("zeros");
+    QFile file(zeros);
+    ASSERT_TRUE(file.open(QIODevice::WriteOnly) && file.resize(1000));
+    const std::pair<QStringList, const char*> cases[] = {
+        {{"--replay", "/no/such/capture"}, "koratd: /no/such/capture: No such file or directory\n"},
+        {{"--replay", zeros}, "neither a pcap nor a DLF file\n"},
+        {{"--replay", cut, "--loop"}, "truncated"},
+        {{"--record", "/no/such/folder/file"}, "koratd: /no/such/folder/file: No such file or directory\n"},
+        {{"--record", "/dev/full"}, "koratd: /dev/full: No space left on device\n"},
+    };
+    for (const auto& [arguments, complaint] : cases) {
+        Program korat(folder, KORATD_PATH, arguments);
+        EXPECT_EQ(korat.waitForEnd(), 1);
+        EXPECT_THAT(korat.errors(), HasSubstr(complaint));
+        const std::string errors = korat.errors();
+        EXPECT_EQ(std::ranges::count(errors, '\n'), 1) << errors;
+    }
+    const QString capture = writeCapture("capture", {1, 2});
+    Program overwriting(
+        folder, KORATD_PATH, {"--replay", capture, "--record", folder.path("./capture").c_str()});
+    EXPECT_EQ(overwriting.waitForEnd(), 2);
+    EXPECT_THAT(overwriting.errors(), HasSubstr("--record would overwrite the capture that is replayed"));
+    EXPECT_EQ(countIn("capture"), 2U);
+}
+
+TEST_F(CaptureSession, RunningServiceKeepsItsRecordingWhenASecondOneStarts)
+{
+    KoratProgram korat(folder, {"--record", path("capture"), "--rate", "2000", "--count", "50"});
+    KoratClient client(folder.ports());
+    ASSERT_EQ(client.open(), 0);
+    client.send(everything());
+    ASSERT_TRUE(waitUntil([&] { return client.messages.size() == 50; }));
+    Program second(folder, KORATD_PATH, {"--record", path("capture")});
+    EXPECT_EQ(second.waitForEnd(), 1);
+    EXPECT_EQ(korat.terminateAndCount(), 50);
+    EXPECT_EQ(countIn("capture"), 50U);
+}
+
+TEST_F(CaptureSession, FullDiskEndsTheRecordingOnly)
+{
+    // A limit of the file's size stands for the disk.
+    Program korat(folder, "/bin/sh",
+        {"-c", "trap '' XFSZ; ulimit -f 16; exec \"$0\" \"$@\"", KORATD_PATH, "--rate", "2000", "--record",
+            path("capture")});
+    KoratClient client(folder.ports());
+    ASSERT_TRUE(waitUntil([&] { return client.open() == 0; }));
+    client.send(everything());
+    ASSERT_TRUE(korat.waitForError("File too large; recording ends here"));
+    const std::size_t before = client.messages.size();
+    EXPECT_TRUE(waitUntil([&] { return client.messages.size() > before + 1000; }));
+    EXPECT_EQ(korat.terminate(), 0);
+    EXPECT_EQ(QString::fromStdString(korat.errors()).count("recording ends"), 1) << korat.errors();
+    const auto captured = messagesIn(folder.path("capture"));
+    ASSERT_GT(captured.size(), 10U);
+    for (std::size_t i = 0; i < captured.size(); ++i)
+        EXPECT_EQ(captured[i].message, client.messages.at(i));
+}
+
+} // namespace
+} // namespace orvex::test

@@ -1,0 +1,159 @@
+#include "replay/ReplaySource.h"
+
+#include "PcapWriter.h"
+#include "TemporaryFile.h"
+
+#include <gmock/gmock.h>
+
+#include <filesystem>
+#include <fstream>
+
+namespace orvex::korat {
+namespace {
+
+using namespace std::chrono_literals;
+using testing::ElementsAre;
+using testing::HasSubstr;
+
+constexpr Microseconds kLongAgo = 1'600'000'000s;
+const Bytes kPacket = {1, 12, 0, 0xC1, 0xB0, 0, 0, 0, 0, 0, 0, 0, 0};
+
+class ReplaySourceTest : public testing::Test {
+protected:
+    void writePcap(const std::vector<Bytes>& messages, const std::vector<Microseconds>& times) const
+    {
+        PcapWriter writer(path);
+        for (std::size_t i = 0; i < messages.size(); ++i)
+            writer.write(messages[i], kLongAgo + times[i]);
+    }
+    void writeBytes(const Bytes& bytes) const
+    {
+        std::ofstream(path, std::ios::binary)
+            .write(reinterpret_cast<const char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()));
+    }
+
+    // When the messages of one round are due.
+    static std::vector<Microseconds> duesOf(ReplaySource& source)
+    {
+        std::vector<Microseconds> result;
+        while (const auto item = source.nextIfAny())
+            result.push_back(item->due);
+        return result;
+    }
+
+    const test::TemporaryFile file;
+    const std::string& path = file.path;
+};
+
+TEST_F(ReplaySourceTest, PaceIsThatOfTheCaptureWhereItHasOne)
+{
+    using Times = std::vector<Microseconds>;
+    const struct {
+        const char* name;
+        Times captured;
+        Times due;
+    } cases[] = {
+        {"as captured", {5s, 5s + 3us, 6s}, {0s, 3us, 1s}},
+        {"a minute is a pause", {0s, 60s, 61s}, {0s, 60s, 61s}},
+        {"more is another session", {0s, 60s + 1us, 61s}, {0s, 0s, 1s - 1us}},
+        {"time goes back", {10s, 4s, 7s}, {0s, 0s, 3s}},
+    };
+    for (const auto& [name, captured, due] : cases) {
+        writePcap(std::vector<Bytes>(captured.size(), kPacket), captured);
+        ReplaySource source(path, false);
+        EXPECT_EQ(duesOf(source), due) << name;
+        EXPECT_FALSE(source.restart()) << name;
+    }
+}
+
+TEST_F(ReplaySourceTest, RoundsOfALoopFollowAfterASecond)
+{
+    writePcap({kPacket, kPacket}, {0s, 2s});
+    ReplaySource source(path, true);
+    EXPECT_THAT(duesOf(source), ElementsAre(0s, 2s));
+    ASSERT_TRUE(source.restart());
+    EXPECT_THAT(duesOf(source), ElementsAre(3s, 5s));
+    ASSERT_TRUE(source.restart());
+    EXPECT_THAT(duesOf(source), ElementsAre(6s, 8s));
+}
+
+TEST_F(ReplaySourceTest, MessagesAreWantedByTheCodesInTheirHeaders)
+{
+    const struct {
+        const char* name;
+        Bytes message;
+        std::optional<LogCode> code;
+    } cases[] = {
+        {"baseband packet", kPacket, 0xB0C1},
+        {"extra packet", {255, 12, 0, 2, 1, 6, 7, 8, 9, 10, 11, 12, 13}, 0xFF0102},
+        {"behind a prefix", {0x81, 255, 1, 9, 9, 0x79, 0xB1, 8, 9, 10, 11, 12, 13}, 0xB179},
+        {"extra packet behind a prefix", {0x81, 1, 255, 9, 9, 2, 0, 8, 9, 10, 11, 12, 13}, 0xFF0002},
+        {"shorter than a header", Bytes(kPacket.begin(), kPacket.end() - 1), std::nullopt},
+        {"another log type", {2, 12, 0, 0xC1, 0xB0, 0, 0, 0, 0, 0, 0, 0, 0}, std::nullopt},
+        {"property list", {'<', 'p', 'l', 'i', 's', 't', '>', '<', 'd', 'i', 'c', 't', '/', '>'},
+            std::nullopt},
+        {"nothing", {}, std::nullopt},
+    };
+    for (const auto& [name, message, code] : cases) {
+        writePcap({message}, {0s});
+        const auto item = ReplaySource(path, false).nextIfAny();
+        ASSERT_TRUE(item) << name;
+        EXPECT_EQ(item->message.code, code) << name;
+        EXPECT_EQ(item->message.bytes, message) << name;
+    }
+}
+
+TEST_F(ReplaySourceTest, RecordsOfADlfBecomeMessages)
+{
+    // As koratd writes times, 300 us apart; the last byte of the file makes no record.
+    writeBytes({13, 0, 0xC1, 0xB0, 0x00, 0x40, 0x1E, 0x18, 0x24, 0x0A, 6, 0, 0xAA, //
+        12, 0, 0x79, 0xB1, 0x2C, 0x41, 0x1E, 0x18, 0x24, 0x0A, 6, 0, 0x77});
+    ReplaySource source(path, false);
+    const auto first = source.nextIfAny();
+    const auto second = source.nextIfAny();
+    ASSERT_TRUE(first && second);
+    EXPECT_EQ(first->message.code, 0xB0C1U);
+    EXPECT_THAT(first->message.bytes,
+        ElementsAre(1, 13, 0, 0xC1, 0xB0, 0x00, 0x40, 0x1E, 0x18, 0x24, 0x0A, 6, 0, 0xAA));
+    EXPECT_EQ(second->message.code, 0xB179U);
+    EXPECT_EQ(second->due, 300us);
+    testing::internal::CaptureStderr();
+    EXPECT_FALSE(source.nextIfAny());
+    EXPECT_EQ(testing::internal::GetCapturedStderr(),
+        "koratd: " + path + ": 1 bytes that make no record were skipped\n");
+}
+
+TEST_F(ReplaySourceTest, CaptureThatBreaksIsPlayedUpToThereAndSaysSoOnce)
+{
+    writePcap({kPacket, kPacket}, {0s, 1s});
+    std::filesystem::resize_file(path, std::filesystem::file_size(path) - 1);
+    EXPECT_EQ(ReplaySource::faultOf(path), "");
+    ReplaySource source(path, true);
+    testing::internal::CaptureStderr();
+    EXPECT_THAT(duesOf(source), ElementsAre(0s));
+    EXPECT_THAT(testing::internal::GetCapturedStderr(), HasSubstr("truncated"));
+    ASSERT_TRUE(source.restart());
+    testing::internal::CaptureStderr();
+    EXPECT_THAT(duesOf(source), ElementsAre(1s));
+    std::filesystem::remove(path);
+    ASSERT_TRUE(source.restart());
+    EXPECT_FALSE(source.nextIfAny());
+    EXPECT_EQ(testing::internal::GetCapturedStderr(), "");
+}
+
+TEST_F(ReplaySourceTest, SaysWhyAFileCannotBeReplayed)
+{
+    EXPECT_EQ(ReplaySource::faultOf("/no/such/capture"), "/no/such/capture: No such file or directory");
+    writeBytes({});
+    EXPECT_EQ(ReplaySource::faultOf(path), path + ": neither a pcap nor a DLF file");
+    writeBytes(Bytes(1000, 0));
+    EXPECT_EQ(ReplaySource::faultOf(path), path + ": neither a pcap nor a DLF file");
+    writePcap({kPacket}, {0s});
+    std::filesystem::resize_file(path, 24 + 16 + 5);
+    EXPECT_THAT(ReplaySource::faultOf(path), HasSubstr(path + ": truncated"));
+    writePcap({}, {});
+    EXPECT_EQ(ReplaySource::faultOf(path), "") << "a capture of nothing is one";
+}
+
+} // namespace
+} // namespace orvex::korat
