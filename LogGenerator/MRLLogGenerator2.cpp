@@ -1,6 +1,6 @@
 #include "MRLLogGenerator2.h"
 
-#include "LogMessage.h"
+#include "MessageFrame.h"
 
 #include "Array.h"
 #include "SystemLog.h"
@@ -47,20 +47,20 @@ void MRLLogGenerator2::updateState(Dictionary& state, ByteView data)
 
 void MRLLogGenerator2::updateWithData(ByteView data)
 {
-    const LogMessage message(data);
-    if (!message.isComplete())
+    const MessageFrame frame(data);
+    if (!frame.isComplete())
         return;
-    const unsigned logType = message.logType();
-    if (logType != LogMessage::kTypeBaseband && logType != LogMessage::kTypeExtra) {
+    const unsigned logType = frame.logType();
+    if (logType != MessageFrame::kTypeBaseband && logType != MessageFrame::kTypeExtra) {
         systemLog(Priority::error, "Invalid log type: %x. Dropping.", logType);
         return;
     }
-    const LogCode code = message.logCode();
+    const LogCode code = frame.logCode();
     const auto* subscribers = _cIndex ? _cIndex->getSubscribers(code) : nullptr;
     if (!subscribers)
         return;
     for (Base* section : *subscribers)
-        section->updateWithData(message.packet(), code);
+        section->updateWithData(frame.packet(), code);
 }
 
 Value MRLLogGenerator2::generateLogUsingState(Dictionary& state)

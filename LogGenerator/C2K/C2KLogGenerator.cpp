@@ -8,7 +8,7 @@
 #include "C2K/OneXSystemIdentity.h"
 #include "C2K/OneXTrafficFrames.h"
 #include "C2K/ReverseLinkRate.h"
-#include "LogMessage.h"
+#include "MessageFrame.h"
 #include "StateTemplate.h"
 
 #include "Array.h"
@@ -112,11 +112,11 @@ DictionaryRef C2KLogGenerator::getDisplayFromState(Dictionary& state, const Reso
 void C2KLogGenerator::updateFromLog(
     ByteView message, const DictionaryRef& usingLookup, Dictionary& usingState)
 {
-    const LogMessage frame(message);
+    const MessageFrame frame(message);
     if (!frame.isComplete())
         return;
     // Says that it drops the packet, and never has: what follows decodes whatever the type is.
-    if (frame.logType() != LogMessage::kTypeBaseband)
+    if (frame.logType() != MessageFrame::kTypeBaseband)
         systemLog(Priority::error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(frame.logType()));
     const auto* decoder = std::ranges::find(kDecoders, frame.logCode(), &Decoder::code);
     if (decoder == std::end(kDecoders))

@@ -28,7 +28,7 @@ public:
     // there is no template.
     static DictionaryRef getDisplayFromState(Dictionary& state, const Resources& resources);
 
-    // Decodes one message, framed as LogMessage says, and keeps its packet when its code is one of ours.
+    // Decodes one message, framed as MessageFrame says, and keeps its packet when its code is one of ours.
     void updateFromLog(ByteView message, const DictionaryRef& usingLookup, Dictionary& usingState);
 };
 

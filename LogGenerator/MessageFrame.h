@@ -7,12 +7,12 @@ namespace orvex {
 // The frame of a message on the log channel: at least a packet header long, and, when its first byte is 0x81,
 // with a 2-byte prefix before the packet. The length is that of the message, so a prefixed packet may be two
 // bytes shorter than its header.
-class LogMessage {
+class MessageFrame {
 public:
     static constexpr std::uint8_t kTypeBaseband = 1;
     static constexpr std::uint8_t kTypeExtra = 255;
 
-    explicit LogMessage(ByteView message)
+    explicit MessageFrame(ByteView message)
         : _isComplete(message.size() >= kPacketHeaderLength)
         , _packet(_isComplete && message[0] == kPrefixMark ? message.subspan(kPrefixLength) : message)
     {
