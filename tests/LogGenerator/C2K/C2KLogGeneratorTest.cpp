@@ -119,6 +119,7 @@ TEST_F(C2KLogGeneratorTest, ShowsAValueInEveryRowThatNamesItsKey)
     EXPECT_EQ(log.take(), Lines(4, "<4>Processing the template")) << "once a dictionary";
     ASSERT_NE(display, nullptr) << "at once";
     EXPECT_EQ(section("Identity"), (RowTexts{{"SID", ""}, {"Revision", ""}}));
+    EXPECT_EQ(state["ExtraInfo"], Value(Dictionary::make())) << "for counters";
 
     generator->updateState(state, identity(7));
     EXPECT_EQ(generator->generateLogUsingState(state).dictionary(), display);
@@ -195,6 +196,9 @@ TEST_F(C2KLogGeneratorTest, FramesAndKeepsWhatReachesADecoder)
         Bytes twice = kept;
         twice.insert(twice.end(), kept.begin(), kept.end());
         EXPECT_EQ(*state["DisplayState"].data(), twice) << name;
+        const auto history = state["History"].array();
+        const auto entry = (*history)[history->size() - 1].dictionary();
+        EXPECT_EQ(*(*entry)["DisplayState"].data(), twice) << name;
         generator->generateLogUsingState(state);
         EXPECT_TRUE(state["DisplayState"].data()->empty()) << name;
     }
@@ -211,6 +215,8 @@ TEST_F(C2KLogGeneratorTest, MissingTemplateIsTriedAgainAtEveryCall)
     EXPECT_TRUE(generator->generateLogUsingState(state).isNull());
     EXPECT_EQ(log.take(), Lines(2, "<3>Cannot load C2K template for display"));
     EXPECT_EQ(*state["DisplayState"].data(), identity(7));
+    Dictionary laidOut{{"Template", skeleton}};
+    EXPECT_NE(C2KLogGenerator::getDisplayFromState(laidOut, resources), nullptr) << "that of the state";
     resources.templates["C2KTemplate"] = skeleton;
     generator->updateState(state, identity(8));
     EXPECT_EQ(textOf(section("Identity"), "Revision"), "8");

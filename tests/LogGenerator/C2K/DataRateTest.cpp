@@ -46,12 +46,13 @@ TEST(DataRate, IsThatSinceThePacketBefore)
         {"backwards", 13, 265, "0.04 kbps"},
         {"since the packet that showed none", 14, 273, "1.00 kbps"},
         {"fewer packets", 16, 173, "-6.25 kbps"},
-        {"half the range on, as a step back", 0x80000010, 500, "-6.25 kbps"},
-        {"across the sign", 0x7FFFFFFF, 500, "-6.25 kbps"},
-        {"and over it", 0x80000001, 516, "1.00 kbps"},
-        {"to the last", 0xFFFFFFFF, 516, "0.00 kbps"},
-        {"wrapped", 1, 532, "1.00 kbps"},
-        {"counter at its highest", 2, 0xFFFFFFFF, "536870845.38 kbps"},
+        {"since the lower count", 17, 181, "1.00 kbps"},
+        {"half the range on, as a step back", 0x80000011, 500, "1.00 kbps"},
+        {"across the sign", 0x7FFFFFFF, 500, "1.00 kbps"},
+        {"and over it", 0x80000001, 532, "2.00 kbps"},
+        {"to the last", 0xFFFFFFFF, 532, "0.00 kbps"},
+        {"wrapped", 1, 548, "1.00 kbps"},
+        {"counter at its highest", 2, 0xFFFFFFFF, "536870843.38 kbps"},
     };
     for (const Link& link : kLinks) {
         C2KFixture fixture;

@@ -12,7 +12,7 @@ Bytes statusPacket(Bytes channel, std::uint8_t deviceState, std::uint8_t session
     Bytes pnOffset = {0x10, 0x00}, std::size_t length = 50)
 {
     return packetWith(0x1183, length,
-        {{13, channel}, {15, {0x80, 0x05, 0x00}}, {18, pnOffset}, {36, {deviceState, sessionState}},
+        {{13, channel}, {15, {0x80, 0xFB, 0xF4}}, {18, pnOffset}, {36, {deviceState, sessionState}},
             {38, {0x0A, 0xBC, 0x03, 200}}});
 }
 
@@ -21,11 +21,14 @@ TEST(EVDOStatus, ReadsEachFieldFromItsOwnBits)
     C2KFixture fixture;
     EXPECT_EQ(fixture.rowsAfter(statusPacket({0x34, 0x4D}, 4)),
         (RowTexts{{"kChannel", "1332"}, {"k1xEVDODeviceState", "Access [4]"},
-            {"kBandClass", "900 MHzband [9]"}, {"kRxAGC0", "-128 dBm"}, {"kRxAGC1", "+5 dBm"},
-            {"kTxAGC", "+0 dBm"}, {"kServingPNOffset", "16 × 64chips"}, {"kSessionState", "Open [4]"},
+            {"kBandClass", "900 MHzband [9]"}, {"kRxAGC0", "-128 dBm"}, {"kRxAGC1", "-5 dBm"},
+            {"kTxAGC", "-12 dBm"}, {"kServingPNOffset", "16 × 64chips"}, {"kSessionState", "Open [4]"},
             {"kUATI24", "0x03bc0a"}, {"kColorCode", "200"}}));
     EXPECT_EQ(fixture.log.take(), Lines{});
 
+    Bytes strong = statusPacket({0, 0}, 4);
+    strong[15] = 127;
+    EXPECT_EQ(fixture.textAfter(strong, "kRxAGC0"), "+127 dBm");
     EXPECT_EQ(fixture.textAfter(statusPacket({0xFF, 0x07}, 4), "kChannel"), "2047");
     EXPECT_EQ(
         fixture.textAfter(statusPacket({0, 0}, 4, 4, {0xFF, 0xFF}), "kServingPNOffset"), "Invalid Value");
@@ -61,8 +64,8 @@ TEST(EVDOStatus, NamesStatesAndBandClasses)
         EXPECT_EQ(textOf(rows, "kSessionState"), sessionState);
         EXPECT_EQ(textOf(rows, "kBandClass"), bandClass);
         EXPECT_EQ(textOf(rows, "kRxAGC0"), "-128 dBm");
-        EXPECT_EQ(textOf(rows, "kRxAGC1"), value >= 4 ? "+5 dBm" : "N/A") << int{value};
-        EXPECT_EQ(textOf(rows, "kTxAGC"), value >= 4 ? "+0 dBm" : "N/A") << int{value};
+        EXPECT_EQ(textOf(rows, "kRxAGC1"), value >= 4 ? "-5 dBm" : "N/A") << int{value};
+        EXPECT_EQ(textOf(rows, "kTxAGC"), value >= 4 ? "-12 dBm" : "N/A") << int{value};
     }
 }
 

@@ -12,7 +12,7 @@ Bytes systemState(std::uint8_t state)
 
 Bytes radio(std::uint8_t bandClass = 0)
 {
-    return subpacket(2, {bandClass, 2, 0x02, 0x01, 0x04, 0x03, 0xF6, 0x7F, 0x85, 0xFF});
+    return subpacket(2, {bandClass, 2, 0x02, 0x01, 0x04, 0x03, 0xF6, 0x7E, 0x85, 0xFF});
 }
 
 const Bytes kNoPilots = subpacket(3, {1, 0, 1, 9, 0, 0, 0, 0});
@@ -30,7 +30,7 @@ TEST(OneXStatus, ReadsEachFieldFromItsOwnBytes)
         (RowTexts{{"k1xDeviceState", "Traffic [8]"}, {"k1xRx0BandClass", "1.8 to 2.0GHz PCS band [1]"},
             {"k1xRx0ChanNum", "258"}, {"k1xRxAGC0", "-66.59 dBm"},
             {"k1xRx1BandClass", "872 to 960MHz TACS band [2]"}, {"k1xRx1ChanNum", "772"},
-            {"k1xRxAGC1", "-20.83 dBm"}, {"k1xTxAGC", "-12.30 dBm"}, {"k1xActiveSetInfo", "(dictionary)"}}));
+            {"k1xRxAGC1", "-21.16 dBm"}, {"k1xTxAGC", "-12.30 dBm"}, {"k1xActiveSetInfo", "(dictionary)"}}));
     const auto idle = fixture.rowsAfter(statusPacket(6));
     for (const char* row : {"k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1", "k1xTxAGC"})
         EXPECT_EQ(textOf(idle, row), "N/A");
@@ -135,8 +135,8 @@ TEST(OneXStatus, ShowsThePilotsThatFit)
         std::uint8_t fingers;
         std::size_t length; // of the active set, up to the end of the packet
         std::size_t pilots;
-    } cases[] = {
-        {0, 25, 0}, {0, 26, 1}, {0, 37, 1}, {0, 38, 2}, {2, 33, 0}, {2, 34, 1}, {2, 58, 2}, {255, 120, 0}};
+    } cases[] = {{0, 25, 0}, {0, 26, 1}, {0, 37, 1}, {0, 38, 2}, {2, 33, 0}, {2, 34, 1}, {2, 58, 2},
+        {20, 237, 1}, {20, 238, 2}, {255, 120, 0}};
     C2KFixture fixture;
     for (const auto& [fingers, length, pilots] : cases) {
         Bytes set = activeSet(1, 1, 9, 1, 255);
@@ -171,6 +171,7 @@ TEST(OneXStatus, FieldBehindThePacketLeavesItsRow)
     EXPECT_EQ(fixture.rowsAfter(noState).size(), 4U) << "receiver 0 and active set";
     EXPECT_EQ(fixture.state["TrafficFER"], Value(0.5));
     Bytes noHead = packetOf(0x119C, {systemState(8), radio(), kFingerInfo, kNoPilots});
+    EXPECT_EQ(fixture.textAfter(noHead, "k1xActiveSetInfo"), "(dictionary)");
     noHead.pop_back();
     EXPECT_EQ(fixture.textAfter(noHead, "k1xActiveSetInfo"), "(absent)");
     EXPECT_EQ(fixture.log.take(), Lines{});

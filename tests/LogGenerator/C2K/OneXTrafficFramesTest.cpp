@@ -80,6 +80,10 @@ TEST(TrafficFER, AveragesInSinglePrecision)
     for (int frame = 0; frame < 60; ++frame)
         fixture.feed(framePacket(frame < 59 ? 1 : 0));
     EXPECT_EQ(fixture.textAfter(framePacket(0), row), "58.64%") << "58.63% in double precision";
+    fixture.state.remove("TrafficFER");
+    for (const auto error : Bytes{1, 1, 1, 1, 0, 1})
+        fixture.feed(framePacket(error));
+    EXPECT_EQ(fixture.state["TrafficFER"], Value(0.07478243112564087)) << "each step is rounded";
     fixture.state.set("TrafficFER", static_cast<double>(0.00625F));
     EXPECT_EQ(fixture.textAfter(statusPacket(6), row), "0.62% (old)") << "0.63% in double precision";
 }

@@ -77,12 +77,15 @@ TEST_F(GSMLogGeneratorTest, SimplifiesTheNesting)
     };
     for (const auto& [name, message, display] : cases)
         EXPECT_EQ(displayAfter(message), display) << name;
+    EXPECT_EQ(generator.canCollapse(only("x")), Value("x"));
+    EXPECT_TRUE(generator.canCollapse("x").isNull());
 }
 
 TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheDisplay)
 {
     EXPECT_TRUE(generator.generateLogUsingState(state).isNull());
     generator.updateState(state, message(dict({{"A", string("first")}})));
+    state.set("ExtraInfo", Dictionary::make({{"of", "another"}}));
     EXPECT_EQ(displayAfter(dict({{"B", array(string("h") + string("x"))}})),
         Value(Dictionary::make({{"B", Array::make({"x"})}})));
     EXPECT_EQ(state["DisplayState"], Value(Dictionary::make({{"B", Array::make({"h", "x"})}})))
