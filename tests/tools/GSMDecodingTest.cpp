@@ -1,6 +1,5 @@
-// The packets of GSM, UMTS and CDMA2000 through the receiver's own decoders.
+// The packets of GSM and UMTS through the receiver's own decoders.
 
-#include "packets/C2KEVDOFingerPacket.h"
 #include "packets/EquivalentPLMNPacket.h"
 #include "packets/GPRSCellOptionsPacket.h"
 #include "packets/GSMMeasurementPacket.h"
@@ -91,14 +90,6 @@ TEST(PacketLayout, OfUMTS)
     ASSERT_TRUE(primary->size() == 1 && secondary->size() == 2);
     EXPECT_EQ(test::rowsOf((*primary)[0].dictionary()), process("7", "305419896", "258", "1"));
     EXPECT_EQ(test::rowsOf((*secondary)[1].dictionary()), process("4", "8", "7", "6"));
-}
-
-TEST(PacketLayout, OfCDMA2000)
-{
-    expectRows("MRL_CDMA",
-        {{C2KEVDOFingerPacket{{{12, -3.0103}, {{}, 0}, {300, 6.0206}}}.message(kTime),
-            "Carrier to Interference",
-            {{{"_sorted", "_sorted"}, {"0;12", "-3.01 dB"}, {"2;300", "+6.02 dB"}}}}});
 }
 
 } // namespace

@@ -78,7 +78,7 @@ public:
             {"Identity", Dictionary::make({{"SID", "kSystemId"}, {"Revision", "kProtocolRevision"}})},
             {"Copies",
                 Dictionary::make({{"_sorted", "_sorted"}, {"1;SID", "kSystemId"},
-                    {"Deep", Dictionary::make({{"SID", "kSystemId"}})}, {"Number", 1},
+                    {"Deep", Dictionary::make({{"SID", "kSystemId"}, {"Mark", "_sorted"}})}, {"Number", 1},
                     {"List", Array::make({"kSystemId"})}})},
         });
         resources.templates["Other"] = Dictionary::make({{"Section", "text"}});
@@ -126,7 +126,8 @@ TEST_F(C2KLogGeneratorTest, ShowsAValueInEveryRowThatNamesItsKey)
     EXPECT_EQ(section("Identity"), (RowTexts{{"SID", "258"}, {"Revision", "7"}}));
     EXPECT_EQ(
         section("Copies"), (RowTexts{{"_sorted", "_sorted"}, {"1;SID", "258"}, {"Deep", "(dictionary)"}}));
-    EXPECT_EQ(*(*(*display)["Copies"].dictionary())["Deep"].dictionary(), Dictionary({{"SID", "258"}}));
+    EXPECT_EQ(*(*(*display)["Copies"].dictionary())["Deep"].dictionary(),
+        Dictionary({{"SID", "258"}, {"Mark", "_sorted"}}));
     EXPECT_EQ(log.take(), Lines{});
     EXPECT_EQ(*state["Template"].dictionary(), *resources.templates["C2KTemplate"]);
 }

@@ -31,10 +31,12 @@ TEST(OneXStatus, ReadsEachFieldFromItsOwnBytes)
             {"k1xRx0ChanNum", "258"}, {"k1xRxAGC0", "-66.59 dBm"},
             {"k1xRx1BandClass", "872 to 960MHz TACS band [2]"}, {"k1xRx1ChanNum", "772"},
             {"k1xRxAGC1", "-21.16 dBm"}, {"k1xTxAGC", "-12.30 dBm"}, {"k1xActiveSetInfo", "(dictionary)"}}));
-    const auto idle = fixture.rowsAfter(statusPacket(6));
-    for (const char* row : {"k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1", "k1xTxAGC"})
-        EXPECT_EQ(textOf(idle, row), "N/A");
-    EXPECT_EQ(textOf(idle, "k1xRxAGC0"), "-66.59 dBm");
+    for (const auto state : Bytes{7, 9}) {
+        const auto idle = fixture.rowsAfter(statusPacket(state));
+        for (const char* row : {"k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1", "k1xTxAGC"})
+            EXPECT_EQ(textOf(idle, row), "N/A");
+        EXPECT_EQ(textOf(idle, "k1xRxAGC0"), "-66.59 dBm");
+    }
     EXPECT_EQ(fixture.log.take(), Lines{});
 }
 

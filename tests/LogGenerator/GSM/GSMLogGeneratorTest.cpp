@@ -6,7 +6,7 @@
 #include "FixedClock.h"
 #include "FixedResources.h"
 
-#include <gmock/gmock.h>
+#include <gtest/gtest.h>
 
 namespace orvex::test {
 namespace {
@@ -123,7 +123,10 @@ TEST_F(GSMLogGeneratorTest, OtherMessagesAreFatal)
             generator.updateState(state, message(inner));
             ADD_FAILURE() << text;
         } catch (const AssertionFailure& failure) {
-            EXPECT_THAT(failure.what(), testing::StartsWith(text));
+            const std::string place = line == 78 ? "processObject:" : "updateState:withData:";
+            EXPECT_EQ(failure.what(),
+                text + " (" + place + ", LogGenerator/GSM/GSMLogGenerator, line " + std::to_string(line)
+                    + ")");
             EXPECT_STREQ(failure.file(), "LogGenerator/GSM/GSMLogGenerator");
             EXPECT_EQ(failure.line(), line);
         }
