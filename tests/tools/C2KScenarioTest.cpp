@@ -163,7 +163,7 @@ TEST(C2KTownScenario, IsBelievableAndReachesEveryState)
         {"1x strength", {-29, -12}, {-9, -6.9}},
         {"1x pilots", {0, 0}, {2, 6}},
         {"1x PN", {0, 100}, {300, 511}},
-        {"call's frame errors, %", {0, 3}, {1, 12}},
+        {"call's frame errors, %", {0, 3}, {1, 20}},
         {"EV-DO AGC", {-106, -90}, {-60, -20}},
         {"EV-DO strength", {-22, -6}, {-1, 0}},
         {"EV-DO pilots", {0, 0}, {2, 6}},

@@ -82,23 +82,34 @@ C2KTown::C2KTown()
 bool C2KTown::step(double position, Randomness& randomness)
 {
     _field.step(position, randomness);
-    double total = ratioOf(kNoise); // mW
-    for (std::size_t i = 0; i < _sectors.size(); ++i)
-        total += ratioOf(_field.level(i));
-    _receivedPower = decibels(total);
-    for (std::size_t i = 0; i < _sectors.size(); ++i) {
-        const double own = ratioOf(_field.level(i));
-        _pilots[i] = {&_sectors[i], decibels(kPilotShare * own / total), decibels(own / total),
-            decibels(own / (total - own + kDistortion * own))};
-    }
+    for (const C2KSystem& system : kSystems)
+        measure(system);
     return _selector.step(_field);
+}
+
+void C2KTown::measure(const C2KSystem& system)
+{
+    double total = ratioOf(kNoise); // mW
+    for (std::size_t i = 0; i < _sectors.size(); ++i) {
+        if (_sectors[i].system == &system)
+            total += ratioOf(_field.level(i));
+    }
+    for (std::size_t i = 0; i < _sectors.size(); ++i) {
+        if (_sectors[i].system != &system)
+            continue;
+        const double own = ratioOf(_field.level(i));
+        _pilots[i] = {&_sectors[i], decibels(total), decibels(kPilotShare * own / total),
+            decibels(own / total), decibels(own / (total - own + kDistortion * own))};
+    }
 }
 
 std::vector<C2KTown::Pilot> C2KTown::pilots(double weakest) const
 {
     std::vector<Pilot> result;
     for (const Pilot& pilot : _pilots) {
-        if (pilot.sector != serving().sector && pilot.strength1x >= weakest)
+        const bool isOther =
+            pilot.sector != serving().sector && pilot.sector->system == serving().sector->system;
+        if (isOther && pilot.strength1x >= weakest)
             result.push_back(pilot);
     }
     std::ranges::sort(result, std::greater{}, &Pilot::strength1x);
@@ -109,7 +120,7 @@ std::vector<C2KTown::Pilot> C2KTown::pilots(double weakest) const
 
 double C2KTown::transmitPower() const
 {
-    return std::clamp(kOpenLoopSum - _receivedPower, kWeakestTransmitter, kStrongestTransmitter);
+    return std::clamp(kOpenLoopSum - receivedPower(), kWeakestTransmitter, kStrongestTransmitter);
 }
 
 } // namespace orvex::korat

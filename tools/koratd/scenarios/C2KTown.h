@@ -37,6 +37,7 @@ public:
 
     struct Pilot {
         const C2KSector* sector = nullptr;
+        double carrierPower = 0;          // dBm, all sectors on its carrier and the noise
         double strength1x = 0;            // Ec/Io, dB: the pilot is a fifth of what a 1x carrier sends
         double strengthEVDO = 0;          // Ec/Io, dB: alone in its bursts
         double carrierToInterference = 0; // EV-DO, dB
@@ -49,21 +50,23 @@ public:
 
     bool isCovered() const { return _field.average(_selector.serving()) >= kWeakestService; }
     const Pilot& serving() const { return _pilots[_selector.serving()]; }
-    // The serving pilot unless it is lost, and all others whose 1x strength is at least that many dB,
-    // strongest first.
+    // The serving pilot unless it is lost, and all others of its system, which are on the same carrier, whose
+    // 1x strength is at least that many dB, strongest first.
     std::vector<Pilot> pilots(double weakest) const;
 
-    double receivedPower() const { return _receivedPower; } // dBm, all sectors together
-    double transmitPower() const;                           // dBm, as the handset sets it by what it receives
+    double receivedPower() const { return serving().carrierPower; } // dBm
+    double transmitPower() const; // dBm, as the handset sets it by what it receives
 
 private:
+    // Of one system; the others, on carriers of their own, do not disturb it.
+    void measure(const C2KSystem& system);
+
     static constexpr double kWeakestService = -107; // dBm
 
     std::vector<C2KSector> _sectors;
     RadioField _field; // a transmitter for each sector
     CellSelector _selector;
     std::vector<Pilot> _pilots; // for each sector
-    double _receivedPower = 0;
 };
 
 } // namespace orvex::korat
