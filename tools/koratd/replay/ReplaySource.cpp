@@ -2,7 +2,7 @@
 
 #include "service/Report.h"
 
-#include "LogMessage.h"
+#include "MessageFrame.h"
 
 namespace orvex::korat {
 
@@ -16,10 +16,10 @@ constexpr Microseconds kPauseBetweenRounds = 1s;
 // which is nobody's in particular.
 std::optional<LogCode> codeOf(ByteView bytes)
 {
-    const orvex::LogMessage message(bytes);
+    const MessageFrame message(bytes);
     const bool isPacket = message.isComplete()
-        && (message.logType() == orvex::LogMessage::kTypeBaseband
-            || message.logType() == orvex::LogMessage::kTypeExtra);
+        && (message.logType() == MessageFrame::kTypeBaseband
+            || message.logType() == MessageFrame::kTypeExtra);
     return isPacket ? std::optional(static_cast<LogCode>(message.logCode())) : std::nullopt;
 }
 } // namespace
