@@ -58,7 +58,7 @@ private:
             return here;
         for (const auto& entry : dictionary) {
             const auto group = entry.value.dictionary();
-            if (const Value inside = group ? find(*group, name) : Value(); !inside.isNull())
+            if (Value inside = group ? find(*group, name) : Value(); !inside.isNull())
                 return inside;
         }
         return {};

@@ -5,6 +5,7 @@
 #include "Array.h"
 #include "FixedClock.h"
 #include "FixedResources.h"
+#include "TextFormat.h"
 
 #include <gtest/gtest.h>
 
@@ -123,10 +124,10 @@ TEST_F(GSMLogGeneratorTest, OtherMessagesAreFatal)
             generator.updateState(state, message(inner));
             ADD_FAILURE() << text;
         } catch (const AssertionFailure& failure) {
-            const std::string place = line == 78 ? "processObject:" : "updateState:withData:";
+            const char* method = line == 78 ? "processObject:" : "updateState:withData:";
             EXPECT_EQ(failure.what(),
-                text + " (" + place + ", LogGenerator/GSM/GSMLogGenerator, line " + std::to_string(line)
-                    + ")");
+                orvex::text(
+                    "%s (%s, LogGenerator/GSM/GSMLogGenerator, line %d)", text.c_str(), method, line));
             EXPECT_STREQ(failure.file(), "LogGenerator/GSM/GSMLogGenerator");
             EXPECT_EQ(failure.line(), line);
         }
