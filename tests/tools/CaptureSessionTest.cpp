@@ -72,7 +72,7 @@ protected:
         return status == std::string::npos ? output : output.substr(output.find('\n', status) + 1);
     }
 
-    const ProgramFolder folder;
+    const ProgramFolder folder{};
 };
 
 TEST_F(CaptureSession, RecordedReplayedAndRecordedAgainItIsTheSame)
@@ -196,7 +196,7 @@ TEST_F(CaptureSession, FullDiskEndsTheRecordingOnly)
 {
     // A limit of the file's size stands for the disk.
     Program korat(folder, "/bin/sh",
-        {"-c", "trap '' XFSZ; ulimit -f 16; exec \"$0\" \"$@\"", KORATD_PATH, "--rate", "2000", "--record",
+        {"-c", R"(trap '' XFSZ; ulimit -f 16; exec "$0" "$@")", KORATD_PATH, "--rate", "2000", "--record",
             path("capture")});
     KoratClient client(folder.ports());
     ASSERT_TRUE(waitUntil([&] { return client.open() == 0; }));

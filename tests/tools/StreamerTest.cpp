@@ -156,16 +156,16 @@ TEST_F(StreamerTest, RestsAfterTheEndAndLoopsOnlyWhatIsWanted)
         const char* name;
         DictionaryRef command;
         std::size_t length;
-        bool isLooped;
         std::size_t atLeast;
+        bool isLooped;
         bool rests;
     } cases[] = {
-        {"one round", wanted, 3, false, 3, true},
-        {"endless", wanted, 3, true, 30, false},
-        {"endless, nothing in it", wanted, 0, true, 0, true},
-        {"endless, nothing wanted in it", unwanted, 3, true, 0, true},
+        {"one round", wanted, 3, 3, false, true},
+        {"endless", wanted, 3, 30, true, false},
+        {"endless, nothing in it", wanted, 0, 0, true, true},
+        {"endless, nothing wanted in it", unwanted, 3, 0, true, true},
     };
-    for (const auto& [name, command, length, isLooped, atLeast, rests] : cases) {
+    for (const auto& [name, command, length, atLeast, isLooped, rests] : cases) {
         client->received.clear();
         stream(command, {2000, std::nullopt}, std::make_unique<Rounds>(length, isLooped));
         tick(30);

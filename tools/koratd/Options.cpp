@@ -117,7 +117,7 @@ std::string read(const QCommandLineParser& parser, Options& options)
         return "no scenario for the technology \"" + technology + "\"; known are: " + knownTechnologies();
     if (!options.scenario)
         return technology + " has no scenario \"" + scenario + "\"; known are: " + knownScenarios(technology);
-    if (const std::string error = readCaptures(parser, options); !error.empty())
+    if (std::string error = readCaptures(parser, options); !error.empty())
         return error;
     if (parser.isSet("rate")) {
         options.rate = realIn(parser.value("rate"), 0, kLargestRate);

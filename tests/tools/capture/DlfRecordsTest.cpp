@@ -28,7 +28,8 @@ struct Found {
 // Walks all records. Each byte belongs to a record, to what stands before one, or was skipped.
 std::vector<Found> recordsOf(const Bytes& dlf, std::size_t& skipped)
 {
-    const Bytes exact(dlf); // without spare capacity, in which reads beyond the end would go unseen
+    const Bytes exact(
+        dlf.begin(), dlf.end()); // without spare capacity, in which reads beyond the end would go unseen
     DlfRecords records(exact);
     std::vector<Found> result;
     std::size_t place = 0;
