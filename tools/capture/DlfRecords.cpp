@@ -128,9 +128,7 @@ std::optional<DlfRecords::Record> DlfRecords::next()
         if (!best)
             continue;
         const auto logType = best->hasLogType ? std::optional(_bytes.u8(best->start - 1)) : std::nullopt;
-        const bool isVersionReport = _isSnapshotDLF && best->start == 0; // whose time is 0
-        if (!isVersionReport)
-            _last = best->start;
+        _last = best->start;
         _place = endOf(best->start);
         return Record{best->start, logType, _bytes.bytes().subspan(best->start, _place - best->start),
             timeOf(best->start)};

@@ -67,7 +67,7 @@ private:
     PacketReader _bytes;
     bool _isSnapshotDLF; // begins with the version report that this system writes
     std::size_t _place = 0;
-    std::optional<std::size_t> _last; // start of the record before, when that has a time
+    std::optional<std::size_t> _last; // start of the record before
     bool _isLost = false;             // the bytes before made no record
     std::size_t _skipped = 0;
 };

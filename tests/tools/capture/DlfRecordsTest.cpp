@@ -77,6 +77,8 @@ TEST(DlfRecords, AreFoundInEachForm)
                 typed({255}, dlfRecord(513, 4))},
             {{kNoType, dlfRecord(257, 1)}, {1, dlfRecord(511, 2)}, {kNoType, dlfRecord(255, 3)},
                 {255, dlfRecord(513, 4)}}},
+        {"last payload that looks like records", {versionReport(), a, typed({1}, dlfRecord(1281, 2, 1))},
+            {{kNoType, a}, {1, dlfRecord(1281, 2, 1)}}},
         {"payloads that look like records", {versionReport(), dlfRecord(257, 1, 1), dlfRecord(257, 2, 1)},
             {{kNoType, dlfRecord(257, 1, 1)}, {kNoType, dlfRecord(257, 2, 1)}}},
     };
