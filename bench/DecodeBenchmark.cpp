@@ -16,6 +16,7 @@
 
 #include <array>
 #include <cstring>
+#include <map>
 
 namespace orvex {
 namespace {
@@ -33,9 +34,11 @@ std::vector<Bytes> recordedStream(const char* technology)
 
 const std::vector<Bytes>& stream(const char* technology)
 {
-    static const auto kLTE = recordedStream(telephony::kTechnologyMRL_LTE);
-    static const auto kUTRAN = recordedStream(telephony::kTechnologyMRL_UTRAN2);
-    return technology == std::string_view(telephony::kTechnologyMRL_LTE) ? kLTE : kUTRAN;
+    static std::map<std::string_view, std::vector<Bytes>> streams;
+    const auto [stream, isNew] = streams.try_emplace(technology);
+    if (isNew)
+        stream->second = recordedStream(technology);
+    return stream->second;
 }
 
 void countMessages(benchmark::State& state)
@@ -112,8 +115,12 @@ BENCHMARK_CAPTURE(copyFloor, lte, telephony::kTechnologyMRL_LTE)->Unit(benchmark
 BENCHMARK(printFloor)->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(decode, lte, telephony::kTechnologyMRL_LTE)->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(decode, utran, telephony::kTechnologyMRL_UTRAN2)->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(decode, gsm, telephony::kTechnologyMRL_GSM)->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(decode, cdma, telephony::kTechnologyMRL_CDMA)->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(decode, ifx, telephony::kTechnologyIFX)->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(rebuildTree, lte, telephony::kTechnologyMRL_LTE)->Unit(benchmark::kMicrosecond);
 BENCHMARK_CAPTURE(rebuildTree, utran, telephony::kTechnologyMRL_UTRAN2)->Unit(benchmark::kMicrosecond);
+BENCHMARK_CAPTURE(rebuildTree, gsm, telephony::kTechnologyMRL_GSM)->Unit(benchmark::kMicrosecond);
 
 } // namespace
 } // namespace orvex
