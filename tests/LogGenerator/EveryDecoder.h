@@ -1,0 +1,95 @@
+#pragma once
+
+#include "GSM/MRL_GSMClassIndex.h"
+#include "LTE/LTEClassIndex.h"
+#include "UTRAN/UTRANClassIndex.h"
+
+#include "C2KFixture.h"
+
+#include "Console.h"
+#include "TelephonyConstants.h"
+
+#include <charconv>
+#include <functional>
+
+namespace orvex::test {
+
+// What takes packets of one code and writes into a container: a section, or the dispatch of CDMA2000.
+struct Decoder {
+    std::string name;
+    LogCode code;
+    // Takes a packet into the container, bound before.
+    std::function<void(const Value& container, const Bytes& packet)> feed;
+};
+
+// All decoders of a technology.
+class EveryDecoder {
+public:
+    explicit EveryDecoder(const std::string& technology)
+    {
+        installConsole([](std::string_view) {}); // some sections write a line for every packet
+        if (technology == telephony::kTechnologyMRL_GSM)
+            addSections(std::make_unique<MRL_GSMClassIndex>());
+        else if (technology == telephony::kTechnologyMRL_LTE)
+            addSections(std::make_unique<LTEClassIndex>());
+        else if (technology == telephony::kTechnologyMRL_UTRAN2)
+            addSections(std::make_unique<UTRANClassIndex>());
+        else
+            addCDMA2000();
+    }
+    ~EveryDecoder()
+    {
+        _index.reset();
+        installConsole({});
+    }
+    EveryDecoder(const EveryDecoder&) = delete;
+    EveryDecoder& operator=(const EveryDecoder&) = delete;
+
+    const std::vector<Decoder>& all() const { return _decoders; }
+
+private:
+    void addSections(std::unique_ptr<ClassIndex> index)
+    {
+        _index = std::move(index);
+        for (const std::string& key : _index->getAllLogCodes()) {
+            LogCode code = 0;
+            std::from_chars(key.data(), key.data() + key.size(), code);
+            for (Base* section : *_index->getSubscribers(code)) {
+                _decoders.push_back({section->getSectionName(), code,
+                    [section, code](const Value& container, const Bytes& packet) {
+                        section->updateSectionRef(container);
+                        section->updateWithData(packet, code);
+                    }});
+            }
+        }
+    }
+
+    // Every internal key is a row of the container. What decoders remember lasts for one packet: here the
+    // counters of the one before, without which no rate is shown.
+    void addCDMA2000()
+    {
+        const DictionaryRef command = _c2k.getStartCommand();
+        const ArrayRef codes = (*command)[telephony::kSetMarlinLogCodes].array();
+        for (const Value& code : *codes) {
+            _decoders.push_back({"CDMA2000", static_cast<LogCode>(*code.integer()),
+                [this](const Value& container, const Bytes& packet) {
+                    const auto rows = container.dictionary();
+                    const auto lookup = Dictionary::make();
+                    for (const char* key : kInternalKeys)
+                        Publisher::addRow(*lookup, key, key, rows);
+                    Dictionary state;
+                    for (const char* counter : {"FLDataSeqNum", "FLDataSent", "RLDataSeqNum", "RLDataSent"})
+                        state.set(counter, 0);
+                    _c2k.updateFromLog(packet, rows ? lookup : nullptr, state);
+                }});
+        }
+    }
+
+    FixedResources _resources;
+    FixedClock _clock;
+    C2KLogGenerator _c2k{GeneratorEnvironment{_resources, _clock, {}}};
+    std::unique_ptr<ClassIndex> _index; // null of CDMA2000
+    std::vector<Decoder> _decoders;
+};
+
+} // namespace orvex::test
