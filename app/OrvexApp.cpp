@@ -16,7 +16,7 @@ namespace {
 // A handset has it; elsewhere it is made. When that fails, so will the save, and say it.
 std::string reportDirectory()
 {
-    const std::string directory = paths::diagnosticReports();
+    std::string directory = paths::diagnosticReports();
     std::error_code ignored;
     std::filesystem::create_directories(directory, ignored);
     return directory;

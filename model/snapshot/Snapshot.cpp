@@ -32,12 +32,12 @@ const char* faultOf(const Value& list)
         return "not a snapshot: its property list is no dictionary";
     const ArrayRef data = (*dictionary)[kData].array();
     if (!data)
-        return "not a snapshot: it has no list \"Data\"";
+        return R"(not a snapshot: it has no list "Data")";
     if (!std::ranges::all_of(*data, [](const Value& entry) { return entry.dictionary() != nullptr; }))
-        return "not a snapshot: an entry of \"Data\" is no dictionary";
+        return R"(not a snapshot: an entry of "Data" is no dictionary)";
     for (const char* key : {kTimestamp, kDescription}) {
         if (!(*dictionary)[key].string())
-            return "not a snapshot: \"Timestamp\" or \"Description\" is no text";
+            return R"(not a snapshot: "Timestamp" or "Description" is no text)";
     }
     return nullptr;
 }

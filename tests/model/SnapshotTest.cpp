@@ -16,7 +16,7 @@ namespace orvex::test {
 namespace {
 
 class SnapshotTest : public testing::Test {
-protected:
+public:
     SnapshotTest()
     {
         std::string pattern = testing::TempDir() + "snapshotXXXXXX";

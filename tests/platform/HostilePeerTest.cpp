@@ -71,7 +71,7 @@ TEST_F(HostilePeerTest, NumberOfPeersIsBounded)
     };
     for (int i = 0; i < 64; ++i)
         connect("x");
-    EXPECT_TRUE(waitUntil([&] { return received.size() == 64 * 4; }));
+    EXPECT_TRUE(waitUntil([&] { return received.size() == 256; }));
     received.clear();
     connect("one too many");
     EXPECT_TRUE(waitUntil([&] { return peers.back()->isClosedByOther(); }));

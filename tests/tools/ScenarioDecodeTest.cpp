@@ -2,6 +2,7 @@
 
 #include "Decoding.h"
 #include "ScenarioItems.h"
+#include "TextFormat.h"
 
 #include <set>
 
@@ -15,7 +16,7 @@ void collectUnset(const Value& value, const std::string& path, std::set<std::str
 {
     if (const auto dictionary = value.dictionary()) {
         for (const auto& [key, element] : *dictionary)
-            collectUnset(element, path + "/" + key, unset);
+            collectUnset(element, text("%s/%s", path.c_str(), key.c_str()), unset);
     } else if (test::Decoding::isUnset(test::textOf(value))) {
         unset.insert(path);
     }

@@ -13,6 +13,7 @@
 
 #include "Console.h"
 #include "Snapshot.h"
+#include "TextFormat.h"
 
 #include <nlohmann/json.hpp>
 
@@ -146,7 +147,7 @@ int showSnapshots(const DecodeOptions& options)
         if (!options.technology.empty())
             document.decodeAnew(platform.generatorFor(options.technology));
         for (const std::string& omission : document.omissions())
-            complain(path + ": " + omission);
+            complain(text("%s: %s", path.c_str(), omission.c_str()));
         if (options.dlfFile)
             isGood = extractDlf(document, options) && isGood;
         if (isJson)

@@ -88,7 +88,7 @@ TEST_F(SnapshotDecodeTest, TheBinaryLogDecodesToTheSameTree)
 TEST_F(SnapshotDecodeTest, SaysInOneLineWhyASnapshotCannotBeRead)
 {
     const auto bytesOf = [](const std::string& text) { return Bytes(text.begin(), text.end()); };
-    std::string nested = "<plist version=\"1.0\">";
+    std::string nested = R"(<plist version="1.0">)";
     for (int i = 0; i < 1'000'000; ++i)
         nested += "<array>";
     const struct {
@@ -96,8 +96,8 @@ TEST_F(SnapshotDecodeTest, SaysInOneLineWhyASnapshotCannotBeRead)
         std::string content;
     } cases[] = {
         {"empty", ""},
-        {"cut", "<?xml version=\"1.0\"?><plist version=\"1.0\"><dict><key>Data</key><arr"},
-        {"another kind", "<plist version=\"1.0\"><string>Data</string></plist>"},
+        {"cut", R"(<?xml version="1.0"?><plist version="1.0"><dict><key>Data</key><arr)"},
+        {"another kind", R"(<plist version="1.0"><string>Data</string></plist>)"},
         {"a million nested lists", nested},
     };
     for (const auto& [name, content] : cases) {
