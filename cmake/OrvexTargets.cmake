@@ -11,6 +11,10 @@ if(ORVEX_SANITIZE)
         -fsanitize=address,undefined -fno-sanitize-recover=all)
     target_link_options(orvex_build_flags INTERFACE -fsanitize=address,undefined)
 endif()
+if(ORVEX_BUILD_FUZZERS)
+    # Everything is watched, so that an input counts as new wherever it leads to something new.
+    target_compile_options(orvex_build_flags INTERFACE -fsanitize=fuzzer-no-link)
+endif()
 
 # What everybody trusts has its lines counted: the generators and the model.
 function(orvex_count_coverage)

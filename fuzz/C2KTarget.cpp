@@ -1,0 +1,11 @@
+#include "FuzzSession.h"
+#include "FuzzTarget.h"
+
+#include "TelephonyConstants.h"
+
+int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
+{
+    using namespace orvex;
+    fuzz::FuzzSession(telephony::kTechnologyMRL_CDMA).run(fuzz::InputMessages({data, size}));
+    return 0;
+}

@@ -1,0 +1,95 @@
+#include "FuzzSession.h"
+
+#include "FuzzTarget.h"
+#include "MemoryFile.h"
+
+#include "Console.h"
+#include "FileResources.h"
+#include "OrvexModelNode.h"
+#include "Snapshot.h"
+#include "SystemLog.h"
+#include "TelephonyConstants.h"
+
+#include <map>
+
+namespace orvex::fuzz {
+
+namespace {
+
+constexpr std::size_t kRefreshEvery = 8; // messages
+
+class DroppingLog final : public SystemLog {
+public:
+    void write(Priority /*priority*/, std::string_view /*line*/) override { }
+};
+
+void installSinks()
+{
+    static DroppingLog log;
+    SystemLog::install(&log);
+    installConsole([](std::string_view) {});
+}
+
+const char* templateName(const std::string& technology)
+{
+    static const std::map<std::string, const char*> names = {
+        {telephony::kTechnologyMRL_GSM, "MRL_GSM"},
+        {telephony::kTechnologyMRL_CDMA, "C2KTemplate"},
+        {telephony::kTechnologyMRL_LTE, "LTE"},
+        {telephony::kTechnologyMRL_UTRAN2, "MRL_UTRAN2"},
+    };
+    const auto name = names.find(technology);
+    return name == names.end() ? nullptr : name->second; // IFX has none
+}
+
+// Read once: what is tried is not the file.
+DictionaryRef ownTemplate(const std::string& technology)
+{
+    static std::map<std::string, DictionaryRef> known;
+    const auto [entry, isNew] = known.try_emplace(technology);
+    if (const char* name = templateName(technology); name && isNew)
+        entry->second = FileResources(ORVEX_RESOURCES).dictionaryNamed(name);
+    return entry->second;
+}
+
+test::FixedResources resourcesOf(const std::string& technology, const DictionaryRef& skeleton)
+{
+    installSinks();
+    test::FixedResources resources;
+    if (const char* name = templateName(technology))
+        resources.templates[name] = Value(skeleton).deepCopy().dictionary();
+    return resources;
+}
+
+} // namespace
+
+FuzzSession::FuzzSession(const std::string& technology)
+    : FuzzSession(technology, ownTemplate(technology))
+{
+}
+
+FuzzSession::FuzzSession(const std::string& technology, const DictionaryRef& skeleton)
+    : _resources(resourcesOf(technology, skeleton))
+    , _session(LogGenerator::generatorFromTechnology(technology, {_resources, _clock, "Fuzz"}), kRefreshEvery)
+{
+}
+
+void FuzzSession::run(InputMessages messages)
+{
+    const bool isAlive = survives([&] {
+        while (const auto message = messages.next())
+            _session.take(*message);
+    });
+    if (isAlive && survives([this] { _session.display(); })) // what builds the display shows none yet
+        survives([this] { finish(); });
+}
+
+void FuzzSession::finish()
+{
+    NodesByPath paths;
+    OrvexModelNode::makeTreeFromObject(_session.display(), paths);
+    const MemoryFile file;
+    writeSnapshot({"2024-03-05 14:07:09 +0000", _session.saveContents(), "Fuzz"}, file.path());
+}
+
+} // namespace orvex::fuzz
