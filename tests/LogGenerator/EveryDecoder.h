@@ -68,19 +68,19 @@ private:
     // counters of the one before, without which no rate is shown.
     void addCDMA2000()
     {
+        for (const char* key : kInternalKeys)
+            Publisher::addRow(*_lookup, key, key, nullptr);
         const DictionaryRef command = _c2k.getStartCommand();
         const ArrayRef codes = (*command)[telephony::kSetMarlinLogCodes].array();
         for (const Value& code : *codes) {
             _decoders.push_back({"CDMA2000", static_cast<LogCode>(*code.integer()),
                 [this](const Value& container, const Bytes& packet) {
-                    const auto rows = container.dictionary();
-                    const auto lookup = Dictionary::make();
-                    for (const char* key : kInternalKeys)
-                        Publisher::addRow(*lookup, key, key, rows);
+                    for (const auto& [key, rows] : *_lookup)
+                        (*rows.array())[0].dictionary()->set("dict", container);
                     Dictionary state;
                     for (const char* counter : {"FLDataSeqNum", "FLDataSent", "RLDataSeqNum", "RLDataSent"})
                         state.set(counter, 0);
-                    _c2k.updateFromLog(packet, rows ? lookup : nullptr, state);
+                    _c2k.updateFromLog(packet, _lookup, state);
                 }});
         }
     }
@@ -88,7 +88,8 @@ private:
     FixedResources _resources;
     FixedClock _clock;
     C2KLogGenerator _c2k{GeneratorEnvironment{_resources, _clock, {}}};
-    std::unique_ptr<ClassIndex> _index; // null of CDMA2000
+    DictionaryRef _lookup = Dictionary::make(); // of CDMA2000
+    std::unique_ptr<ClassIndex> _index;         // of the others
     std::vector<Decoder> _decoders;
 };
 
