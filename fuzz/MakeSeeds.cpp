@@ -97,13 +97,16 @@ private:
         return LogGenerator::generatorFromTechnology(technology, {resources, clock, "Seed"});
     }
 
-    // One of each code, alone, and baseband packets in a row.
+    // The longest of each code, alone, and baseband packets in a row.
     void writeMessages(const Technology& technology) const
     {
         std::map<korat::LogCode, Bytes> byCode;
         const auto scenario = scenarioOf(technology.identifier);
-        for (auto item = scenario->next(); item.due <= kDrive; item = scenario->next())
-            byCode.try_emplace(item.message.code.value_or(0), shortened(std::move(item.message.bytes)));
+        for (auto item = scenario->next(); item.due <= kDrive; item = scenario->next()) {
+            Bytes& longest = byCode[item.message.code.value_or(0)];
+            if (item.message.bytes.size() > longest.size())
+                longest = shortened(std::move(item.message.bytes));
+        }
         for (const auto& [code, message] : byCode)
             write(technology.target, text("code-%06x", code), InputMessages::inputOf(Messages{message}));
         const bool isWholeReport = byCode.contains(0);

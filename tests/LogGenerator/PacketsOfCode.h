@@ -5,24 +5,25 @@
 
 #include "LogPackets.h"
 
+#include <algorithm>
+#include <functional>
 #include <map>
 #include <random>
 
 namespace orvex::test {
 
-// Packets to try on a technology's decoders, by code: the first ones of a minute's drive, property lists in
-// both forms, and for baseband codes two of random bytes.
+// Packets to try on a technology's decoders, by code: the longest ones of a minute's drive, which have
+// lists that are not empty, property lists in both forms, and for baseband codes two of random bytes.
 class PacketsOfCode {
 public:
     explicit PacketsOfCode(const std::string& technology)
     {
         using namespace std::chrono_literals;
-        for (auto& [due, message] : korat::itemsOf(*korat::findScenario(technology, ""), 60s)) {
-            std::vector<Bytes>& packets = _packets[static_cast<LogCode>(message.code.value())];
-            if (packets.size() < kOfDrive)
-                packets.push_back(std::move(message.bytes));
-        }
+        for (auto& [due, message] : korat::itemsOf(*korat::findScenario(technology, ""), 60s))
+            _packets[static_cast<LogCode>(message.code.value())].push_back(std::move(message.bytes));
         for (auto& [code, packets] : _packets) {
+            std::ranges::stable_sort(packets, std::greater(), &Bytes::size);
+            packets.resize(std::min(packets.size(), kOfDrive));
             if (code >= kExtraCodeBase) {
                 packets.push_back(inBinaryForm(packets.front()));
             } else if (std::ranges::find(kOfOneLength, code) == std::end(kOfOneLength)) {
