@@ -120,7 +120,7 @@ TEST_F(ReplaySourceTest, RecordsOfADlfBecomeMessages)
     testing::internal::CaptureStderr();
     EXPECT_FALSE(source.nextIfAny());
     EXPECT_EQ(testing::internal::GetCapturedStderr(),
-        "koratd: " + path + ": 1 bytes that make no record were skipped\n");
+        "koratd: " + path + ": 1 bytes that make no record were skipped (after 2 messages)\n");
 }
 
 TEST_F(ReplaySourceTest, CaptureThatBreaksIsPlayedUpToThereAndSaysSoOnce)

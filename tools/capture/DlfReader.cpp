@@ -35,18 +35,15 @@ CaptureReader::Status DlfReader::next()
     if (!_records)
         return Status::broken;
     const auto record = _records->next();
-    if (!record)
-        return Status::end;
+    if (!record) {
+        const std::size_t skipped = _records->skippedBytes();
+        return skipped == 0 ? Status::end
+                            : breakOff(text("%zu bytes that make no record were skipped", skipped));
+    }
     _message.assign(1, record->logType.value_or(kLogTypeBaseband));
     _message.insert(_message.end(), record->bytes.begin(), record->bytes.end());
     // The time is the modem's, in a unit of its own; koratd's is microseconds since 1970.
     return yield(_message, std::chrono::microseconds(static_cast<std::int64_t>(record->time & kLargestTime)));
-}
-
-std::string DlfReader::omissions() const
-{
-    const std::size_t skipped = _records ? _records->skippedBytes() : 0;
-    return skipped == 0 ? std::string() : text("%zu bytes that make no record were skipped", skipped);
 }
 
 } // namespace orvex

@@ -120,6 +120,42 @@ TEST_F(DecodeTest, CutCaptureShowsWhatWasWholeAndSaysSo)
     EXPECT_THAT(partial.errors, HasSubstr("1 packets hold only the beginning of their message"));
 }
 
+TEST_F(DecodeTest, SaysInOneLineWhatOfADlfMakesNoRecord)
+{
+    Bytes record = antennas(4); // as koratd writes it, without its log type
+    record.erase(record.begin());
+    record[0] = static_cast<std::uint8_t>(record.size());
+    record[1] = 0;
+    const auto joined = [](std::initializer_list<Bytes> parts) {
+        Bytes result;
+        for (const Bytes& part : parts)
+            result.insert(result.end(), part.begin(), part.end());
+        return result;
+    };
+    const Bytes beyond = {0xFF, 0x7F, 0xC1, 0xB0};
+    const struct {
+        const char* name;
+        Bytes bytes;
+        int status;
+        const char* why;
+    } cases[] = {
+        {"whole", joined({record, record}), 0, ""},
+        {"cut", joined({record, record, Bytes(record.begin(), record.end() - 1)}), 1,
+            "20 bytes that make no record were skipped (after 2 whole messages)\n"},
+        {"lengths of zero", joined({record, record, Bytes(40)}), 1,
+            "40 bytes that make no record were skipped (after 2 whole messages)\n"},
+        {"a length beyond the end", joined({record, record, beyond}), 1,
+            "4 bytes that make no record were skipped (after 2 whole messages)\n"},
+    };
+    for (const auto& [name, bytes, status, why] : cases) {
+        const Result result = decodeCaptures({bytes});
+        EXPECT_EQ(result.status, status) << name << ": " << result.errors;
+        EXPECT_THAT(result.output, HasSubstr("Num Tx Antennas: 4\n")) << name;
+        const std::string line = *why ? "orvex-decode: " + path("0.pcap") + ": " + why : "";
+        EXPECT_EQ(result.errors, line) << name;
+    }
+}
+
 TEST_F(DecodeTest, WritesDocumentAndLogIntoFiles)
 {
     const Result result = decodeCaptures({PcapFile().add(antennas(4)).add(Bytes(13, 2)).bytes()},
