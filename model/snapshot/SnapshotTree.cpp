@@ -1,16 +1,10 @@
 #include "SnapshotTree.h"
 
+#include "NumberedRows.h"
+
 #include "TextFormat.h"
 
 namespace orvex {
-
-void setUnderFreeName(Dictionary& rows, const std::string& name, const Value& value)
-{
-    std::string free = name;
-    for (int number = 2; rows.contains(free); ++number)
-        free = text("%s (%d)", name.c_str(), number);
-    rows.set(free, value);
-}
 
 std::string snapshotEntryName(const Dictionary& entry)
 {
@@ -20,21 +14,21 @@ std::string snapshotEntryName(const Dictionary& entry)
 
 OrvexModelNodeRef snapshotTree(const Snapshot& snapshot)
 {
-    Dictionary rows;
+    NumberedRows rows;
     std::size_t dlfBytes = 0;
     for (const Value& element : *snapshot.data) {
         const Dictionary& entry = *element.dictionary();
         if (const Value& display = entry["Display"]; display.dictionary() || display.array())
-            setUnderFreeName(rows, snapshotEntryName(entry), display);
+            rows.add(snapshotEntryName(entry), display);
         if (const BytesRef dlf = entry["DLF"].data())
             dlfBytes += dlf->size();
     }
     if (dlfBytes > 0)
-        setUnderFreeName(rows, "DLF", text("%zu bytes", dlfBytes));
-    setUnderFreeName(rows, "Description", snapshot.description.empty() ? "—" : snapshot.description);
+        rows.add("DLF", text("%zu bytes", dlfBytes));
+    rows.add("Description", snapshot.description.empty() ? "—" : snapshot.description);
 
     NodesByPath paths; // nobody asks a snapshot for a path
-    return OrvexModelNode::makeTreeFromObject(rows.shallowCopy(), paths);
+    return OrvexModelNode::makeTreeFromObject(rows.dictionary(), paths);
 }
 
 } // namespace orvex

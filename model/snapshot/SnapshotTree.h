@@ -12,7 +12,4 @@ OrvexModelNodeRef snapshotTree(const Snapshot& snapshot);
 // What an entry of a snapshot is called: its description.
 std::string snapshotEntryName(const Dictionary& entry);
 
-// Sets a row. Rows of one name would hide each other: from the second on they are numbered.
-void setUnderFreeName(Dictionary& rows, const std::string& name, const Value& value);
-
 } // namespace orvex

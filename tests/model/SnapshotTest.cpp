@@ -1,5 +1,6 @@
 #include "Snapshot.h"
 
+#include "NumberedRows.h"
 #include "PropertyList.h"
 
 #include <gtest/gtest.h>
@@ -154,6 +155,28 @@ TEST_F(SnapshotTest, AWriterKilledInTheMiddleLeavesAFileThatTheReaderCopesWith)
     EXPECT_TRUE(writeSnapshot(large, path)) << "the next one takes its place";
     EXPECT_TRUE(readSnapshot(path).snapshot);
     RecordProperty("halves", halves);
+}
+
+TEST(NumberedRows, NoRowHidesAnother)
+{
+    NumberedRows rows{{"A", 0}};
+    for (const char* name : {"A (3)", "A", "A", "B", "A (3)"})
+        rows.add(name, name);
+    std::string names;
+    for (const auto& [name, value] : *rows.dictionary())
+        names += name + ";";
+    EXPECT_EQ(names, "A;A (3);A (2);A (4);B;A (3) (2);");
+}
+
+TEST(NumberedRows, ManyOfOneNameAreNoWork)
+{
+    NumberedRows rows;
+    constexpr std::size_t kMany =
+        100'000; // in well under a second; minutes if each looked for its number anew
+    for (std::size_t i = 0; i < kMany; ++i)
+        rows.add("A", "");
+    EXPECT_EQ(rows.dictionary()->size(), kMany);
+    EXPECT_TRUE(rows.dictionary()->contains("A (100000)"));
 }
 
 } // namespace

@@ -4,6 +4,7 @@
 #include "TreeJson.h"
 
 #include "DisplayTreePrinter.h"
+#include "NumberedRows.h"
 #include "PropertyList.h"
 #include "RawMessages.h"
 #include "SnapshotTree.h"
@@ -68,7 +69,7 @@ void SnapshotDocument::decodeAnew(std::unique_ptr<LogGenerator> generator)
 
 std::string SnapshotDocument::tree() const
 {
-    Dictionary rows{{"Timestamp", _timestamp}, {"Description", _description}};
+    NumberedRows rows{{"Timestamp", _timestamp}, {"Description", _description}};
     for (const Entry& entry : _entries) {
         auto shown = Dictionary::make();
         for (const auto& [name, value] : {std::pair<const char*, Value>{"Date", entry.date},
@@ -76,9 +77,9 @@ std::string SnapshotDocument::tree() const
             if (!value.isNull())
                 shown->set(name, value);
         }
-        setUnderFreeName(rows, entry.description, shown);
+        rows.add(entry.description, shown);
     }
-    return DisplayTreePrinter::text(*treeOf(rows.shallowCopy()));
+    return DisplayTreePrinter::text(*treeOf(rows.dictionary()));
 }
 
 nlohmann::ordered_json SnapshotDocument::json() const
