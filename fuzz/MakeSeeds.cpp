@@ -45,7 +45,7 @@ constexpr Technology kTechnologies[] = {
 Bytes shortened(Bytes bytes)
 {
     constexpr std::string_view kBegin = "<!DOCTYPE";
-    const auto begin = std::ranges::search(bytes, kBegin).begin();
+    const auto begin = std::search(bytes.begin(), bytes.end(), kBegin.begin(), kBegin.end());
     const auto end = std::find(begin, bytes.end(), '\n');
     bytes.erase(begin, end == bytes.end() ? end : end + 1);
     return bytes;
