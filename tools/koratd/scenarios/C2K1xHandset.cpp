@@ -26,18 +26,10 @@ constexpr struct {
     {State::traffic, {10, 18}},
 };
 constexpr std::size_t kInService = 2; // the phase that comes after a call
-
-std::vector<PhaseCycle::Duration> durations()
-{
-    std::vector<PhaseCycle::Duration> result;
-    for (const auto& phase : kLife)
-        result.push_back(phase.duration);
-    return result;
-}
 } // namespace
 
 C2K1xHandset::C2K1xHandset()
-    : _life(durations(), kInService)
+    : _life(PhaseCycle::durationsOf(kLife), kInService)
 {
 }
 

@@ -30,18 +30,10 @@ constexpr struct {
 };
 constexpr std::size_t kSetup = 4;       // the phase in which the network gives the handset an identifier
 constexpr std::size_t kSessionOpen = 7; // the phase that comes after a connection
-
-std::vector<PhaseCycle::Duration> durations()
-{
-    std::vector<PhaseCycle::Duration> result;
-    for (const auto& phase : kLife)
-        result.push_back(phase.duration);
-    return result;
-}
 } // namespace
 
 C2KEVDOHandset::C2KEVDOHandset()
-    : _life(durations(), kSessionOpen)
+    : _life(PhaseCycle::durationsOf(kLife), kSessionOpen)
 {
 }
 

@@ -16,6 +16,16 @@ public:
         int longest = 0;
     };
 
+    // Of a table of phases, each with a duration.
+    template <typename Phases>
+    static std::vector<Duration> durationsOf(const Phases& phases)
+    {
+        std::vector<Duration> result;
+        for (const auto& phase : phases)
+            result.push_back(phase.duration);
+        return result;
+    }
+
     PhaseCycle(std::vector<Duration> phases, std::size_t again)
         : _phases(std::move(phases))
         , _again(again)
