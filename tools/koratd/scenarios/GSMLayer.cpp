@@ -17,24 +17,14 @@ constexpr int kBroadcastCarriers = 60; // ARFCNs 1 to 60; the others are for tra
 
 std::vector<RadioField::Transmitter> transmitters()
 {
-    std::vector<RadioField::Transmitter> result(kSites + kSmallCells + 1);
-    for (int i = 0; i < static_cast<int>(result.size()); ++i) {
-        RadioField::Transmitter& transmitter = result[static_cast<std::size_t>(i)];
-        if (i < kSites) {
-            transmitter.position = gsmTown::kRoadLength * i / (kSites - 1);
-            transmitter.offset = 30 + 10 * (i % 5);
-            transmitter.levelAt20m = -45;
-        } else if (i < kSites + kSmallCells) {
-            transmitter.position = gsmTown::kMarketPlace - kMarketRadius + 8 * (i - kSites);
-            transmitter.offset = 60;
-            transmitter.levelAt20m = -56;
-            transmitter.slope = 45;
-        } else {
-            transmitter.position = (gsmTown::kUnderpass.from + gsmTown::kUnderpass.to) / 2;
-            transmitter.isUnderground = true;
-        }
-    }
-    return result;
+    return gsmTown::transmittersAt({.wide = kSites,
+        .small = kSmallCells,
+        .marketRadius = kMarketRadius,
+        .wideLevelAt20m = -45,
+        .smallLevelAt20m = -56,
+        .nearest = 30,
+        .furtherBy = 10,
+        .distances = 5});
 }
 
 std::vector<GSMCell> cells()

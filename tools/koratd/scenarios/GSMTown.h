@@ -5,6 +5,8 @@
 
 #include "packets/PLMN.h"
 
+#include <vector>
+
 // A town with a GSM network, the subscriber's own, and a UMTS network that he may use as a guest.
 namespace orvex::korat::gsmTown {
 
@@ -25,5 +27,21 @@ inline constexpr Area kUMTSArea{{999, 100, 3}, 6215, 4};
 inline constexpr double kWeakestGSM = -103;
 inline constexpr double kWeakestRSCP = -112;
 inline constexpr std::size_t kLargestList = 32;
+
+// Where a network has its cells: wide ones along the road, small ones around the market place, and one in the
+// underpass.
+struct CellSites {
+    int wide = 0;
+    int small = 0;
+    double marketRadius = 0;    // m
+    double wideLevelAt20m = 0;  // dBm
+    double smallLevelAt20m = 0; // dBm
+    double nearest = 0;         // m from the road, of the wide ones
+    double furtherBy = 0;       // m, from one to the next
+    int distances = 1;          // after which they begin anew
+};
+
+// A transmitter for each cell, in this order.
+std::vector<RadioField::Transmitter> transmittersAt(const CellSites& sites);
 
 } // namespace orvex::korat::gsmTown

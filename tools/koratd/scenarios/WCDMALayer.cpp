@@ -24,24 +24,14 @@ constexpr double kMarketRadius = 144; // m
 
 std::vector<RadioField::Transmitter> transmitters()
 {
-    std::vector<RadioField::Transmitter> result(kSites + kSmallCells + 1);
-    for (int i = 0; i < static_cast<int>(result.size()); ++i) {
-        RadioField::Transmitter& transmitter = result[static_cast<std::size_t>(i)];
-        if (i < kSites) {
-            transmitter.position = gsmTown::kRoadLength * i / (kSites - 1);
-            transmitter.offset = 60 + 70 * (i % 3);
-            transmitter.levelAt20m = -48;
-        } else if (i < kSites + kSmallCells) {
-            transmitter.position = gsmTown::kMarketPlace - kMarketRadius + 8 * (i - kSites);
-            transmitter.offset = 60;
-            transmitter.levelAt20m = -52;
-            transmitter.slope = 45;
-        } else {
-            transmitter.position = (gsmTown::kUnderpass.from + gsmTown::kUnderpass.to) / 2;
-            transmitter.isUnderground = true;
-        }
-    }
-    return result;
+    return gsmTown::transmittersAt({.wide = kSites,
+        .small = kSmallCells,
+        .marketRadius = kMarketRadius,
+        .wideLevelAt20m = -48,
+        .smallLevelAt20m = -52,
+        .nearest = 60,
+        .furtherBy = 70,
+        .distances = 3});
 }
 
 std::vector<WCDMACell> cells()
