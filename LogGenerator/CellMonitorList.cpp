@@ -1,6 +1,7 @@
 #include "CellMonitorList.h"
 
-#include "PropertyList.h"
+#include "ExtraPacket.h"
+
 #include "SystemLog.h"
 #include "TelephonyConstants.h"
 #include "TextFormat.h"
@@ -38,8 +39,9 @@ void printNumber(Rows& row, const char* name, const CellEntry& entry, std::int32
 
 bool CellRecord::is(const char* radioAccessTechnology, const char* cellType) const
 {
-    return (*_record)[telephony::kCellRadioAccessTechnology] == Value(radioAccessTechnology)
-        && (*_record)[telephony::kCellType] == Value(cellType);
+    const std::string* radio = (*_record)[telephony::kCellRadioAccessTechnology].string();
+    const std::string* type = (*_record)[telephony::kCellType].string();
+    return radio && type && *radio == radioAccessTechnology && *type == cellType;
 }
 
 std::optional<std::int32_t> CellRecord::number(const char* key) const
@@ -67,7 +69,7 @@ void printCell(
 
 CellMonitorList::CellMonitorList(Packet packet)
 {
-    const auto list = propertyListFromData(PacketReader(packet).from(kPacketHeaderLength).bytes());
+    const PropertyListResult& list = propertyListOf(packet);
     if (!list.value) {
         systemLog(Priority::error, "Cell Info Array data could not be constructed");
         return;

@@ -1,6 +1,7 @@
 #include "GSM/PDPContextList.h"
 
-#include "PropertyList.h"
+#include "ExtraPacket.h"
+
 #include "SystemLog.h"
 
 namespace orvex {
@@ -13,7 +14,7 @@ PDPContextList::PDPContextList(ClassDictionary& dict, CodeDictionary& codeDict)
 void PDPContextList::updateWithData(Packet packet, LogCode)
 {
     systemLog(Priority::warning, "PDPContextList");
-    const auto list = propertyListFromData(PacketReader(packet).from(kPacketHeaderLength).bytes());
+    const PropertyListResult& list = propertyListOf(packet);
     if (!list.value)
         throw UnknownDataException("PDP context list: " + list.error);
     if (const ArrayRef contexts = list.value->array())
