@@ -2,9 +2,9 @@
 
 #include "CodeDictionary.h"
 #include "PacketReader.h"
-#include "Rows.h"
+#include "RowList.h"
 
-#include "Array.h"
+#include "ArrayLock.h"
 
 #include <map>
 #include <memory>
@@ -55,27 +55,43 @@ protected:
     // The two array operations on the bound array, if there is one.
     void clearSection() const;
     void replaceSection(const Array& with) const;
-    // A new array of what the maker makes of each record: row dictionaries, as a rule.
-    template <typename Records, typename Maker>
-    static ArrayRef listOf(const Records& records, Maker make)
+    // Fills the bound array anew, under the array lock: fill(RowList&).
+    template <typename Filler>
+    void fillSection(Filler fill) const
     {
-        auto list = Array::make();
-        for (const auto& record : records)
-            list->append(make(record));
-        return list;
+        const auto bound = array();
+        fillList(bound.get(), fill);
     }
-    // Empties the bound array and fills it anew with one row dictionary a record.
-    template <typename Records, typename RowMaker>
-    void refillSection(const Records& records, RowMaker rowsOf) const
+    // The same with one row dictionary a record, written by print(Rows&, record).
+    template <typename Records, typename Printer>
+    void refillSection(const Records& records, Printer print) const
     {
-        clearSection();
-        replaceSection(*listOf(records, rowsOf));
+        fillSection([&](RowList& list) { printAll(list, records, print); });
+    }
+    // Both with a list that is a row, say.
+    template <typename Filler>
+    static void fillList(Array* array, Filler fill)
+    {
+        const ArrayLockScope lock;
+        RowList list(array);
+        fill(list);
+    }
+    template <typename Records, typename Printer>
+    static void refill(Array* list, const Records& records, Printer print)
+    {
+        fillList(list, [&](RowList& rows) { printAll(rows, records, print); });
     }
 
     // "Received an unknown log message: %d"
     static void reportUnknown(LogCode logCode);
 
 private:
+    template <typename Records, typename Printer>
+    static void printAll(RowList& list, const Records& records, Printer print)
+    {
+        for (const auto& record : records)
+            print(list.next(), record);
+    }
     void updateLogCodeDict(CodeDictionary& codeDict);
 
     std::string _sectionName;

@@ -77,7 +77,10 @@ ArrayRef MRLLogGenerator::getSaveContentsFromState(const Dictionary& state) cons
 
 void MRLLogGenerator::handOverBinData(Dictionary& state)
 {
-    state.set("DisplayState", std::exchange(_binData, std::make_shared<Bytes>()));
+    auto next = std::make_shared<Bytes>();
+    if (_binData)
+        next->reserve(_binData->size()); // one interval is much like the next
+    state.set("DisplayState", std::exchange(_binData, std::move(next)));
 }
 
 } // namespace orvex

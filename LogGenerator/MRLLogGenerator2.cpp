@@ -74,7 +74,7 @@ Value MRLLogGenerator2::generateLogUsingState(Dictionary& state)
 Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
 {
     const DictionaryRef display = state["Display"].dictionary();
-    if (display && display == _boundDisplay.lock())
+    if (display && isBoundTo(display))
         return display;
 
     DictionaryRef skeleton = _template.in(state);
@@ -101,6 +101,12 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
     state.set("ExtraInfo", Dictionary::make());
     _boundDisplay = built.dictionary();
     return {}; // deliberately: only the next call gets it
+}
+
+bool MRLLogGenerator2::isBoundTo(const DictionaryRef& display) const
+{
+    // The same owner, without a lock: this is asked for every message.
+    return !_boundDisplay.owner_before(display) && !display.owner_before(_boundDisplay);
 }
 
 Value MRLLogGenerator2::processTemplate(const Value& object)

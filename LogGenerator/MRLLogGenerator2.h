@@ -57,6 +57,7 @@ protected:
 
 private:
     void printDict(const Value& object) const;
+    bool isBoundTo(const DictionaryRef& display) const;
     void bindToDisplay(const Value& templateObject, const Value& display);
     void bindSection(std::string_view name, const Value& container);
 

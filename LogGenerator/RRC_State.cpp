@@ -15,7 +15,7 @@ constexpr EnumText kStates[] = {{0, "Disconnected"}, {1, "Connecting"}, {2, "Cel
     {4, "Cell PCH"}, {5, "Cell URA PCH"}};
 
 // {Name = text; ...}, for the developer's eyes.
-std::string describe(const DictionaryRef& rows)
+std::string describe(const Dictionary* rows)
 {
     if (!rows)
         return "(null)";

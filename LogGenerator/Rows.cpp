@@ -1,32 +1,38 @@
 #include "Rows.h"
 
-#include "TextFormat.h"
+#include "Array.h"
 
 namespace orvex {
 
-void Rows::set(const char* name, Value value)
+Value& Rows::slotElsewhere(std::string_view name)
 {
-    if (_dictionary)
-        _dictionary->set(name, std::move(value));
+    // What stands from here on is left from before. As the next row is another one it goes, and the order is
+    // the same as if the dictionary had been empty.
+    end();
+    std::size_t position = 0;
+    Value& value = _dictionary->slot(name, position);
+    _next = _isWrittenAnew ? _dictionary->size() : position + 1; // it may be a row that was set already
+    return value;
 }
 
-void Rows::print(const char* name, const char* format, ...)
+Array* Rows::list(std::string_view name)
+{
+    if (!_dictionary)
+        return nullptr;
+    Value& value = slot(name);
+    if (!value.ownArray())
+        value = Array::make();
+    return value.ownArray();
+}
+
+void Rows::remove(std::string_view name)
 {
     if (!_dictionary)
         return;
-    Value& slot = _dictionary->slot(name);
-    if (!slot.string())
-        slot = std::string();
-    std::va_list arguments; // NOLINT(cppcoreguidelines-init-variables): va_start initialises it
-    va_start(arguments, format);
-    formatInto(*slot.string(), format, arguments); // into the row's own storage
-    va_end(arguments);
-}
-
-void Rows::remove(const char* name)
-{
-    if (_dictionary)
-        _dictionary->remove(name);
+    if (_isWrittenAnew)
+        end();
+    _dictionary->remove(name);
+    _next = _isWrittenAnew ? _dictionary->size() : 0;
 }
 
 } // namespace orvex

@@ -6,24 +6,73 @@ namespace orvex {
 
 // Writes rows, name and text, into one dictionary of the display: a section's own, or a record's in a list.
 // A writer over nothing drops what it is given.
+//
+// Texts are made when they are read (LateText): a const char* given to set() or print() has to live as long
+// as the program.
 class Rows {
 public:
+    // Sets rows and leaves the others.
     explicit Rows(DictionaryRef dictionary)
-        : _dictionary(std::move(dictionary))
+        : _owner(std::move(dictionary))
+        , _dictionary(_owner.get())
     {
     }
-    // Over a new, empty dictionary.
-    static Rows make() { return Rows(Dictionary::make()); }
+    // Writes a dictionary, which outlives the writer, anew: only what is set from now on is in it after
+    // end().
+    static Rows anew(Dictionary* dictionary) { return Rows(dictionary); }
 
-    void set(const char* name, Value value);
+    void set(std::string_view name, const char* text)
+    {
+        if (_dictionary)
+            slot(name).set(LateText(text));
+    }
+    void set(std::string_view name, Value value)
+    {
+        if (_dictionary)
+            slot(name) = std::move(value);
+    }
     // The text by a printf format.
-    [[gnu::format(printf, 3, 4)]] void print(const char* name, const char* format, ...);
-    void remove(const char* name);
+    template <typename... Arguments>
+    void print(std::string_view name, PrintfFormat<std::type_identity_t<Arguments>...> format,
+        Arguments... arguments)
+    {
+        if (_dictionary)
+            slot(name).set(LateText(format, arguments...));
+    }
+    // An array as a row: the one that is there when no one else holds it, else a new one. A writer over
+    // nothing has none.
+    Array* list(std::string_view name);
+    void remove(std::string_view name);
 
-    const DictionaryRef& dictionary() const { return _dictionary; }
+    void end()
+    {
+        if (_isWrittenAnew && _dictionary && _next < _dictionary->size())
+            _dictionary->removeFrom(_next);
+    }
+
+    const Dictionary* dictionary() const { return _dictionary; }
 
 private:
-    DictionaryRef _dictionary;
+    explicit Rows(Dictionary* dictionary)
+        : _dictionary(dictionary)
+        , _isWrittenAnew(true)
+    {
+    }
+    // Rows are mostly written in the order in which they stand.
+    Value& slot(std::string_view name)
+    {
+        if (Value* expected = _dictionary->slotAt(_next, name)) {
+            ++_next;
+            return *expected;
+        }
+        return slotElsewhere(name);
+    }
+    Value& slotElsewhere(std::string_view name);
+
+    DictionaryRef _owner; // null for one that is written anew
+    Dictionary* _dictionary;
+    std::size_t _next = 0; // where the next row is expected
+    bool _isWrittenAnew = false;
 };
 
 } // namespace orvex

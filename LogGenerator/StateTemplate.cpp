@@ -10,7 +10,7 @@ constexpr const char* kTemplateName = "TemplateName";
 DictionaryRef StateTemplate::in(const Dictionary& state) const
 {
     const Value& name = state[kTemplateName];
-    const bool isOwn = name.isNull() || name == Value(_name);
+    const bool isOwn = name.isNull() || (name.string() && *name.string() == _name);
     return isOwn ? state[kTemplate].dictionary() : nullptr;
 }
 

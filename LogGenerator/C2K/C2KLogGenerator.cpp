@@ -89,13 +89,13 @@ void C2KLogGenerator::processTemplate(
 
 DictionaryRef C2KLogGenerator::getDisplayFromState(Dictionary& state, const Resources& resources)
 {
-    const StateTemplate ownTemplate("C2KTemplate");
-    auto skeleton = ownTemplate.in(state);
+    static const StateTemplate kTemplate("C2KTemplate");
+    auto skeleton = kTemplate.in(state);
     auto display = state["Display"].dictionary();
     if (display && skeleton)
         return display;
     if (!skeleton)
-        skeleton = ownTemplate.loadInto(state, resources);
+        skeleton = kTemplate.loadInto(state, resources);
     if (!skeleton) {
         systemLog(Priority::error, "Cannot load C2K template for display");
         return nullptr;

@@ -1,7 +1,6 @@
 #include "C2K/Publisher.h"
 
 #include "Array.h"
-#include "TextFormat.h"
 
 namespace orvex {
 
@@ -22,27 +21,17 @@ void Publisher::addRow(
 
 void Publisher::publish(const char* internalKey, const Value& value) const
 {
-    const auto rows = _lookup ? (*_lookup)[internalKey].array() : nullptr;
+    const Array* rows = _lookup ? (*_lookup)[internalKey].heldArray() : nullptr;
     if (!rows)
         return;
     for (const Value& element : *rows) {
-        const auto entry = element.dictionary();
-        const auto dict = entry ? (*entry)[kRowDictionary].dictionary() : nullptr;
+        const Dictionary* entry = element.heldDictionary();
+        Dictionary* dict = entry ? (*entry)[kRowDictionary].heldDictionary() : nullptr;
         const std::string* row = dict ? (*entry)[kRowName].string() : nullptr;
         if (!row)
             return;
         dict->set(*row, value);
     }
-}
-
-void Publisher::print(const char* internalKey, const char* format, ...) const
-{
-    std::string result;
-    std::va_list arguments; // NOLINT(cppcoreguidelines-init-variables): va_start initialises it
-    va_start(arguments, format);
-    formatInto(result, format, arguments);
-    va_end(arguments);
-    publish(internalKey, result);
 }
 
 } // namespace orvex

@@ -25,7 +25,12 @@ public:
     // it.
     void publish(const char* internalKey, const Value& value) const;
     // The text by a printf format.
-    [[gnu::format(printf, 3, 4)]] void print(const char* internalKey, const char* format, ...) const;
+    template <typename... Arguments>
+    void print(const char* internalKey, PrintfFormat<std::type_identity_t<Arguments>...> format,
+        Arguments... arguments) const
+    {
+        publish(internalKey, LateText(format, arguments...));
+    }
 
 private:
     DictionaryRef _lookup;

@@ -9,22 +9,20 @@ ActiveSet::ActiveSet(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void ActiveSet::update(const LogCode_0x417A& report)
 {
-    clearSection();
     const auto cells = report.cells();
     const auto energies = report.energies();
-    Array list;
-    // Energies stand behind all cells: where a cell's energies are in the packet, so is the cell.
-    for (std::size_t i = 0; i < energies.countInside(); ++i) {
-        if (!cells[i].isActive())
-            continue;
-        const int ecNo = lookUpECNO(energies[i].ecIo());
-        Rows row = Rows::make();
-        row.print("Scrambling Code", "%d", cells[i].primaryScramblingCode());
-        row.print("RSCP", "%d dB", report.rssi() + ecNo); // shown so, though it is dBm
-        row.print("Energy Per Chip", "%d dB", ecNo);
-        list.append(row.dictionary());
-    }
-    replaceSection(list);
+    fillSection([&](RowList& list) {
+        // Energies stand behind all cells: where a cell's energies are in the packet, so is the cell.
+        for (std::size_t i = 0; i < energies.countInside(); ++i) {
+            if (!cells[i].isActive())
+                continue;
+            const int ecNo = lookUpECNO(energies[i].ecIo());
+            Rows& row = list.next();
+            row.print("Scrambling Code", "%d", cells[i].primaryScramblingCode());
+            row.print("RSCP", "%d dB", report.rssi() + ecNo); // shown so, though it is dBm
+            row.print("Energy Per Chip", "%d dB", ecNo);
+        }
+    });
 }
 
 } // namespace orvex

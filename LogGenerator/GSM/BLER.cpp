@@ -4,13 +4,11 @@ namespace orvex {
 
 namespace {
 
-DictionaryRef rowsOf(const LogCode_0x4116::TransportChannel& channel)
+void printRecord(Rows& row, const LogCode_0x4116::TransportChannel& channel)
 {
-    Rows row = Rows::make();
     row.print("Transport Channel ID", "%d", channel.identity());
     row.print("CRC Received", "%d", channel.received());
     row.print("CRC Received in Error", "%d", channel.receivedInError());
-    return row.dictionary();
 }
 
 } // namespace
@@ -24,7 +22,7 @@ void BLER::update(const LogCode_0x4116& report)
 {
     Rows row = rows();
     row.print("Window Size", "%d", report.windowSize());
-    row.set("Transport Channels", listOf(report.transportChannels(), rowsOf));
+    refill(row.list("Transport Channels"), report.transportChannels(), printRecord);
 }
 
 } // namespace orvex

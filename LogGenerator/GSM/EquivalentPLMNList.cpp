@@ -4,12 +4,10 @@ namespace orvex {
 
 namespace {
 
-DictionaryRef rowsOf(const LogCode_0x7150::PLMN& plmn)
+void printRecord(Rows& row, const LogCode_0x7150::PLMN& plmn)
 {
-    Rows row = Rows::make();
     row.print("Mobile Country Code", "%d", plmn.mobileCountryCode());
     row.print("Mobile Network Code", "%d", plmn.mobileNetworkCode());
-    return row.dictionary();
 }
 
 } // namespace
@@ -21,7 +19,7 @@ EquivalentPLMNList::EquivalentPLMNList(ClassDictionary& dict, CodeDictionary& co
 
 void EquivalentPLMNList::update(const LogCode_0x7150& report)
 {
-    refillSection(report.plmns(), rowsOf);
+    refillSection(report.plmns(), printRecord);
 }
 
 } // namespace orvex

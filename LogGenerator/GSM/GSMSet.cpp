@@ -4,14 +4,12 @@ namespace orvex {
 
 namespace {
 
-DictionaryRef rowsOf(const LogCode_0x4005::GSMCell& cell)
+void printRecord(Rows& row, const LogCode_0x4005::GSMCell& cell)
 {
-    Rows row = Rows::make();
     row.print("ARFCN", "%d", cell.arfcn());
     row.print("BSIC", "%d", cell.bsic());
     row.print("RSSI", "%d dBm", cell.rssi());
     row.print("Ranking Value", "%d", cell.rankingValue());
-    return row.dictionary();
 }
 
 } // namespace
@@ -23,7 +21,7 @@ GSMSet::GSMSet(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void GSMSet::update(const LogCode_0x4005& report)
 {
-    refillSection(report.gsmCells(), rowsOf);
+    refillSection(report.gsmCells(), printRecord);
 }
 
 } // namespace orvex

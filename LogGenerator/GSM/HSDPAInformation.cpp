@@ -9,14 +9,12 @@ namespace {
 constexpr EnumText kCarrierConfigurations[] = {
     {0, "Single Carrier"}, {1, "MIMO"}, {2, "Dual Carrier"}, {3, "Reserved"}};
 
-DictionaryRef rowsOf(const LogCode_0x4221::Process& process)
+void printRecord(Rows& row, const LogCode_0x4221::Process& process)
 {
-    Rows row = Rows::make();
     row.print("Process ID", "%u", process.identity());
     row.print("No Rx Bits", "%u", process.receivedBits());
     row.print("New Tx", "%u", process.newTransmissions());
     row.print("Block Errors", "%u", process.blockErrors());
-    return row.dictionary();
 }
 
 } // namespace
@@ -33,9 +31,9 @@ void HSDPAInformation::update(const LogCode_0x4221& report)
     row.print("Sub Frames", "%u", report.subframes());
     row.set("Carrier Info", textFor(report.carrierConfiguration(), kCarrierConfigurations, ""));
     if (report.primaryProcesses().count() > 0)
-        row.set("Primary HARQ Process", listOf(report.primaryProcesses(), rowsOf));
+        refill(row.list("Primary HARQ Process"), report.primaryProcesses(), printRecord);
     if (report.secondaryProcesses().count() > 0)
-        row.set("Secondary HARQ Process", listOf(report.secondaryProcesses(), rowsOf));
+        refill(row.list("Secondary HARQ Process"), report.secondaryProcesses(), printRecord);
 }
 
 } // namespace orvex

@@ -1,7 +1,5 @@
 #include "GSM/MobileAllocation.h"
 
-#include "TextFormat.h"
-
 namespace orvex {
 
 MobileAllocation::MobileAllocation(ClassDictionary& dict, CodeDictionary& codeDict)
@@ -13,8 +11,10 @@ void MobileAllocation::update(const LogCode_0x51F8& report)
 {
     Rows row = rows();
     row.print("HSN", "%d", report.hoppingSequenceNumber());
-    row.set(
-        "ARFCNs", listOf(report.channels(), [](const auto& channel) { return text("%d", channel.arfcn()); }));
+    fillList(row.list("ARFCNs"), [&](RowList& list) {
+        for (const auto& channel : report.channels())
+            list.append(LateText(PrintfFormat<int>("%d"), channel.arfcn()));
+    });
 }
 
 } // namespace orvex

@@ -12,11 +12,9 @@ constexpr CellEntry kCellEntries[] = {
     {telephony::kCellRSSI, "RSSI", "RSSI", CellNumber::levelBy2, " dBm"},
 };
 
-DictionaryRef rowsOfCell(const CellRecord& cell)
+void printCellRecord(Rows& row, const CellRecord& cell)
 {
-    Rows row = Rows::make();
     printCell(row, cell, kCellEntries, "NeighboringCells");
-    return row.dictionary();
 }
 
 } // namespace
@@ -26,20 +24,19 @@ NeighboringCells::NeighboringCells(ClassDictionary& dict, CodeDictionary& codeDi
 {
 }
 
-DictionaryRef NeighboringCells::rowsOf(const LogCode_0x5137::Neighbor& neighbor) const
+void NeighboringCells::printNeighbor(Rows& row, const LogCode_0x5137::Neighbor& neighbor) const
 {
-    Rows row = Rows::make();
     row.print("ARFCN", "%d", neighbor.arfcn());
     row.print("RSSI", "%d", neighbor.receiveLevel());
     row.print("C1 Value", "%d", neighbor.c1());
     if (const auto known = _arfcnToBsic.find(neighbor.arfcn()); known != _arfcnToBsic.end())
         row.print("BSIC", "%d", known->second);
-    return row.dictionary();
 }
 
 void NeighboringCells::update(const LogCode_0x5137& report)
 {
-    refillSection(report.neighbors(), [this](const auto& neighbor) { return rowsOf(neighbor); });
+    refillSection(
+        report.neighbors(), [this](Rows& row, const auto& neighbor) { printNeighbor(row, neighbor); });
 }
 
 void NeighboringCells::update(const LogCode_0x51FF& report)
@@ -52,7 +49,7 @@ void NeighboringCells::update(const LogCode_0x51FF& report)
 void NeighboringCells::update(const CellMonitorList& list)
 {
     list.reportIfAbsent();
-    refillSection(list.findAll(telephony::kRadioGSM, telephony::kCellTypeNeighbor), rowsOfCell);
+    refillSection(list.findAll(telephony::kRadioGSM, telephony::kCellTypeNeighbor), printCellRecord);
 }
 
 } // namespace orvex

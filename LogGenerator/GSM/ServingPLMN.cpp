@@ -3,6 +3,7 @@
 #include "EnumTable.h"
 
 #include "TelephonyConstants.h"
+#include "TextFormat.h"
 
 namespace orvex {
 
@@ -22,7 +23,7 @@ constexpr CellEntry kCellEntries[] = {
 
 void printDigits(Rows& row, const char* name, const LogCode_0x7135::Digits& digits)
 {
-    row.print(name, "%c%c%c", digits[0], digits[1], digits[2]);
+    row.set(name, text("%c%c%c", digits[0], digits[1], digits[2]));
 }
 
 } // namespace

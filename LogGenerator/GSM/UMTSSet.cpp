@@ -13,23 +13,19 @@ constexpr CellEntry kCellEntries[] = {
     {telephony::kCellECN0, "Energy Per Chip", "Energy Per Chip", CellNumber::level, " dB"},
 };
 
-DictionaryRef rowsOfCell(const CellRecord& cell)
+void printCellRecord(Rows& row, const CellRecord& cell)
 {
-    Rows row = Rows::make();
     printCell(row, cell, kCellEntries, "UMTSSet");
-    return row.dictionary();
 }
 
-DictionaryRef rowsOfRankedCell(const LogCode_0x4005::UMTSCell& cell)
+void printRankedCell(Rows& row, const LogCode_0x4005::UMTSCell& cell)
 {
-    Rows row = Rows::make();
     row.print("Scrambling Code", "%d", cell.primaryScramblingCode());
     row.print("RSCP", "%d dB", cell.rscp()); // shown so, though it is dBm
     row.print("Energy Per Chip", "%f dB", cell.ecNo());
     row.print("Downlink Frequency", "%d", cell.downlinkUARFCN());
     row.print("Ranking Value", "%d", cell.rankingValue());
     row.print("Rank Cell RSCP", "%d dB", cell.rankingRSCP());
-    return row.dictionary();
 }
 
 } // namespace
@@ -41,13 +37,13 @@ UMTSSet::UMTSSet(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void UMTSSet::update(const LogCode_0x4005& report)
 {
-    refillSection(report.umtsCells(), rowsOfRankedCell);
+    refillSection(report.umtsCells(), printRankedCell);
 }
 
 void UMTSSet::update(const CellMonitorList& list)
 {
     list.reportIfAbsent();
-    refillSection(list.findAll(telephony::kRadioUMTS, telephony::kCellTypeNeighbor), rowsOfCell);
+    refillSection(list.findAll(telephony::kRadioUMTS, telephony::kCellTypeNeighbor), printCellRecord);
 }
 
 } // namespace orvex

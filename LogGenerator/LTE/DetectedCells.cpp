@@ -4,11 +4,9 @@ namespace orvex {
 
 namespace {
 
-DictionaryRef rowsOf(const LogCode_0xB179::DetectedCell& cell)
+void printRecord(Rows& row, const LogCode_0xB179::DetectedCell& cell)
 {
-    Rows row = Rows::make();
     row.print("Physical Cell ID", "%d", cell.physicalCellIdentity());
-    return row.dictionary();
 }
 
 } // namespace
@@ -20,7 +18,7 @@ DetectedCells::DetectedCells(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void DetectedCells::update(const LogCode_0xB179& report)
 {
-    refillSection(report.detectedCells(), rowsOf);
+    refillSection(report.detectedCells(), printRecord);
 }
 
 } // namespace orvex

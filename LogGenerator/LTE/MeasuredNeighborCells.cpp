@@ -4,13 +4,11 @@ namespace orvex {
 
 namespace {
 
-DictionaryRef rowsOf(const LogCode_0xB179::MeasuredNeighbor& neighbor)
+void printRecord(Rows& row, const LogCode_0xB179::MeasuredNeighbor& neighbor)
 {
-    Rows row = Rows::make();
     row.print("Physical Cell ID", "%d", neighbor.physicalCellIdentity());
     row.print("Filtered RSRP", "%4.2f dBm", neighbor.filteredRSRP());
     row.print("Filtered RSRQ", "%4.2f dB", neighbor.filteredRSRQ());
-    return row.dictionary();
 }
 
 } // namespace
@@ -22,7 +20,7 @@ MeasuredNeighborCells::MeasuredNeighborCells(ClassDictionary& dict, CodeDictiona
 
 void MeasuredNeighborCells::update(const LogCode_0xB179& report)
 {
-    refillSection(report.measuredNeighbors(), rowsOf);
+    refillSection(report.measuredNeighbors(), printRecord);
 }
 
 } // namespace orvex

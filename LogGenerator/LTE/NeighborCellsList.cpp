@@ -13,9 +13,8 @@ void printAndLog(Rows& row, const char* name, double value, const char* unit)
     systemLog(Priority::warning, "Measured RSSI: %lf\n", value);
 }
 
-DictionaryRef rowsOf(const LogCode_0xB180::NeighborCell& cell)
+void printRecord(Rows& row, const LogCode_0xB180::NeighborCell& cell)
 {
-    Rows row = Rows::make();
     row.print("Physical Cell ID", "%d", cell.physicalCellIdentity());
     systemLog(Priority::warning, "Physical Cell ID: %d\n", cell.physicalCellIdentity());
     printAndLog(row, "Measured RSSI", cell.measuredRSSI(), "dBm");
@@ -30,7 +29,6 @@ DictionaryRef rowsOf(const LogCode_0xB180::NeighborCell& cell)
     // Antenna 1 shows antenna 0 again: the record has no other bits for it.
     row.print("Ant 1 Frame Offset", "%d", cell.antenna0FrameOffset());
     row.print("Ant 1 Sample Offset", "%d", cell.antenna0SampleOffset());
-    return row.dictionary();
 }
 
 } // namespace
@@ -45,7 +43,7 @@ void NeighborCellsList::update(const LogCode_0xB180& report)
     const auto neighbors = report.neighborCells();
     systemLog(Priority::warning, "Number of neighboring cells being reported: %d\n",
         static_cast<int>(neighbors.count()));
-    refillSection(neighbors, rowsOf);
+    refillSection(neighbors, printRecord);
 }
 
 } // namespace orvex

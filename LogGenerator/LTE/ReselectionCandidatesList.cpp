@@ -48,13 +48,11 @@ void printTechnologyFields(Rows& row, const LogCode_0xB186::Candidate& candidate
     }
 }
 
-DictionaryRef rowsOf(const LogCode_0xB186::Candidate& candidate)
+void printRecord(Rows& row, const LogCode_0xB186::Candidate& candidate)
 {
-    Rows row = Rows::make();
     row.print("Candidate Priority", "%d", candidate.priority());
     row.set("Candidate RAT Type", textFor(candidate.technology(), kTechnologies, "??"));
     printTechnologyFields(row, candidate);
-    return row.dictionary();
 }
 
 } // namespace
@@ -66,14 +64,13 @@ ReselectionCandidatesList::ReselectionCandidatesList(ClassDictionary& dict, Code
 
 void ReselectionCandidatesList::update(const LogCode_0xB186& report)
 {
-    clearSection();
-    Array cells;
-    for (const auto& candidate : report.candidates()) {
-        if (!candidate.isComplete())
-            break;
-        cells.append(rowsOf(candidate));
-    }
-    replaceSection(cells);
+    fillSection([&](RowList& list) {
+        for (const auto& candidate : report.candidates()) {
+            if (!candidate.isComplete())
+                break;
+            printRecord(list.next(), candidate);
+        }
+    });
 }
 
 } // namespace orvex

@@ -1,21 +1,16 @@
 #include "UTRAN/CCTRCHSIRMeasurement.h"
 
-#include "TextFormat.h"
-
 namespace orvex {
 
 namespace {
 
-DictionaryRef rowsOf(const LogCode_0xD00C::CompositeChannel& channel)
+void printRecord(Rows& row, const LogCode_0xD00C::CompositeChannel& channel)
 {
-    auto ratios = Array::make();
-    for (std::size_t i = 0; i < LogCode_0xD00C::CompositeChannel::kSIRCount; ++i)
-        ratios->append(text("%d", channel.sir(i)));
-    Rows row = Rows::make();
     row.print("CCTRCH ID", "%d", channel.identity());
     row.print("TSNUM", "%d", channel.timeSlotNumber());
-    row.set("SIR", ratios);
-    return row.dictionary();
+    RowList ratios(row.list("SIR"));
+    for (std::size_t i = 0; i < LogCode_0xD00C::CompositeChannel::kSIRCount; ++i)
+        ratios.append(LateText(PrintfFormat<int>("%d"), channel.sir(i)));
 }
 
 } // namespace
@@ -28,7 +23,7 @@ CCTRCHSIRMeasurement::CCTRCHSIRMeasurement(ClassDictionary& dict, CodeDictionary
 
 void CCTRCHSIRMeasurement::update(const LogCode_0xD00C& report)
 {
-    refillSection(report.compositeChannels(), rowsOf);
+    refillSection(report.compositeChannels(), printRecord);
 }
 
 } // namespace orvex

@@ -4,9 +4,8 @@ namespace orvex {
 
 namespace {
 
-DictionaryRef rowsOf(const LogCode_0xD00E::GSMNeighbor& neighbor)
+void printRecord(Rows& row, const LogCode_0xD00E::GSMNeighbor& neighbor)
 {
-    Rows row = Rows::make();
     row.print("Cell ID", "%d", neighbor.cellIdentity());
     row.print("Band Indicator", "%d", neighbor.bandIndicator());
     row.print("BSIC Valid", "%d", neighbor.bsicValid());
@@ -14,7 +13,6 @@ DictionaryRef rowsOf(const LogCode_0xD00E::GSMNeighbor& neighbor)
     row.print("BCC", "%d", neighbor.bcc());
     row.print("ARFCN", "%d", neighbor.arfcn());
     row.print("RSSI", "%d", neighbor.rssi());
-    return row.dictionary();
 }
 
 } // namespace
@@ -28,10 +26,8 @@ GSMNeighbhorMeasurements::GSMNeighbhorMeasurements(ClassDictionary& dict, CodeDi
 void GSMNeighbhorMeasurements::update(const LogCode_0xD00E& report)
 {
     clearSection();
-    Array cells;
-    for (const auto& neighbor : report.neighbors())
-        cells.append(rowsOf(neighbor));
-    // Not published: what one sees here has always been an empty list.
+    refill(nullptr, report.neighbors(),
+        printRecord); // to nowhere: what one sees here has always been an empty list
 }
 
 } // namespace orvex

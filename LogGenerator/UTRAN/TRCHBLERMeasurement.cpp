@@ -4,12 +4,10 @@ namespace orvex {
 
 namespace {
 
-DictionaryRef rowsOf(const LogCode_0xD00C::TransportChannel& channel)
+void printRecord(Rows& row, const LogCode_0xD00C::TransportChannel& channel)
 {
-    Rows row = Rows::make();
     row.print("TRCH ID", "%d", channel.identity());
     row.print("TRCH BLER Measurement", "%d", channel.blockErrorRate());
-    return row.dictionary();
 }
 
 } // namespace
@@ -22,7 +20,7 @@ TRCHBLERMeasurement::TRCHBLERMeasurement(ClassDictionary& dict, CodeDictionary& 
 
 void TRCHBLERMeasurement::update(const LogCode_0xD00C& report)
 {
-    refillSection(report.transportChannels(), rowsOf);
+    refillSection(report.transportChannels(), printRecord);
 }
 
 } // namespace orvex

@@ -8,16 +8,14 @@ namespace {
 
 constexpr EnumText kStatuses[] = {{0, "ASET"}, {1, "MSET"}, {2, "DSET"}};
 
-DictionaryRef rowsOf(const LogCode_0xD00A::Neighbor& neighbor)
+void printRecord(Rows& row, const LogCode_0xD00A::Neighbor& neighbor)
 {
-    Rows row = Rows::make();
     row.print("UARFCN", "%d", neighbor.uarfcn());
     row.print("Cell ID", "%d", neighbor.cellIdentity());
     row.print("Filter RSCP", "%f", neighbor.filteredRSCP());
     if (const char* status = textFor(neighbor.status(), kStatuses, nullptr))
         row.set("Status", status);
     row.set("inJDCS", neighbor.isInJDCS() ? "TRUE" : "FALSE");
-    return row.dictionary();
 }
 
 } // namespace
@@ -30,7 +28,7 @@ UTRANNeighbhorMeasurements::UTRANNeighbhorMeasurements(ClassDictionary& dict, Co
 
 void UTRANNeighbhorMeasurements::update(const LogCode_0xD00A& report)
 {
-    refillSection(report.neighbors(), rowsOf);
+    refillSection(report.neighbors(), printRecord);
 }
 
 } // namespace orvex

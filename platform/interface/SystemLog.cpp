@@ -6,30 +6,19 @@
 
 namespace orvex {
 
-namespace {
-SystemLog* theSink = nullptr;
-} // namespace
-
 SystemLog* SystemLog::install(SystemLog* sink)
 {
-    return std::exchange(theSink, sink);
+    return std::exchange(_installed, sink);
 }
 
-SystemLog* SystemLog::installed()
+void writeLogLine(Priority priority, const char* format, ...)
 {
-    return theSink;
-}
-
-void systemLog(Priority priority, const char* format, ...)
-{
-    if (!theSink || !theSink->wants(priority))
-        return;
     std::string line;
     std::va_list arguments; // NOLINT(cppcoreguidelines-init-variables): va_start initialises it
     va_start(arguments, format);
     formatInto(line, format, arguments);
     va_end(arguments);
-    theSink->write(priority, line);
+    SystemLog::installed()->write(priority, line);
 }
 
 } // namespace orvex

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "PrintfFormat.h"
+
 #include <string_view>
 
 namespace orvex {
@@ -22,10 +24,28 @@ public:
 
     // Lines are dropped while no sink is installed. Returns the previous sink.
     static SystemLog* install(SystemLog* sink);
-    static SystemLog* installed();
+    static SystemLog* installed() { return _installed; }
+    static bool isRead(Priority priority) { return _installed && _installed->wants(priority); }
+
+private:
+    static inline SystemLog* _installed = nullptr;
 };
 
-// Writes one line, made by a printf format, to the installed sink.
-[[gnu::format(printf, 2, 3)]] void systemLog(Priority priority, const char* format, ...);
+// Writes one line to the sink that reads it.
+[[gnu::format(printf, 2, 3)]] void writeLogLine(Priority priority, const char* format, ...);
+
+// Writes one line, made by a printf format, to the installed sink. A line that nobody would read is not made:
+// sections tell of every packet.
+#pragma GCC diagnostic push
+#pragma GCC diagnostic ignored "-Wformat-nonliteral" // PrintfFormat has seen to it
+#pragma GCC diagnostic ignored "-Wformat-security"
+template <typename... Arguments>
+void systemLog(
+    Priority priority, PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
+{
+    if (SystemLog::isRead(priority))
+        writeLogLine(priority, format.text(), arguments...);
+}
+#pragma GCC diagnostic pop
 
 } // namespace orvex

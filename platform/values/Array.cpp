@@ -24,6 +24,23 @@ void Array::removeFirst(std::size_t count)
     _elements.erase(_elements.begin(), last);
 }
 
+Value& Array::appendSlot()
+{
+    if (_setAside.empty())
+        return _elements.emplace_back();
+    _elements.push_back(std::move(_setAside.back()));
+    _setAside.pop_back();
+    return _elements.back();
+}
+
+void Array::setAsideFrom(std::size_t index)
+{
+    while (_elements.size() > index) {
+        _setAside.push_back(std::move(_elements.back()));
+        _elements.pop_back();
+    }
+}
+
 ArrayRef Array::shallowCopy() const
 {
     auto copy = std::make_shared<Array>();

@@ -25,6 +25,12 @@ public:
     auto begin() const { return _elements.begin(); }
     auto end() const { return _elements.end(); }
 
+    // An element to be changed.
+    Value& slot(std::size_t index) { return _elements[index]; }
+    // One more element, for one who fills a list again and again: what was set aside last, else null.
+    Value& appendSlot();
+    // Removes the elements from the index on, and sets them aside for appendSlot().
+    void setAsideFrom(std::size_t index);
     void append(Value value) { _elements.push_back(std::move(value)); }
     void appendAll(const Array& other);
     void removeAll() { _elements.clear(); }
@@ -39,6 +45,7 @@ public:
 
 private:
     std::vector<Value> _elements;
+    std::vector<Value> _setAside; // not part of the list: a copy has none of it
 };
 
 } // namespace orvex

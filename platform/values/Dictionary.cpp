@@ -24,15 +24,22 @@ const Value& Dictionary::operator[](std::string_view key) const
 
 Value& Dictionary::slot(std::string_view key)
 {
-    const std::size_t position = find(key);
-    if (position != kNotFound)
-        return _entries[position].value;
-    _entries.push_back({std::string(key), {}});
-    if (!_index.empty())
-        _index.emplace(key, _entries.size() - 1);
-    else if (_entries.size() > kSearchedDirectly)
-        rebuildIndex();
-    return _entries.back().value;
+    std::size_t position = kNotFound;
+    return slot(key, position);
+}
+
+Value& Dictionary::slot(std::string_view key, std::size_t& position)
+{
+    position = find(key);
+    if (position == kNotFound) {
+        position = _entries.size();
+        _entries.push_back({std::string(key), {}});
+        if (!_index.empty())
+            _index.emplace(key, position);
+        else if (_entries.size() > kSearchedDirectly)
+            rebuildIndex();
+    }
+    return _entries[position].value;
 }
 
 void Dictionary::remove(std::string_view key)
@@ -41,6 +48,15 @@ void Dictionary::remove(std::string_view key)
     if (position == kNotFound)
         return;
     _entries.erase(_entries.begin() + static_cast<std::ptrdiff_t>(position));
+    if (!_index.empty())
+        rebuildIndex();
+}
+
+void Dictionary::removeFrom(std::size_t position)
+{
+    if (position >= _entries.size())
+        return;
+    _entries.erase(_entries.begin() + static_cast<std::ptrdiff_t>(position), _entries.end());
     if (!_index.empty())
         rebuildIndex();
 }

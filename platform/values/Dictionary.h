@@ -42,8 +42,18 @@ public:
     // The value to be written under the key, made at the end when there is none. The reference holds until
     // the next change of the dictionary.
     Value& slot(std::string_view key);
+    // The same, and where it is.
+    Value& slot(std::string_view key, std::size_t& position);
     void set(std::string_view key, Value value) { slot(key) = std::move(value); }
     void remove(std::string_view key);
+    // Removes all entries from the position on.
+    void removeFrom(std::size_t position);
+    // The value at the position, to be changed, when it is that key's; null otherwise.
+    Value* slotAt(std::size_t position, std::string_view key)
+    {
+        const bool isThere = position < _entries.size() && _entries[position].key == key;
+        return isThere ? &_entries[position].value : nullptr;
+    }
 
     DictionaryRef shallowCopy() const;
 

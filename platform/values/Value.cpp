@@ -5,15 +5,6 @@
 
 namespace orvex {
 
-namespace {
-template <typename Reference>
-Reference referenceIn(const auto& content)
-{
-    const auto* reference = std::get_if<Reference>(&content);
-    return reference ? *reference : nullptr;
-}
-} // namespace
-
 Value::Value(BytesRef data)
 {
     if (data)
@@ -30,19 +21,6 @@ Value::Value(DictionaryRef dictionary)
 {
     if (dictionary)
         _content = std::move(dictionary);
-}
-
-BytesRef Value::data() const
-{
-    return referenceIn<BytesRef>(_content);
-}
-ArrayRef Value::array() const
-{
-    return referenceIn<ArrayRef>(_content);
-}
-DictionaryRef Value::dictionary() const
-{
-    return referenceIn<DictionaryRef>(_content);
 }
 
 Value Value::shallowCopy() const
@@ -80,8 +58,14 @@ bool operator==(const Value& left, const Value& right)
     case Value::Kind::data: return *left.data() == *right.data();
     case Value::Kind::array: return *left.array() == *right.array();
     case Value::Kind::dictionary: return *left.dictionary() == *right.dictionary();
-    default: return left._content == right._content;
+    case Value::Kind::string: return *left.string() == *right.string();
+    case Value::Kind::null: return true;
+    case Value::Kind::integer: return *left.integer() == *right.integer();
+    case Value::Kind::real: return *left.real() == *right.real();
+    case Value::Kind::boolean: return *left.boolean() == *right.boolean();
+    case Value::Kind::date: return *left.date() == *right.date();
     }
+    return false;
 }
 
 const char* nameOf(Value::Kind kind)

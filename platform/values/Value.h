@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Date.h"
+#include "LateText.h"
 
 #include <concepts>
 #include <cstdint>
@@ -24,6 +25,9 @@ using BytesRef = std::shared_ptr<Bytes>;
 //
 // Scalars are held by value. Arrays, dictionaries and byte buffers are held by reference: copying a Value
 // that holds one shares it. A container of one's own is had from shallowCopy() and deepCopy() alone.
+//
+// A text may be given as a LateText. Nobody can tell: it is made by whoever reads it first. For its sake a
+// value is read by one thread at a time.
 class Value {
 public:
     enum class Kind { null, string, integer, real, boolean, date, data, array, dictionary };
@@ -39,6 +43,10 @@ public:
     }
     Value(const char* text)
         : _content(std::string(text))
+    {
+    }
+    Value(LateText text)
+        : _content(text)
     {
     }
     Value(std::same_as<bool> auto flag)
@@ -62,19 +70,34 @@ public:
     Value(ArrayRef array);
     Value(DictionaryRef dictionary);
 
-    Kind kind() const { return static_cast<Kind>(_content.index()); }
+    Kind kind() const
+    {
+        return std::holds_alternative<LateText>(_content) ? Kind::string
+                                                          : static_cast<Kind>(_content.index());
+    }
     bool isNull() const { return kind() == Kind::null; }
 
     // Each returns null when the value is of another kind.
-    const std::string* string() const { return std::get_if<std::string>(&_content); }
-    std::string* string() { return std::get_if<std::string>(&_content); }
+    const std::string* string() const
+    {
+        makeText();
+        return std::get_if<std::string>(&_content);
+    }
     const std::int64_t* integer() const { return std::get_if<std::int64_t>(&_content); }
     const double* real() const { return std::get_if<double>(&_content); }
     const bool* boolean() const { return std::get_if<bool>(&_content); }
     const Date* date() const { return std::get_if<Date>(&_content); }
-    BytesRef data() const;
-    ArrayRef array() const;
-    DictionaryRef dictionary() const;
+    BytesRef data() const { return reference<BytesRef>(); }
+    ArrayRef array() const { return reference<ArrayRef>(); }
+    DictionaryRef dictionary() const { return reference<DictionaryRef>(); }
+    // The same for a look, without a share in it.
+    Array* heldArray() const { return reference<ArrayRef>().get(); }
+    Dictionary* heldDictionary() const { return reference<DictionaryRef>().get(); }
+    // The container when this value alone holds it; null otherwise.
+    Array* ownArray() const { return own(reference<ArrayRef>()); }
+    Dictionary* ownDictionary() const { return own(reference<DictionaryRef>()); }
+
+    void set(LateText text) { _content.emplace<LateText>(text); }
 
     // A container of its own kind holding the same elements; any other value as it is.
     Value shallowCopy() const;
@@ -85,8 +108,27 @@ public:
     friend bool operator==(const Value& left, const Value& right);
 
 private:
-    std::variant<std::monostate, std::string, std::int64_t, double, bool, Date, BytesRef, ArrayRef,
-        DictionaryRef>
+    template <typename Reference>
+    const Reference& reference() const
+    {
+        static const Reference kNone;
+        const auto* held = std::get_if<Reference>(&_content);
+        return held ? *held : kNone;
+    }
+    template <typename Container>
+    static Container* own(const std::shared_ptr<Container>& reference)
+    {
+        return reference.use_count() == 1 ? reference.get() : nullptr;
+    }
+    void makeText() const
+    {
+        if (const auto* late = std::get_if<LateText>(&_content))
+            _content = late->text();
+    }
+
+    // In the order of Kind.
+    mutable std::variant<std::monostate, std::string, std::int64_t, double, bool, Date, BytesRef, ArrayRef,
+        DictionaryRef, LateText>
         _content;
 };
 

@@ -1,0 +1,75 @@
+#pragma once
+
+#include "PrintfFormat.h"
+#include "TextFormat.h"
+
+#include <array>
+#include <cstdint>
+#include <cstring>
+#include <utility>
+
+namespace orvex {
+
+// A text that is made when somebody reads it. A modem tells its values hundreds of times between two looks at
+// the screen; the numbers are taken each time, the digits only once.
+//
+// Holds a printf format and up to two arguments. What a const char* points to, the format included, has to
+// live as long as the program: a literal, a table's text.
+class LateText {
+public:
+    static constexpr std::size_t kMaximumArguments = 2;
+
+    // The text as it stands.
+    explicit LateText(const char* text)
+        : _format(text)
+        , _print([](const LateText& late) { return std::string(late._format); })
+    {
+    }
+    template <typename... Arguments>
+    explicit LateText(PrintfFormat<Arguments...> format, Arguments... arguments)
+        : _format(format.text())
+        , _print(&printed<PrintfArgument<Arguments>...>)
+    {
+        static_assert(sizeof...(Arguments) <= kMaximumArguments);
+        std::uint64_t* slot = _arguments.data();
+        (store(*slot++, static_cast<PrintfArgument<Arguments>>(arguments)), ...);
+    }
+
+    std::string text() const { return _print(*this); }
+
+private:
+    template <typename T>
+    static void store(std::uint64_t& slot, T argument)
+    {
+        static_assert(sizeof argument <= sizeof slot);
+        std::memcpy(&slot, &argument, sizeof argument);
+    }
+    template <typename T>
+    T argument(std::size_t index) const
+    {
+        T result;
+        std::memcpy(&result, &_arguments[index], sizeof result);
+        return result;
+    }
+    template <typename... Arguments>
+    static std::string printed(const LateText& late)
+    {
+        return late.printWith<Arguments...>(std::index_sequence_for<Arguments...>());
+    }
+    // The compiler has seen format and arguments fit when the text was given.
+#pragma GCC diagnostic push
+#pragma GCC diagnostic ignored "-Wformat-nonliteral"
+#pragma GCC diagnostic ignored "-Wformat-security"
+    template <typename... Arguments, std::size_t... index>
+    std::string printWith(std::index_sequence<index...>) const
+    {
+        return orvex::text(_format, argument<Arguments>(index)...);
+    }
+#pragma GCC diagnostic pop
+
+    const char* _format;
+    std::string (*_print)(const LateText&);
+    std::array<std::uint64_t, kMaximumArguments> _arguments;
+};
+
+} // namespace orvex

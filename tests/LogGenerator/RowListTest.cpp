@@ -1,0 +1,120 @@
+// Lists that are written anew into what they held: the result is that of a list made from nothing.
+
+#include "RowList.h"
+
+#include <gtest/gtest.h>
+
+namespace orvex {
+namespace {
+
+using Records = std::vector<std::vector<std::pair<const char*, int>>>; // rows of each record
+
+void fill(Array& list, const Records& records)
+{
+    RowList rows(&list);
+    for (const auto& record : records) {
+        Rows& row = rows.next();
+        for (const auto& [name, number] : record)
+            row.print(name, "%d", number);
+    }
+}
+
+// In their order, as two dictionaries are equal in any.
+std::string described(const Array& list)
+{
+    std::string result;
+    for (const Value& element : list) {
+        for (const auto& [name, value] : *element.dictionary())
+            result += name + "=" + *value.string() + " ";
+        result += "| ";
+    }
+    return result;
+}
+
+TEST(RowListTest, HoldsWhatWasWrittenLast)
+{
+    const Records kSteps[] = {
+        {{{"A", 1}, {"B", 2}}, {{"A", 3}, {"B", 4}}},
+        {{{"A", 5}, {"B", 6}}, {{"A", 7}, {"B", 8}}, {{"A", 9}, {"B", 0}}}, // longer
+        {{{"A", 1}}},                                                       // shorter, with fewer rows
+        {},
+        {{{"A", 1}, {"B", 2}, {"C", 3}}, {{"A", 4}}},
+        {{{"B", 1}, {"A", 2}, {"C", 3}}, {{"B", 4}, {"A", 5}}}, // another order
+        {{{"A", 1}, {"C", 2}}, {{"D", 3}}},                     // a row left out, another row
+        {{{"A", 1}, {"B", 2}, {"A", 3}, {"C", 4}}},             // a row set twice keeps its place
+        {{{"A", 1}, {"B", 2}, {"C", 3}}},
+    };
+    Array list;
+    for (const Records& step : kSteps) {
+        fill(list, step);
+        Array fromNothing;
+        fill(fromNothing, step);
+        EXPECT_EQ(described(list), described(fromNothing));
+    }
+    EXPECT_EQ(described(list), "A=1 B=2 C=3 | ");
+}
+
+TEST(RowListTest, RemovedRowsAreGone)
+{
+    Array list;
+    for (int i = 0; i < 2; ++i) {
+        RowList rows(&list);
+        Rows& row = rows.next();
+        row.set("A", "1");
+        row.set("B", "2");
+        row.remove("A");
+        row.set("C", "3");
+    }
+    EXPECT_EQ(described(list), "B=2 C=3 | ");
+}
+
+TEST(RowListTest, LeavesWhatSomebodyElseHolds)
+{
+    Array list;
+    fill(list, {{{"A", 1}}});
+    const DictionaryRef kept = list[0].dictionary();
+    fill(list, {{{"A", 2}}});
+    EXPECT_EQ((*kept)["A"], Value("1"));
+    EXPECT_EQ(described(list), "A=2 | ");
+    fill(list, {});
+    fill(list, {{{"A", 3}}});
+    EXPECT_EQ((*kept)["A"], Value("1"));
+}
+
+TEST(RowListTest, ReplacesElementsOfAnotherKind)
+{
+    Array list({"text", 7, Dictionary::make({{"Z", "1"}})});
+    fill(list, {{{"A", 1}}, {{"A", 2}}, {{"A", 3}}});
+    EXPECT_EQ(described(list), "A=1 | A=2 | A=3 | ");
+}
+
+TEST(RowsTest, KeepsTheOthersAndTheirOrder)
+{
+    const auto dictionary = Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}});
+    {
+        Rows rows(dictionary);
+        rows.print("C", "%d", 30);
+        rows.print("A", "%d", 10);
+        rows.set("D", "40");
+    }
+    EXPECT_EQ(described(Array({dictionary})), "A=10 B=2 C=30 D=40 | ");
+    Rows nothing{DictionaryRef()};
+    nothing.print("A", "%d", 1);
+    EXPECT_FALSE(nothing.list("L"));
+}
+
+TEST(RowsTest, AListInARowIsFilledAgain)
+{
+    const auto dictionary = Dictionary::make({{"L", "no list yet"}});
+    for (const int number : {1, 2}) {
+        Rows rows(dictionary);
+        fill(*rows.list("L"), {{{"A", number}}});
+    }
+    EXPECT_EQ(described(*(*dictionary)["L"].array()), "A=2 | ");
+    const ArrayRef kept = (*dictionary)["L"].array();
+    fill(*Rows(dictionary).list("L"), {{{"A", 3}}});
+    EXPECT_EQ(described(*kept), "A=2 | ");
+}
+
+} // namespace
+} // namespace orvex
