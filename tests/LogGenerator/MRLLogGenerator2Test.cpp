@@ -2,7 +2,7 @@
 
 #include "FixedClock.h"
 #include "FixedResources.h"
-#include "LogPackets.h"
+#include "PacketText.h"
 #include "RecordingLog.h"
 
 #include <gmock/gmock.h>
@@ -135,7 +135,7 @@ TEST_F(MRLLogGenerator2Test, SectionIsBoundToTheEntryProcessedLast)
         {"First", Dictionary::make({{"First", Dictionary::make()}})}, // the inner one is processed before
     });
     const auto generator = makeGenerator();
-    generator->updateState(state, packet(0x4116, {}));
+    generator->updateState(state, packet(0x4116, Bytes()));
     const auto display = state["Display"].dictionary();
     EXPECT_TRUE((*display)["First"].dictionary()->contains("Packet"));
     EXPECT_FALSE((*(*display)["First"].dictionary())["First"].dictionary()->contains("Packet"));
@@ -146,7 +146,7 @@ TEST_F(MRLLogGenerator2Test, EntryOfTheWrongKindDropsItsRows)
 {
     resources.templates["Probe"] = Dictionary::make({{"First", Array::make()}, {"Second", "text"}});
     const auto generator = makeGenerator();
-    generator->updateState(state, packet(0x4116, {}));
+    generator->updateState(state, packet(0x4116, Bytes()));
     EXPECT_EQ(*state["Display"].dictionary(), *resources.templates["Probe"]);
 }
 
@@ -154,14 +154,14 @@ TEST_F(MRLLogGenerator2Test, MissingTemplateIsTriedAgainAtEveryCall)
 {
     const auto generator = makeGenerator("Other");
     RecordingLog log;
-    generator->updateState(state, packet(0x4116, {}));
+    generator->updateState(state, packet(0x4116, Bytes()));
     EXPECT_TRUE(generator->generateLogUsingState(state).isNull());
     EXPECT_EQ(
         log.take(), (Lines{"<3>Cannot load template for display", "<3>Cannot load template for display"}));
     EXPECT_TRUE(state["Display"].isNull());
 
     resources.templates["Other"] = Dictionary::make({{"First", Dictionary::make()}});
-    generator->updateState(state, packet(0x4116, {}));
+    generator->updateState(state, packet(0x4116, Bytes()));
     EXPECT_EQ(shown("First"), "16662: 13 bytes");
 }
 
@@ -192,7 +192,7 @@ TEST_F(MRLLogGenerator2Test, StartCommandAsksForTheCodesOfTheSections)
 
 TEST_F(MRLLogGenerator2Test, SuccessorWritesIntoTheDisplayThatIsThere)
 {
-    makeGenerator()->updateState(state, packet(0x4116, {}));
+    makeGenerator()->updateState(state, packet(0x4116, Bytes()));
     const auto display = state["Display"].dictionary();
     const auto successor = makeGenerator();
     successor->updateState(state, packet(0x4116, {1, 2}));
@@ -203,16 +203,16 @@ TEST_F(MRLLogGenerator2Test, SuccessorWritesIntoTheDisplayThatIsThere)
 
 TEST_F(MRLLogGenerator2Test, SuccessorOfAnotherTechnologyLaysOutItsOwnDisplay)
 {
-    makeGenerator()->updateState(state, packet(0x4116, {}));
+    makeGenerator()->updateState(state, packet(0x4116, Bytes()));
     resources.templates["Other"] = Dictionary::make({{"Second", Dictionary::make()}});
-    makeGenerator("Other")->updateState(state, packet(0x4116, {}));
+    makeGenerator("Other")->updateState(state, packet(0x4116, Bytes()));
     EXPECT_FALSE(state["Display"].dictionary()->contains("First"));
     EXPECT_EQ(shown("Second"), "16662: 13 bytes");
 }
 
 TEST_F(MRLLogGenerator2Test, SuccessorWithoutItsTemplateLeavesTheDisplayToTheNext)
 {
-    makeGenerator()->updateState(state, packet(0x4116, {}));
+    makeGenerator()->updateState(state, packet(0x4116, Bytes()));
     const auto display = state["Display"].dictionary();
     EXPECT_TRUE(makeGenerator("Other")->generateLogUsingState(state).isNull());
     makeGenerator()->updateState(state, packet(0x4116, {1, 2}));
@@ -223,7 +223,7 @@ TEST_F(MRLLogGenerator2Test, SuccessorWithoutItsTemplateLeavesTheDisplayToTheNex
 TEST_F(MRLLogGenerator2Test, DisplayWithoutATemplateIsNotItsOwn)
 {
     state.set("Display", Dictionary::make({{"Foreign", "x"}}));
-    makeGenerator()->updateState(state, packet(0x4116, {}));
+    makeGenerator()->updateState(state, packet(0x4116, Bytes()));
     EXPECT_EQ(shown("First"), "16662: 13 bytes");
 }
 
@@ -236,18 +236,6 @@ TEST_F(MRLLogGenerator2Test, TellsOfTheDisplayThatItBuilds)
         testing::ElementsAre(
             testing::MatchesRegex("<4>Initialized class index: 0x[0-9a-f]+, Self: 0x[0-9a-f]+"),
             "<4>Dictionary = 1", "<4>String = 0", "<4>First", "<4>Second"));
-}
-
-TEST_F(MRLLogGenerator2Test, TellsOfItsBirthAndItsEnd)
-{
-    RecordingLog log;
-    makeGenerator();
-    using testing::StartsWith;
-    EXPECT_THAT(log.take(),
-        testing::ElementsAre("<4>Array Count: 2", "<4>Array Count: 1",
-            StartsWith("<3>Creating MRLLogGenerator2 object with 0x"),
-            StartsWith("<4>Creating Log object: 0x"), "<3>Class Index: 1",
-            StartsWith("<4>MRL_GSMLogGenerator is destructed 0x")));
 }
 
 } // namespace

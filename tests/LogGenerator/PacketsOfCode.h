@@ -3,7 +3,7 @@
 #include "PropertyList.h"
 #include "ScenarioItems.h"
 
-#include "LogPackets.h"
+#include "PacketText.h"
 
 #include <algorithm>
 #include <functional>

@@ -5,7 +5,7 @@
 #include "FakeTelephony.h"
 #include "FixedClock.h"
 #include "FixedResources.h"
-#include "LogPackets.h"
+#include "PacketText.h"
 #include "ManualRunLoop.h"
 
 #include "Array.h"

@@ -3,7 +3,7 @@
 #include "FakeTelephony.h"
 #include "FixedClock.h"
 #include "FixedResources.h"
-#include "LogPackets.h"
+#include "PacketText.h"
 #include "ManualRunLoop.h"
 #include "RecordingLog.h"
 

@@ -5,8 +5,11 @@
 
 #include "FixedClock.h"
 #include "FixedResources.h"
-#include "LogPackets.h"
-#include "SectionFixture.h"
+#include "PacketText.h"
+#include "RecordingLog.h"
+#include "Shown.h"
+
+#include <gtest/gtest.h>
 
 namespace orvex::test {
 
@@ -36,19 +39,25 @@ public:
             Publisher::addRow(*_lookup, key, key, display);
     }
     void feed(const Bytes& packet) { generator.updateFromLog(packet, _lookup, state); }
-    // Of this packet alone.
-    RowTexts rowsAfter(const Bytes& packet)
+    // Of this packet alone, as packetOfText() reads it: all rows, or one.
+    std::string shownAfter(const std::string& packet)
     {
         clear();
-        feed(packet);
-        return rowsOf(display);
+        feed(packetOfText(packet));
+        return shown(*display);
     }
-    std::string textAfter(const Bytes& packet, const char* key) { return textOf(rowsAfter(packet), key); }
-    RowTexts listAfter(const Bytes& packet, const char* key)
+    std::string textAfter(const std::string& packet, const char* key)
     {
-        clear();
-        feed(packet);
-        return rowsOf((*display)[key].dictionary());
+        shownAfter(packet);
+        return display->contains(key) ? shown((*display)[key]) : "(absent)";
+    }
+    // What the log says of the packets since the last call.
+    std::string linesNow()
+    {
+        std::string result;
+        for (const std::string& line : log.take())
+            result += line;
+        return result;
     }
 
     RecordingLog log;
@@ -61,24 +70,5 @@ public:
 private:
     DictionaryRef _lookup;
 };
-
-// A subpacket with this body behind its header, and the size that it has, or another.
-inline Bytes subpacket(std::uint8_t id, const Bytes& body, int size = -1)
-{
-    const auto length = static_cast<unsigned>(size < 0 ? static_cast<int>(body.size() + 4) : size);
-    Bytes result = {id, 0xEE, static_cast<std::uint8_t>(length), static_cast<std::uint8_t>(length >> 8)};
-    result.insert(result.end(), body.begin(), body.end());
-    return result;
-}
-
-// A packet of subpackets with their count, or another.
-inline Bytes packetOf(LogCode code, const std::vector<Bytes>& subpackets, int count = -1)
-{
-    Bytes payload = {
-        0xEE, static_cast<std::uint8_t>(count < 0 ? static_cast<int>(subpackets.size()) : count), 0xEE, 0xEE};
-    for (const Bytes& bytes : subpackets)
-        payload.insert(payload.end(), bytes.begin(), bytes.end());
-    return packet(code, payload);
-}
 
 } // namespace orvex::test

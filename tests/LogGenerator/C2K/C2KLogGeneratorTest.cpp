@@ -3,7 +3,9 @@
 #include "GSM/GSMLogGenerator.h"
 #include "MRLLogGenerator2.h"
 
-#include <gmock/gmock.h>
+#include "FileResources.h"
+
+#include <gtest/gtest.h>
 
 namespace orvex::test {
 namespace {
@@ -26,48 +28,21 @@ const struct {
     {0x134F, 171, "must be at least 171"},
 };
 
-// A packet whose counts and sizes claim as much as they can, or little, so that walks go on to the end.
-Bytes lyingPacket(LogCode code, std::size_t length, std::uint8_t filling)
-{
-    Bytes bytes = packet(code, Bytes(2000, filling));
-    bytes.resize(length);
-    return bytes;
-}
-
 TEST(C2KDecoders, RefuseShortPackets)
 {
     C2KFixture fixture;
     for (const auto& [code, minimumLength, complaint] : kLengths) {
-        for (std::size_t length = 13; length < minimumLength; ++length) {
-            EXPECT_EQ(fixture.rowsAfter(lyingPacket(code, length, 0)), RowTexts{});
-            EXPECT_EQ(fixture.log.take(),
-                Lines{text("<3>Log code 0x%x is %zu bytes long but %s bytes.", static_cast<unsigned>(code),
-                    length, complaint)});
+        for (const std::size_t length : {kPacketHeaderLength, minimumLength - 1}) {
+            fixture.clear();
+            fixture.feed(packet(code, Bytes(length - kPacketHeaderLength)));
+            EXPECT_TRUE(fixture.display->isEmpty());
+            EXPECT_EQ(fixture.linesNow(),
+                text("<3>Log code 0x%x is %zu bytes long but %s bytes.", static_cast<unsigned>(code), length,
+                    complaint));
         }
-        fixture.feed(lyingPacket(code, minimumLength, 0));
-        for (const std::string& line : fixture.log.take())
-            EXPECT_THAT(line, testing::Not(testing::HasSubstr("bytes long"))) << minimumLength;
+        fixture.feed(packet(code, Bytes(minimumLength - kPacketHeaderLength)));
+        EXPECT_EQ(fixture.linesNow().find("bytes long"), std::string::npos) << minimumLength;
     }
-}
-
-// Under the address sanitizer no read may leave the packet, whatever its counts claim.
-TEST(C2KDecoders, StayWithinThePacket)
-{
-    C2KFixture fixture;
-    const Bytes nested = packetOf(0x119C,
-        {subpacket(1, {8}, 5), subpacket(2, Bytes(10, 1)), subpacket(4, {}),
-            subpacket(3, Bytes(60, 0xFF), 8)},
-        255);
-    for (std::size_t length = 0; length <= nested.size(); ++length) {
-        fixture.clear();
-        fixture.feed(Bytes(nested.begin(), nested.begin() + static_cast<std::ptrdiff_t>(length)));
-        for (const auto& [code, minimumLength, complaint] : kLengths) {
-            for (const auto filling : Bytes{0x01, 0x0B, 0xFF})
-                fixture.feed(lyingPacket(code, minimumLength + length, filling));
-        }
-    }
-    EXPECT_EQ(textOf(rowsOf(fixture.display), "k1xDeviceState"), "Traffic [8]")
-        << "the walk went all the way";
 }
 
 class C2KLogGeneratorTest : public testing::Test {
@@ -94,10 +69,11 @@ public:
     }
     GeneratorEnvironment environment() const { return {resources, clock, {}}; }
 
-    RowTexts section(const char* name) const
+    std::string section(const char* name) const
     {
         const auto display = state["Display"].dictionary();
-        return display ? rowsOf((*display)[name].dictionary()) : RowTexts();
+        const auto rows = display ? (*display)[name].dictionary() : nullptr;
+        return rows ? shown(*rows) : "";
     }
 
     FixedResources resources;
@@ -108,7 +84,7 @@ public:
 // A system identity packet: system 258 of a network whose protocol revision this is.
 Bytes identity(std::uint8_t revision)
 {
-    return packetWith(0x134F, 171, {{13, {2}}, {46, {2, 0, 0, 0, 0x02, 0x01}}, {133, {revision}}});
+    return packetOfText(text("134F: 02 @46 02000000 0201 @133 %02X @171", revision));
 }
 
 TEST_F(C2KLogGeneratorTest, ShowsAValueInEveryRowThatNamesItsKey)
@@ -118,16 +94,13 @@ TEST_F(C2KLogGeneratorTest, ShowsAValueInEveryRowThatNamesItsKey)
     const auto display = generator->generateLogUsingState(state).dictionary();
     EXPECT_EQ(log.take(), Lines(4, "<4>Processing the template")) << "once a dictionary";
     ASSERT_NE(display, nullptr) << "at once";
-    EXPECT_EQ(section("Identity"), (RowTexts{{"SID", ""}, {"Revision", ""}}));
+    EXPECT_EQ(section("Identity"), "SID=, Revision=");
     EXPECT_EQ(state["ExtraInfo"], Value(Dictionary::make())) << "for counters";
 
     generator->updateState(state, identity(7));
     EXPECT_EQ(generator->generateLogUsingState(state).dictionary(), display);
-    EXPECT_EQ(section("Identity"), (RowTexts{{"SID", "258"}, {"Revision", "7"}}));
-    EXPECT_EQ(
-        section("Copies"), (RowTexts{{"_sorted", "_sorted"}, {"1;SID", "258"}, {"Deep", "(dictionary)"}}));
-    EXPECT_EQ(*(*(*display)["Copies"].dictionary())["Deep"].dictionary(),
-        Dictionary({{"SID", "258"}, {"Mark", "_sorted"}}));
+    EXPECT_EQ(section("Identity"), "SID=258, Revision=7");
+    EXPECT_EQ(section("Copies"), "_sorted=_sorted, 1;SID=258, Deep={SID=258, Mark=_sorted}");
     EXPECT_EQ(log.take(), Lines{});
     EXPECT_EQ(*state["Template"].dictionary(), *resources.templates["C2KTemplate"]);
 }
@@ -147,7 +120,7 @@ TEST(Publisher, EndsAtADamagedEntry)
         publisher.publish("k", "value");
         publisher.publish("text", "value");
         publisher.publish("absent", "value");
-        EXPECT_EQ(rowsOf(first), (RowTexts{{"row", "value"}}));
+        EXPECT_EQ(*first, Dictionary({{"row", "value"}}));
         EXPECT_TRUE(second->isEmpty());
     }
     Publisher(nullptr).publish("k", "value");
@@ -155,6 +128,8 @@ TEST(Publisher, EndsAtADamagedEntry)
 
 TEST_F(C2KLogGeneratorTest, FramesAndKeepsWhatReachesADecoder)
 {
+    const char* const decoded = "SID=258, Revision=7";
+    const char* const untouched = "SID=, Revision=";
     const Bytes plain = identity(7);
     const auto typed = [&plain](std::uint8_t type) {
         Bytes bytes = plain;
@@ -163,35 +138,36 @@ TEST_F(C2KLogGeneratorTest, FramesAndKeepsWhatReachesADecoder)
     };
     Bytes prefixed = {0x81, 0};
     prefixed.insert(prefixed.end(), plain.begin(), plain.end());
-    const Bytes tooShort = packet(0x1183, {});
+    const Bytes tooShort = packetOfText("1183: ");
     const Bytes prefixedHeader = {0x81, 0, 1, 0, 0, 0x83, 0x11, 0, 0, 0, 0, 0, 0};
     const struct {
         const char* name;
         Bytes message;
-        const char* revision;
+        const char* shownIdentity;
         Bytes kept;
         Lines lines;
     } cases[] = {
-        {"plain", plain, "7", plain, {}},
-        {"prefixed", prefixed, "7", plain, {}},
-        {"type 2 is decoded all the same", typed(2), "7", typed(2), {"<3>Invalid log type: 2. Dropping."}},
-        {"extra packet", typed(0xFF), "", {}, {"<3>Invalid log type: ff. Dropping."}},
-        {"another code", packet(0x1184, Bytes(200)), "", {}, {}},
-        {"12 bytes", Bytes(tooShort.begin(), tooShort.end() - 1), "", {}, {}},
-        {"13 bytes are kept, though refused", tooShort, "", tooShort,
+        {"plain", plain, decoded, plain, {}},
+        {"prefixed", prefixed, decoded, plain, {}},
+        {"type 2 is decoded all the same", typed(2), decoded, typed(2),
+            {"<3>Invalid log type: 2. Dropping."}},
+        {"extra packet", typed(0xFF), untouched, {}, {"<3>Invalid log type: ff. Dropping."}},
+        {"another code", packet(0x1184, Bytes(200)), untouched, {}, {}},
+        {"12 bytes", Bytes(tooShort.begin(), tooShort.end() - 1), untouched, {}, {}},
+        {"13 bytes are kept, though refused", tooShort, untouched, tooShort,
             {"<3>Log code 0x1183 is 13 bytes long but should be 50 bytes."}},
-        {"13 bytes with the prefix", prefixedHeader, "",
+        {"13 bytes with the prefix", prefixedHeader, untouched,
             Bytes(prefixedHeader.begin() + 2, prefixedHeader.end()),
             {"<3>Log code 0x1183 is 11 bytes long but should be 50 bytes."}},
     };
-    for (const auto& [name, message, revision, kept, lines] : cases) {
+    for (const auto& [name, message, shownIdentity, kept, lines] : cases) {
         const auto generator = makeGenerator();
         state.remove("Display");
         generator->generateLogUsingState(state);
         RecordingLog log;
         generator->updateState(state, message);
         EXPECT_EQ(log.take(), lines) << name;
-        EXPECT_EQ(textOf(section("Identity"), "Revision"), revision) << name;
+        EXPECT_EQ(section("Identity"), shownIdentity) << name;
         generator->updateState(state, message);
         generator->generateLogUsingState(state);
         Bytes twice = kept;
@@ -220,7 +196,7 @@ TEST_F(C2KLogGeneratorTest, MissingTemplateIsTriedAgainAtEveryCall)
     EXPECT_NE(C2KLogGenerator::getDisplayFromState(laidOut, resources), nullptr) << "that of the state";
     resources.templates["C2KTemplate"] = skeleton;
     generator->updateState(state, identity(8));
-    EXPECT_EQ(textOf(section("Identity"), "Revision"), "8");
+    EXPECT_EQ(section("Identity"), "SID=258, Revision=8");
 }
 
 TEST_F(C2KLogGeneratorTest, SuccessorWritesIntoTheDisplayThatIsThere)
@@ -231,7 +207,7 @@ TEST_F(C2KLogGeneratorTest, SuccessorWritesIntoTheDisplayThatIsThere)
     EXPECT_EQ(successor->generateLogUsingState(state).dictionary(), display);
     successor->updateState(state, identity(8));
     EXPECT_EQ(state["Display"].dictionary(), display);
-    EXPECT_EQ(textOf(section("Identity"), "Revision"), "8");
+    EXPECT_EQ(section("Identity"), "SID=258, Revision=8");
 }
 
 TEST_F(C2KLogGeneratorTest, TechnologiesTakeTurnsOnOneState)
@@ -242,13 +218,13 @@ TEST_F(C2KLogGeneratorTest, TechnologiesTakeTurnsOnOneState)
         const std::string list = "<plist version=\"1.0\"><dict><key>A</key><string>x</string></dict></plist>";
         if (turn == 'C') {
             makeGenerator()->updateState(state, identity(7));
-            EXPECT_EQ(section("Identity"), (RowTexts{{"SID", "258"}, {"Revision", "7"}}));
+            EXPECT_EQ(section("Identity"), "SID=258, Revision=7");
         } else if (turn == 'O') {
             makeOther()->updateState(state, identity(7));
-            EXPECT_EQ(rowsOf(state["Display"].dictionary()), (RowTexts{{"Section", "text"}}));
+            EXPECT_EQ(state["Display"], resources.templates["Other"]);
         } else {
             GSMLogGenerator(environment()).updateState(state, Bytes(list.begin(), list.end()));
-            EXPECT_EQ(rowsOf(state["Display"].dictionary()), (RowTexts{{"A", "x"}}));
+            EXPECT_EQ(state["Display"], Value(Dictionary::make({{"A", "x"}})));
         }
     }
 }
@@ -258,6 +234,35 @@ TEST_F(C2KLogGeneratorTest, StartCommandAsksForTheCodesOfTheDecoders)
     EXPECT_EQ(*makeGenerator()->getStartCommand(),
         Dictionary({{"SetState", "Streaming"},
             {"SetMarlinLogCodes", Array::make({4234, 4483, 4498, 4790, 4508, 4509, 4734, 4943})}}));
+}
+
+// The texts of a template of texts and dictionaries.
+void collectTexts(const Dictionary& dictionary, std::set<std::string>& texts)
+{
+    for (const auto& entry : dictionary) {
+        if (const auto section = entry.value.dictionary())
+            collectTexts(*section, texts);
+        else
+            texts.insert(*entry.value.string());
+    }
+}
+
+TEST(C2KTemplate, NamesTheKeysThatTheDecodersPublish)
+{
+    const FileResources files(ORVEX_SOURCE_DIR "/resources");
+    std::set<std::string> named;
+    collectTexts(*files.dictionaryNamed("C2KTemplate"), named);
+    EXPECT_EQ(named, (std::set<std::string>(kInternalKeys.begin(), kInternalKeys.end())));
+
+    C2KFixture fixture;
+    for (const char* bytes : {"1183: 00*37", "12B6: 00*12", "108A: 00*10", "134F: 02*173", "1192: 00*228",
+             "127E: 00*1737", "119D: EE 01 EE EE 0B EE 2200 01*30",
+             "119C: EE 04 EE EE 01 EE 2200 01*30 02 EE 2200 01*30 03 EE 2200 01*30 04 EE 0400"})
+        fixture.feed(packetOfText(bytes));
+    std::set<std::string> published;
+    for (const auto& row : *fixture.display)
+        published.insert(row.key);
+    EXPECT_EQ(published, named) << "each has its decoder";
 }
 
 } // namespace

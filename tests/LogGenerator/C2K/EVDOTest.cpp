@@ -5,41 +5,32 @@
 namespace orvex::test {
 namespace {
 
-using Lines = std::vector<std::string>;
-
-// EV-DO status with these bytes of channel and band class, states, and PN offset.
-Bytes statusPacket(Bytes channel, std::uint8_t deviceState, std::uint8_t sessionState = 4,
-    Bytes pnOffset = {0x10, 0x00}, std::size_t length = 50)
+// EV-DO status of this channel and band class, state, and PN offset.
+std::string statusOf(const char* channel, int deviceState, const char* offset = "1000", int session = 4)
 {
-    return packetWith(0x1183, length,
-        {{13, channel}, {15, {0x80, 0xFB, 0xF4}}, {18, pnOffset}, {36, {deviceState, sessionState}},
-            {38, {0x0A, 0xBC, 0x03, 200}}});
+    return text("1183: %s 80 FB F4 %s @36 %02X %02X 0ABC03 C8 @50", channel, offset, deviceState, session);
 }
 
 TEST(EVDOStatus, ReadsEachFieldFromItsOwnBits)
 {
     C2KFixture fixture;
-    EXPECT_EQ(fixture.rowsAfter(statusPacket({0x34, 0x4D}, 4)),
-        (RowTexts{{"kChannel", "1332"}, {"k1xEVDODeviceState", "Access [4]"},
-            {"kBandClass", "900 MHzband [9]"}, {"kRxAGC0", "-128 dBm"}, {"kRxAGC1", "-5 dBm"},
-            {"kTxAGC", "-12 dBm"}, {"kServingPNOffset", "16 × 64chips"}, {"kSessionState", "Open [4]"},
-            {"kUATI24", "0x03bc0a"}, {"kColorCode", "200"}}));
-    EXPECT_EQ(fixture.log.take(), Lines{});
-
-    Bytes strong = statusPacket({0, 0}, 4);
-    strong[15] = 127;
-    EXPECT_EQ(fixture.textAfter(strong, "kRxAGC0"), "+127 dBm");
-    EXPECT_EQ(fixture.textAfter(statusPacket({0xFF, 0x07}, 4), "kChannel"), "2047");
-    EXPECT_EQ(
-        fixture.textAfter(statusPacket({0, 0}, 4, 4, {0xFF, 0xFF}), "kServingPNOffset"), "Invalid Value");
-    EXPECT_EQ(
-        fixture.textAfter(statusPacket({0, 0}, 4, 4, {0xFE, 0xFF}), "kServingPNOffset"), "65534 × 64chips");
+    EXPECT_EQ(fixture.shownAfter(statusOf("344D", 4)),
+        "kChannel=1332, k1xEVDODeviceState=Access [4], kBandClass=900 MHzband [9], kRxAGC0=-128 dBm, "
+        "kRxAGC1=-5 dBm, kTxAGC=-12 dBm, kServingPNOffset=16 × 64chips, kSessionState=Open [4], "
+        "kUATI24=0x03bc0a, kColorCode=200");
+    EXPECT_EQ(fixture.textAfter("1183: 0000 7F @50", "kRxAGC0"), "+127 dBm");
+    EXPECT_EQ(fixture.textAfter(statusOf("FF07", 4), "kChannel"), "2047");
+    EXPECT_EQ(fixture.textAfter(statusOf("0000", 4, "FFFF"), "kServingPNOffset"), "Invalid Value");
+    EXPECT_EQ(fixture.textAfter(statusOf("0000", 4, "FEFF"), "kServingPNOffset"), "65534 × 64chips");
+    EXPECT_EQ(fixture.linesNow(), "");
+    EXPECT_EQ(fixture.shownAfter("1183: @51"), "");
+    EXPECT_EQ(fixture.linesNow(), "<3>Log code 0x1183 is 51 bytes long but should be 50 bytes.");
 }
 
 TEST(EVDOStatus, NamesStatesAndBandClasses)
 {
     const struct {
-        std::uint8_t value;
+        int value;
         const char* deviceState;
         const char* sessionState;
         const char* bandClass;
@@ -53,81 +44,50 @@ TEST(EVDOStatus, NamesStatesAndBandClasses)
         {6, "[Reserved 6]", "[Reserved 6]", "2GHz band [6]"},
         {12, "[Reserved 12]", "[Reserved 12]", "800 MHz European PAMR band [12]"},
         {13, "[Reserved 13]", "[Reserved 13]", "[Bad Value 13]"},
-        {31, "[Reserved 31]", "[Reserved 31]", "[Bad Value 31]"},
         {255, "[Reserved 255]", "[Reserved 255]", "[Bad Value 31]"},
     };
     C2KFixture fixture;
     for (const auto& [value, deviceState, sessionState, bandClass] : cases) {
-        const auto rows =
-            fixture.rowsAfter(statusPacket({0, static_cast<std::uint8_t>(value << 3 | 7)}, value, value));
-        EXPECT_EQ(textOf(rows, "k1xEVDODeviceState"), deviceState);
-        EXPECT_EQ(textOf(rows, "kSessionState"), sessionState);
-        EXPECT_EQ(textOf(rows, "kBandClass"), bandClass);
-        EXPECT_EQ(textOf(rows, "kRxAGC0"), "-128 dBm");
-        EXPECT_EQ(textOf(rows, "kRxAGC1"), value >= 4 ? "-5 dBm" : "N/A") << int{value};
-        EXPECT_EQ(textOf(rows, "kTxAGC"), value >= 4 ? "-12 dBm" : "N/A") << int{value};
+        const std::string channel = text("00%02X", (value << 3 | 7) & 255);
+        const char* receiver1 = value >= 4 ? "-5 dBm" : "N/A";
+        const char* transmitter = value >= 4 ? "-12 dBm" : "N/A";
+        EXPECT_EQ(fixture.shownAfter(statusOf(channel.c_str(), value, "1000", value)),
+            text("kChannel=1792, k1xEVDODeviceState=%s, kBandClass=%s, kRxAGC0=-128 dBm, kRxAGC1=%s, "
+                 "kTxAGC=%s, "
+                 "kServingPNOffset=16 × 64chips, kSessionState=%s, kUATI24=0x03bc0a, kColorCode=200",
+                deviceState, bandClass, receiver1, transmitter, sessionState));
     }
 }
 
-TEST(EVDOStatus, HasOneLength)
+TEST(EVDOLists, HoldPilotsAndBusyFingers)
 {
     C2KFixture fixture;
-    for (const std::size_t length : {13U, 49U, 51U}) {
-        EXPECT_EQ(fixture.rowsAfter(statusPacket({0, 0}, 4, 4, {0, 0}, length)), RowTexts{});
-        EXPECT_EQ(fixture.log.take(),
-            Lines{text("<3>Log code 0x1183 is %zu bytes long but should be 50 bytes.", length)});
+    const char* pilots = "kActiveSetPilots";
+    const char* fingers = "kFingerC2I";
+    const std::string fourPilots = "@25 0201 0002 @37 2C01 0000 @49 0201 0403 @61 FFFF FFFF ";
+    const std::string fourFingers = "@23 0201 @29 0102 @37 FFFF @51 2C01 @57 2C01 @65 FEFF @71 0000 ";
+    EXPECT_EQ(fixture.textAfter("12B6: @15 04 " + fourPilots + "@73", pilots),
+        "{_sorted=_sorted, 0;258=+0.00 dB, 1;300=-inf dB, 2;258=+1.78 dB, 3;65535=+21.07 dB}");
+    EXPECT_EQ(fixture.textAfter("12B6: @15 00 " + fourPilots + "@73", pilots), "(none)");
+    EXPECT_EQ(
+        fixture.textAfter("12B6: @15 01 " + fourPilots + "@37", pilots), "{_sorted=_sorted, 0;258=+0.00 dB}");
+    // The second finger is idle.
+    EXPECT_EQ(fixture.textAfter("108A: @22 04 " + fourFingers + "@79", fingers),
+        "{_sorted=_sorted, 0;258=+0.01 dB, 2;300=-2.32 dB, 3;65534=-inf dB}");
+    EXPECT_EQ(fixture.textAfter("108A: @22 00", fingers), "(none)");
+    EXPECT_EQ(fixture.textAfter("108A: @22 01 FFFF @37", fingers), "(none)");
+    EXPECT_EQ(fixture.linesNow(), "");
+
+    for (const auto& [count, length] : {std::pair(4, 72), {1, 36}, {255, 73}}) {
+        EXPECT_EQ(fixture.shownAfter(text("12B6: @15 %02X @%d", static_cast<unsigned>(count), length)), "");
+        EXPECT_EQ(fixture.linesNow(),
+            text("<3>Log code 0x12b6 is %d bytes long, but has %d substructs.", length, count));
     }
-}
-
-Bytes activeSetPacket(std::uint8_t count, std::size_t length)
-{
-    return packetWith(0x12B6, length,
-        {{15, {count}}, {25, {0x02, 0x01, 0x00, 0x02}}, {37, {0x2C, 0x01, 0x00, 0x00}},
-            {49, {0x02, 0x01, 0x04, 0x03}}, {61, {0xFF, 0xFF, 0xFF, 0xFF}}});
-}
-
-TEST(EVDOActiveSet, ListsPilotsWithTheirStrength)
-{
-    C2KFixture fixture;
-    EXPECT_EQ(fixture.listAfter(activeSetPacket(4, 73), "kActiveSetPilots"),
-        (RowTexts{{"_sorted", "_sorted"}, {"0;258", "+0.00 dB"}, {"1;300", "-inf dB"}, {"2;258", "+1.78 dB"},
-            {"3;65535", "+21.07 dB"}}));
-    EXPECT_EQ(fixture.textAfter(activeSetPacket(0, 73), "kActiveSetPilots"), "(none)");
-    EXPECT_EQ(fixture.textAfter(activeSetPacket(3, 73), "kActiveSetPilots"), "(dictionary)")
-        << "bytes behind the pilots do not matter";
-    EXPECT_EQ(fixture.log.take(), Lines{});
-
-    for (const auto& [count, length] : {std::pair(4, 72U), {1, 36U}, {255, 73U}}) {
-        EXPECT_EQ(fixture.rowsAfter(activeSetPacket(static_cast<std::uint8_t>(count), length)), RowTexts{});
-        EXPECT_EQ(fixture.log.take(),
-            Lines{text("<3>Log code 0x12b6 is %u bytes long, but has %d substructs.", length, count)});
-    }
-}
-
-// Four fingers, of which the second is idle.
-Bytes fingerPacket(std::uint8_t count, std::size_t length)
-{
-    return packetWith(0x108A, length,
-        {{22, {count}}, {23, {0x02, 0x01}}, {29, {0x01, 0x02}}, {37, {0xFF, 0xFF}}, {51, {0x2C, 0x01}},
-            {57, {0x2C, 0x01}}, {65, {0xFE, 0xFF}}, {71, {0, 0}}});
-}
-
-TEST(EVDOFingers, ListsBusyFingersUnderTheirNumber)
-{
-    C2KFixture fixture;
-    EXPECT_EQ(fixture.listAfter(fingerPacket(4, 79), "kFingerC2I"),
-        (RowTexts{
-            {"_sorted", "_sorted"}, {"0;258", "+0.01 dB"}, {"2;300", "-2.32 dB"}, {"3;65534", "-inf dB"}}));
-    EXPECT_EQ(fixture.textAfter(fingerPacket(0, 23), "kFingerC2I"), "(none)");
-    const Bytes idle = packetWith(0x108A, 37, {{22, {1}}, {23, {0xFF, 0xFF}}});
-    EXPECT_EQ(fixture.textAfter(idle, "kFingerC2I"), "(none)");
-    EXPECT_EQ(fixture.log.take(), Lines{});
-
-    for (const auto& [count, length] : {std::pair(4, 78U), {4, 80U}, {0, 24U}, {255, 79U}}) {
-        EXPECT_EQ(fixture.rowsAfter(fingerPacket(static_cast<std::uint8_t>(count), length)), RowTexts{});
-        EXPECT_EQ(fixture.log.take(),
-            Lines{text("<3>Log code 0x108a has bad length of %u bytes, but has %d substructs (size=23).",
-                length, count)});
+    for (const auto& [count, length] : {std::pair(4, 78), {4, 80}, {0, 24}, {255, 79}}) {
+        EXPECT_EQ(fixture.shownAfter(text("108A: @22 %02X @%d", static_cast<unsigned>(count), length)), "");
+        EXPECT_EQ(fixture.linesNow(),
+            text("<3>Log code 0x108a has bad length of %d bytes, but has %d substructs (size=23).", length,
+                count));
     }
 }
 

@@ -3,7 +3,7 @@
 #include "Array.h"
 #include "FixedClock.h"
 #include "FixedResources.h"
-#include "LogPackets.h"
+#include "PacketText.h"
 #include "RecordingLog.h"
 
 #include <gmock/gmock.h>

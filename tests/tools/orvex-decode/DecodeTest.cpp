@@ -1,5 +1,5 @@
 #include "DecodeProgram.h"
-#include "LogPackets.h"
+#include "PacketText.h"
 #include "PcapFile.h"
 
 #include "TextFormat.h"

@@ -1,0 +1,70 @@
+// Packets of the telephony service: SIM files, PDP contexts, and the property lists of all in both forms.
+
+#include "GSM/MRL_GSMClassIndex.h"
+
+#include "PropertyList.h"
+#include "SectionCases.h"
+
+namespace orvex::test {
+namespace {
+
+TEST(ExtraPackets, SimFilesAndPDPContexts)
+{
+    std::string files;
+    for (const char* key : {"OPLMNAcT", "OPL", "PNN", "RATMODE", "AHPLMN", "FPLMN", "AD", "ACC", "PSLOCI",
+             "LOCI", "HPPLMN", "MBDN", "MSISDN", "ICCID", "Other"})
+        files += text("<key>kSimFile_%s</key><string>%s</string>", key, key);
+    const char* name = "SIM Info";
+    const char* contexts = "PDP Context Info";
+    const char* fatal = "throws orvex::LogCode_0xFF0000::UnknownDataException";
+    expectShown<MRL_GSMClassIndex>({
+        {name, "FF0000: <dict>" + files + "</dict>",
+            "EF-ICCID=ICCID, EF-MSISDN=MSISDN, EF-3GPP MAIL BOX DIALING NUMBER=MBDN, "
+            "EF-HPPLMN SEARCH PERIOD=HPPLMN, EF-LOCI=LOCI, EF-GPRS/PS-LOCI=PSLOCI, "
+            "EF-ACCESS CONTROL CLASS=ACC, EF-ADMINISTRATIVE DATA=AD, EF-FPLMN=FPLMN, "
+            "EF-ACTING HPLMN=AHPLMN, EF-RAT MODE=RATMODE, EF-PLMN NETWORK NAME=PNN, "
+            "EF-OPERATOR PLMN LIST=OPL, EF-OPLMNAcT=OPLMNAcT"},
+        // Values are copied as they are; rows of files that are not there stay.
+        {name,
+            "FF0000: <dict><key>kSimFile_FPLMN</key><string>kept</string></dict>;"
+            "FF0000: <dict><key>kSimFile_ICCID</key><integer>7</integer></dict>",
+            "EF-FPLMN=kept, EF-ICCID=(integer)"},
+        {name, "FF0000: ", fatal},
+        {name, "FF0000: x", fatal},
+        {name, "FF0000: <array/>", fatal},
+        {name, "FF0001: no list", "(nothing)"},
+        {contexts,
+            "FF0002: <array><dict><key>APN</key><string>internet</string></dict><string>x</string></array>",
+            "APN=internet | x"},
+        {contexts, "FF0007: <array/>", "(empty)"}, // whatever the code
+        {contexts, "FF0002: <dict/>", "(nothing)"},
+        {contexts, "FF0002: x", "throws orvex::PDPContextList::UnknownDataException"},
+        {contexts, "FF0002: ", "throws orvex::PDPContextList::UnknownDataException"},
+    });
+}
+
+TEST(ExtraPackets, AreReadInBinaryFormToo)
+{
+    const MRL_GSMClassIndex index;
+    const std::pair<const char*, const char*> cases[] = {
+        {"UMTS Set", "FF0001: UMTS Neighbor UARFCN=10588 ScramblingCode=9 RSCP=-101 ECN0=-9"},
+        {"PDP Context Info", "FF0002: <array><dict><key>APN</key><string>internet</string></dict></array>"},
+        {"SIM Info", "FF0000: <dict><key>kSimFile_ICCID</key><string>8901</string></dict>"},
+    };
+    for (const auto& [name, packet] : cases) {
+        const Bytes xml = packetOfText(packet);
+        const auto list = propertyListFromData(ByteView(xml).subspan(kPacketHeaderLength));
+        const Bytes binary = propertyListBinary(list.value.value()).value();
+        Bytes bytes(xml.begin(), xml.begin() + kPacketHeaderLength);
+        bytes.insert(bytes.end(), binary.begin(), binary.end());
+        const std::string shown = outcomeOf(*index.getClass(name), {xml}).shown;
+        EXPECT_TRUE(shown.find("=") != std::string::npos) << shown;
+        EXPECT_EQ(outcomeOf(*index.getClass(name), {bytes}).shown, shown);
+        bytes.pop_back();
+        const std::string cut = outcomeOf(*index.getClass(name), {bytes}).shown;
+        EXPECT_TRUE(cut == "(empty)" || cut.ends_with("UnknownDataException")) << cut;
+    }
+}
+
+} // namespace
+} // namespace orvex::test
