@@ -1,16 +1,12 @@
 #include "MRLLogGenerator2.h"
 
-#include "FixedClock.h"
-#include "FixedResources.h"
+#include "GeneratorFixture.h"
 #include "PacketText.h"
-#include "RecordingLog.h"
 
 #include <gmock/gmock.h>
 
 namespace orvex::test {
 namespace {
-
-using Lines = std::vector<std::string>;
 
 // Shows what reached it: the code, and how long the packet was.
 class ProbeSection final : public Base {
@@ -22,7 +18,7 @@ public:
     }
     void updateWithData(Packet packet, LogCode logCode) override
     {
-        rows().print("Packet", "%d: %d bytes", logCode, static_cast<int>(packet.size()));
+        rows().print("Packet", "%04X, %zu", static_cast<unsigned>(logCode), packet.size());
     }
 };
 
@@ -32,137 +28,100 @@ public:
     ProbeSection second{"Second", {0x4116}, _classDict, _codeDictionary};
 };
 
-class MRLLogGenerator2Test : public testing::Test {
+class MRLLogGenerator2Test : public GeneratorFixture {
 public:
     MRLLogGenerator2Test()
     {
         resources.templates["Probe"] = Dictionary::make({
             {"First", Dictionary::make({{"Packet", "-"}})},
             {"Group", Dictionary::make({{"Second", Dictionary::make()}, {"Text", "as it is"}})},
-            {"List", Array::make({"element"})},
         });
+        resources.templates["Other"] = Dictionary::make({{"Second", Dictionary::make()}});
     }
 
     std::unique_ptr<MRLLogGenerator2> makeGenerator(const char* name = "Probe") const
     {
-        return std::make_unique<MRLLogGenerator2>(
-            GeneratorEnvironment{resources, clock, {}}, name, std::make_unique<ProbeIndex>());
+        return std::make_unique<MRLLogGenerator2>(environment(), name, std::make_unique<ProbeIndex>());
     }
-
-    std::string shown(const char* section) const
+    // What is shown after a packet of this code and length, by a generator of its own.
+    std::string displayAfter(const char* name, const Bytes& message)
     {
-        const auto display = state["Display"].dictionary();
-        auto dictionary = (*display)[section].dictionary();
-        if (!dictionary)
-            dictionary = (*(*display)["Group"].dictionary())[section].dictionary();
-        const std::string* text = (*dictionary)["Packet"].string();
-        return text ? *text : "";
+        makeGenerator(name)->updateState(state, message);
+        return display();
     }
-
-    FixedResources resources;
-    FixedClock clock;
-    Dictionary state;
 };
 
-TEST_F(MRLLogGenerator2Test, FramesAndRoutesByTheHeader)
+TEST_F(MRLLogGenerator2Test, FramesRoutesAndKeepsMessages)
 {
-    const auto framed = [](Bytes head) {
-        head.resize(13);
-        return head;
-    };
+    const char* const nowhere = "First={Packet=-}, Group={Second={}, Text=as it is}";
     const struct {
-        const char* name;
-        Bytes message;
-        const char* first;
-        const char* second;
-        Lines lines;
+        const char* message;
+        std::string display;
+        Lines lines = {};
     } cases[] = {
-        {"12 bytes", Bytes{1, 0, 0, 0x16, 0x41, 0, 0, 0, 0, 0, 0, 0}, "-", "", {}},
-        {"13 bytes", framed({1, 0, 0, 0x16, 0x41}), "16662: 13 bytes", "16662: 13 bytes", {}},
-        {"prefixed", framed({0x81, 7, 1, 0, 0, 0x16, 0x41}), "16662: 11 bytes", "16662: 11 bytes", {}},
-        {"extra", framed({255, 0, 0, 0, 0}), "16711680: 13 bytes", "", {}},
-        {"extra with the code of a baseband packet", framed({255, 0, 0, 0x16, 0x41}), "-", "", {}},
-        {"baseband with the code of an extra packet", framed({1, 0, 0, 0, 0}), "-", "", {}},
-        {"type 0", framed({0, 0, 0, 0x16, 0x41}), "-", "", {"<3>Invalid log type: 0. Dropping."}},
-        {"type 0xFE behind a prefix", framed({0x81, 0, 0xFE, 0, 0, 0x16, 0x41}), "-", "",
-            {"<3>Invalid log type: fe. Dropping."}},
+        {"01 00 00 16 41 00*7", nowhere}, // 12 bytes
+        {"01 00 00 16 41 00*8", "First={Packet=4116, 13}, Group={Second={Packet=4116, 13}, Text=as it is}"},
+        {"81 07 01 00 00 16 41 00*6",
+            "First={Packet=4116, 11}, Group={Second={Packet=4116, 11}, Text=as it is}"},
+        {"FF 00 00 00 00 00*8", "First={Packet=FF0000, 13}, Group={Second={}, Text=as it is}"},
+        {"FF 00 00 16 41 00*8", nowhere},
+        {"01 00 00 00 00 00*8", nowhere},
+        {"00 00 00 16 41 00*8", nowhere, {"<3>Invalid log type: 0. Dropping."}},
+        {"81 00 FE 00 00 16 41 00*6", nowhere, {"<3>Invalid log type: fe. Dropping."}},
     };
-    for (const auto& [name, message, first, second, lines] : cases) {
-        Dictionary fresh;
+    for (const auto& [words, expected, lines] : cases) {
+        clearState();
+        const Bytes message = PacketText(words).bytes();
         const auto generator = makeGenerator();
-        generator->getDisplayFromState(fresh);
+        generator->getDisplayFromState(state);
         RecordingLog log;
-        generator->updateState(fresh, message);
-        EXPECT_EQ(log.take(), lines) << name;
-        state.set("Display", fresh["Display"]);
-        EXPECT_EQ(shown("First"), first) << name;
-        EXPECT_EQ(shown("Second"), second) << name;
-        generator->generateLogUsingState(fresh);
-        EXPECT_EQ(*fresh["DisplayState"].data(), message) << name << ": every message is kept as it came";
+        generator->updateState(state, message);
+        EXPECT_EQ(log.take(), lines) << words;
+        EXPECT_EQ(display(), expected) << words;
+        generator->updateState(state, message);
+        const auto answered = generator->generateLogUsingState(state).dictionary();
+        EXPECT_EQ(answered, state["Display"].dictionary());
+        Bytes twice = message;
+        twice.insert(twice.end(), message.begin(), message.end());
+        EXPECT_EQ(keptMessages(), twice) << words << ": every message is kept as it came";
+        generator->generateLogUsingState(state);
+        EXPECT_TRUE(keptMessages().empty());
+        EXPECT_EQ(state["History"].array()->size(), 2U);
     }
 }
 
 TEST_F(MRLLogGenerator2Test, BuildsTheDisplayOnceAndAnswersItFromTheSecondCallOn)
 {
     const auto generator = makeGenerator();
+    RecordingLog log;
     EXPECT_TRUE(generator->getDisplayFromState(state).isNull());
-    const auto display = state["Display"].dictionary();
-    ASSERT_NE(display, nullptr);
-    EXPECT_EQ(*display, *resources.templates["Probe"]);
-    EXPECT_NE(display, resources.templates["Probe"]) << "sections must not write into the template";
+    EXPECT_THAT(log.take(),
+        testing::ElementsAre(
+            testing::MatchesRegex("<4>Initialized class index: 0x[0-9a-f]+, Self: 0x[0-9a-f]+"),
+            "<4>Dictionary = 1", "<4>String = 0", "<4>First", "<4>Second"));
+    const auto laidOut = state["Display"].dictionary();
+    ASSERT_NE(laidOut, nullptr);
+    EXPECT_EQ(*laidOut, *resources.templates["Probe"]);
+    EXPECT_NE(laidOut, resources.templates["Probe"]) << "sections must not write into the template";
     EXPECT_EQ(state["Template"].dictionary(), resources.templates["Probe"]);
-    EXPECT_EQ(*state["ExtraInfo"].dictionary(), Dictionary());
-    EXPECT_EQ(generator->getDisplayFromState(state).dictionary(), display);
-}
-
-TEST_F(MRLLogGenerator2Test, EachDisplayRequestTakesThePacketsSinceTheLast)
-{
-    const auto generator = makeGenerator();
-    const Bytes message(20, 2);
-    generator->updateState(state, message);
-    generator->updateState(state, message);
-    EXPECT_EQ(generator->generateLogUsingState(state).dictionary(), state["Display"].dictionary());
-    EXPECT_EQ(state["DisplayState"].data()->size(), 40U);
-    generator->generateLogUsingState(state);
-    EXPECT_TRUE(state["DisplayState"].data()->empty());
-    EXPECT_EQ(state["History"].array()->size(), 2U);
+    EXPECT_EQ(state["ExtraInfo"], Value(Dictionary::make()));
+    EXPECT_EQ(generator->getDisplayFromState(state).dictionary(), laidOut);
+    EXPECT_EQ(*generator->getStartCommand(),
+        Dictionary({{"SetState", "Streaming"}, {"SetMarlinLogCodes", Array::make({0x4116})},
+            {"SetKoratExtraCodes", Array::make({0})}}));
 }
 
 TEST_F(MRLLogGenerator2Test, SectionIsBoundToTheEntryProcessedLast)
 {
+    const Bytes message = packet(0x4116, Bytes());
     resources.templates["Probe"] = Dictionary::make({
         {"Group", Dictionary::make({{"First", Dictionary::make()}})},
         {"First", Dictionary::make({{"First", Dictionary::make()}})}, // the inner one is processed before
     });
-    const auto generator = makeGenerator();
-    generator->updateState(state, packet(0x4116, Bytes()));
-    const auto display = state["Display"].dictionary();
-    EXPECT_TRUE((*display)["First"].dictionary()->contains("Packet"));
-    EXPECT_FALSE((*(*display)["First"].dictionary())["First"].dictionary()->contains("Packet"));
-    EXPECT_TRUE((*(*display)["Group"].dictionary())["First"].dictionary()->isEmpty());
-}
-
-TEST_F(MRLLogGenerator2Test, EntryOfTheWrongKindDropsItsRows)
-{
+    EXPECT_EQ(displayAfter("Probe", message), "Group={First={}}, First={First={}, Packet=4116, 13}");
+    clearState();
     resources.templates["Probe"] = Dictionary::make({{"First", Array::make()}, {"Second", "text"}});
-    const auto generator = makeGenerator();
-    generator->updateState(state, packet(0x4116, Bytes()));
-    EXPECT_EQ(*state["Display"].dictionary(), *resources.templates["Probe"]);
-}
-
-TEST_F(MRLLogGenerator2Test, MissingTemplateIsTriedAgainAtEveryCall)
-{
-    const auto generator = makeGenerator("Other");
-    RecordingLog log;
-    generator->updateState(state, packet(0x4116, Bytes()));
-    EXPECT_TRUE(generator->generateLogUsingState(state).isNull());
-    EXPECT_EQ(
-        log.take(), (Lines{"<3>Cannot load template for display", "<3>Cannot load template for display"}));
-    EXPECT_TRUE(state["Display"].isNull());
-
-    resources.templates["Other"] = Dictionary::make({{"First", Dictionary::make()}});
-    generator->updateState(state, packet(0x4116, Bytes()));
-    EXPECT_EQ(shown("First"), "16662: 13 bytes");
+    EXPECT_EQ(displayAfter("Probe", message), "First=[], Second=text") << "rows have no place there";
 }
 
 TEST_F(MRLLogGenerator2Test, TemplateWithAnotherKindOfValueIsFatal)
@@ -172,9 +131,8 @@ TEST_F(MRLLogGenerator2Test, TemplateWithAnotherKindOfValueIsFatal)
         for (const Value& holder : {Value(Dictionary::make({{"x", value}})), Value(Array::make({value}))}) {
             resources.templates["Probe"] = Dictionary::make({{"Group", holder}});
             Dictionary fresh;
-            RecordingLog log;
             const auto generator = makeGenerator();
-            log.take();
+            RecordingLog log;
             EXPECT_THROW(generator->getDisplayFromState(fresh), InvalidTemplateException);
             EXPECT_THAT(log.take(),
                 testing::IsSupersetOf(
@@ -183,59 +141,30 @@ TEST_F(MRLLogGenerator2Test, TemplateWithAnotherKindOfValueIsFatal)
     }
 }
 
-TEST_F(MRLLogGenerator2Test, StartCommandAsksForTheCodesOfTheSections)
+TEST_F(MRLLogGenerator2Test, MissingTemplateIsTriedAgainAtEveryCall)
 {
-    EXPECT_EQ(*makeGenerator()->getStartCommand(),
-        Dictionary({{"SetState", "Streaming"}, {"SetMarlinLogCodes", Array::make({0x4116})},
-            {"SetKoratExtraCodes", Array::make({0})}}));
-}
-
-TEST_F(MRLLogGenerator2Test, SuccessorWritesIntoTheDisplayThatIsThere)
-{
-    makeGenerator()->updateState(state, packet(0x4116, Bytes()));
-    const auto display = state["Display"].dictionary();
-    const auto successor = makeGenerator();
-    successor->updateState(state, packet(0x4116, {1, 2}));
-    EXPECT_EQ(state["Display"].dictionary(), display);
-    EXPECT_EQ(shown("First"), "16662: 15 bytes");
-    EXPECT_EQ(shown("Second"), "16662: 15 bytes");
-}
-
-TEST_F(MRLLogGenerator2Test, SuccessorOfAnotherTechnologyLaysOutItsOwnDisplay)
-{
-    makeGenerator()->updateState(state, packet(0x4116, Bytes()));
-    resources.templates["Other"] = Dictionary::make({{"Second", Dictionary::make()}});
-    makeGenerator("Other")->updateState(state, packet(0x4116, Bytes()));
-    EXPECT_FALSE(state["Display"].dictionary()->contains("First"));
-    EXPECT_EQ(shown("Second"), "16662: 13 bytes");
-}
-
-TEST_F(MRLLogGenerator2Test, SuccessorWithoutItsTemplateLeavesTheDisplayToTheNext)
-{
-    makeGenerator()->updateState(state, packet(0x4116, Bytes()));
-    const auto display = state["Display"].dictionary();
-    EXPECT_TRUE(makeGenerator("Other")->generateLogUsingState(state).isNull());
-    makeGenerator()->updateState(state, packet(0x4116, {1, 2}));
-    EXPECT_EQ(state["Display"].dictionary(), display);
-    EXPECT_EQ(shown("First"), "16662: 15 bytes");
-}
-
-TEST_F(MRLLogGenerator2Test, DisplayWithoutATemplateIsNotItsOwn)
-{
-    state.set("Display", Dictionary::make({{"Foreign", "x"}}));
-    makeGenerator()->updateState(state, packet(0x4116, Bytes()));
-    EXPECT_EQ(shown("First"), "16662: 13 bytes");
-}
-
-TEST_F(MRLLogGenerator2Test, TellsOfTheDisplayThatItBuilds)
-{
-    const auto generator = makeGenerator();
+    const auto generator = makeGenerator("New");
     RecordingLog log;
-    generator->getDisplayFromState(state);
-    EXPECT_THAT(log.take(),
-        testing::ElementsAre(
-            testing::MatchesRegex("<4>Initialized class index: 0x[0-9a-f]+, Self: 0x[0-9a-f]+"),
-            "<4>Dictionary = 1", "<4>String = 0", "<4>First", "<4>Second"));
+    generator->updateState(state, packet(0x4116, Bytes()));
+    EXPECT_TRUE(generator->generateLogUsingState(state).isNull());
+    EXPECT_EQ(log.take(), Lines(2, "<3>Cannot load template for display"));
+    resources.templates["New"] = Dictionary::make({{"First", Dictionary::make()}});
+    generator->updateState(state, packet(0x4116, Bytes()));
+    EXPECT_EQ(display(), "First={Packet=4116, 13}");
+}
+
+TEST_F(MRLLogGenerator2Test, SuccessorsShareTheDisplayOfTheirTemplate)
+{
+    state.set("Display", Dictionary::make({{"Foreign", "x"}})); // without a template it is nobody's
+    EXPECT_EQ(displayAfter("Probe", packet(0x4116, Bytes())),
+        "First={Packet=4116, 13}, Group={Second={Packet=4116, 13}, Text=as it is}");
+    const auto first = state["Display"].dictionary();
+    EXPECT_EQ(displayAfter("Probe", packet(0x4116, Bytes(2))),
+        "First={Packet=4116, 15}, Group={Second={Packet=4116, 15}, Text=as it is}");
+    EXPECT_TRUE(makeGenerator("Missing")->generateLogUsingState(state).isNull());
+    displayAfter("Probe", packet(0x4116, Bytes(3)));
+    EXPECT_EQ(state["Display"].dictionary(), first);
+    EXPECT_EQ(displayAfter("Other", packet(0x4116, Bytes(4))), "Second={Packet=4116, 17}");
 }
 
 } // namespace

@@ -1,12 +1,8 @@
 #include "MRLLogGenerator.h"
 #include "MTLDLFAddVersionReport.h"
 
-#include "Array.h"
-#include "FixedClock.h"
-#include "FixedResources.h"
-#include "RecordingLog.h"
-
-#include <gtest/gtest.h>
+#include "GeneratorFixture.h"
+#include "PacketText.h"
 
 namespace orvex::test {
 namespace {
@@ -19,16 +15,13 @@ public:
     Value generateLogUsingState(Dictionary&) override { return {}; }
 };
 
-class MRLLogGeneratorTest : public testing::Test {
+class MRLLogGeneratorTest : public GeneratorFixture {
 public:
-    Bytes dlfOf(const Dictionary& state, std::optional<std::string> version = "1.0") const
+    Bytes dlfOf(const Dictionary& from, std::optional<std::string> version = "1.0") const
     {
-        const auto dlf = ProbeGenerator({resources, clock, std::move(version)}).generateDlfFromState(state);
+        const auto dlf = ProbeGenerator({resources, clock, std::move(version)}).generateDlfFromState(from);
         return dlf ? *dlf : Bytes();
     }
-
-    FixedResources resources;
-    FixedClock clock;
 };
 
 std::string textAt(const Bytes& bytes, std::size_t offset, std::size_t width)
@@ -41,18 +34,11 @@ TEST_F(MRLLogGeneratorTest, OpensWithTheVersionReport)
 {
     clock.zone = {-12600, true};
     const Bytes dlf = dlfOf({});
-    Bytes expected(161);
-    const auto put = [&expected](std::size_t offset, const Bytes& bytes) {
-        std::ranges::copy(bytes, expected.begin() + static_cast<std::ptrdiff_t>(offset));
-    };
-    put(0, {0xA1, 0x00, 0xFD, 0x1F});
-    put(12, {1, 0, 1, 0});
-    put(16, {'O', 'r', 'v', 'e', 'x', ' '});
-    put(23, {'E', 'X', 'E', 'C', 'U', 'T', 'A', 'B', 'L', 'E', '_', 'N', 'A', 'M', 'E'});
-    put(63, {'D', 'e', 'c', ' ', '1', '9', ' ', '2', '0', '1', '8', ' ', '2', '3', ':', '5', '9'});
-    put(81, {0x00, 0xF1, 0x53, 0x65}); // 1700000000, the fraction dropped
-    put(85, {0x2E, 0xFF});             // -210 minutes
-    put(87, {1});
+    const Bytes expected = PacketText("A100 FD1F 00*8 01 00 01 00 4F7276657820 00 " // "Orvex "
+                                      "45584543555441424C455F4E414D45 00*25 "       // "EXECUTABLE_NAME"
+                                      "446563203139203230313820 32333A3539 00 "     // "Dec 19 2018 23:59"
+                                      "00F15365 2EFF 01 00*73") // 1700000000, -210 minutes, daylight saving
+                               .bytes();
     EXPECT_EQ(dlf, expected);
 
     EXPECT_EQ(textAt(dlfOf({}, std::nullopt), 16, 7), std::string("(none)\0", 7));
@@ -67,8 +53,8 @@ TEST_F(MRLLogGeneratorTest, AppendsTheHistoryWithoutTheFirstByteOfEachEntry)
     const auto entry = [](const Bytes& packets) {
         return Dictionary::make({{"DisplayState", std::make_shared<Bytes>(packets)}});
     };
-    const Dictionary state{{"History",
-        Array::make({entry({1, 2, 3}), entry({9}), entry({}), Dictionary::make(), entry({1, 4})})}};
+    state.set(
+        "History", Array::make({entry({1, 2, 3}), entry({9}), entry({}), Dictionary::make(), entry({1, 4})}));
     const Bytes dlf = dlfOf(state);
     EXPECT_EQ(Bytes(dlf.begin() + 161, dlf.end()), (Bytes{2, 3, 4}));
 }

@@ -123,43 +123,30 @@ TEST_F(CaptureSession, MonitorAndDecoderShowTheSameOfIt)
     }
 }
 
-TEST_F(CaptureSession, ReplayStandsSilentAfterTheEndOrLoops)
+TEST_F(CaptureSession, ReplayStandsSilentAfterTheEnd)
 {
     const QString capture = writeCapture("capture", {1, 2, 3});
     const auto command = Dictionary::make({{"SetState", "Streaming"},
         {"SetMarlinLogCodes", Array::make({1, 3})}, {"SetKoratExtraCodes", Array::make()}});
-    {
-        KoratProgram korat(folder, {"--replay", capture});
-        KoratClient client(folder.ports());
-        ASSERT_EQ(client.open(), 0);
-        client.send(command);
-        ASSERT_TRUE(waitUntil([&] { return client.messages.size() == 2; }));
-        turnFor(300ms);
-        EXPECT_EQ(client.messages.size(), 2U);
-        EXPECT_TRUE(client.isServed());
-        EXPECT_EQ(client.technology(), Value("MRL_LTE"));
-        client.send(command);
-        EXPECT_TRUE(waitUntil([&] { return client.messages.size() == 4; })) << "each stream begins anew";
-    }
-    KoratProgram korat(folder, {"--replay", capture, "--loop", "--rate", "500"});
+    KoratProgram korat(folder, {"--replay", capture});
     KoratClient client(folder.ports());
     ASSERT_EQ(client.open(), 0);
     client.send(command);
-    ASSERT_TRUE(waitUntil([&] { return client.messages.size() >= 100; }));
-    for (std::size_t i = 0; i < client.messages.size(); ++i)
-        EXPECT_EQ(client.messages[i].at(3), i % 2 == 0 ? 1 : 3);
+    ASSERT_TRUE(waitUntil([&] { return client.messages.size() == 2; }));
+    turnFor(300ms);
+    EXPECT_EQ(client.messages.size(), 2U);
+    EXPECT_TRUE(client.isServed());
+    EXPECT_EQ(client.technology(), Value("MRL_LTE"));
+    client.send(command);
+    EXPECT_TRUE(waitUntil([&] { return client.messages.size() == 4; })) << "each stream begins anew";
 }
 
 TEST_F(CaptureSession, FilesThatAreOfNoUseEndItAtTheStart)
 {
     const QString cut = writeCapture("cut", {1});
     ASSERT_TRUE(QFile::resize(cut, QFile(cut).size() - 1));
-    const QString zeros = path("zeros");
-    QFile file(zeros);
-    ASSERT_TRUE(file.open(QIODevice::WriteOnly) && file.resize(1000));
     const std::pair<QStringList, const char*> cases[] = {
         {{"--replay", "/no/such/capture"}, "koratd: /no/such/capture: No such file or directory\n"},
-        {{"--replay", zeros}, "neither a pcap nor a DLF file\n"},
         {{"--replay", cut, "--loop"}, "truncated"},
         {{"--record", "/no/such/folder/file"}, "koratd: /no/such/folder/file: No such file or directory\n"},
         {{"--record", "/dev/full"}, "koratd: /dev/full: No space left on device\n"},
@@ -177,19 +164,6 @@ TEST_F(CaptureSession, FilesThatAreOfNoUseEndItAtTheStart)
     EXPECT_EQ(overwriting.waitForEnd(), 2);
     EXPECT_THAT(overwriting.errors(), HasSubstr("--record would overwrite the capture that is replayed"));
     EXPECT_EQ(countIn("capture"), 2U);
-}
-
-TEST_F(CaptureSession, RunningServiceKeepsItsRecordingWhenASecondOneStarts)
-{
-    KoratProgram korat(folder, {"--record", path("capture"), "--rate", "2000", "--count", "50"});
-    KoratClient client(folder.ports());
-    ASSERT_EQ(client.open(), 0);
-    client.send(everything());
-    ASSERT_TRUE(waitUntil([&] { return client.messages.size() == 50; }));
-    Program second(folder, KORATD_PATH, {"--record", path("capture")});
-    EXPECT_EQ(second.waitForEnd(), 1);
-    EXPECT_EQ(korat.terminateAndCount(), 50);
-    EXPECT_EQ(countIn("capture"), 50U);
 }
 
 TEST_F(CaptureSession, FullDiskEndsTheRecordingOnly)

@@ -5,6 +5,8 @@
 
 #include "Array.h"
 
+#include <QFile>
+
 #include <gmock/gmock.h>
 
 #include <cerrno>
@@ -79,34 +81,6 @@ TEST(KoratProcess, StreamsWhatWasAskedForAfterTheStartCommand)
     EXPECT_TRUE(waitUntil([&] { return client.codes().size() == 9; }));
 }
 
-TEST(KoratProcess, StreamsPacketsWithoutExtraOnesForCDMA2000)
-{
-    const ProgramFolder folder;
-    KoratProgram korat(folder, {"--technology", "MRL_CDMA", "--rate", "2000"});
-    KoratClient client(folder.ports());
-    ASSERT_EQ(client.open(), 0);
-    EXPECT_EQ(client.technology(), Value("MRL_CDMA"));
-    client.send(Dictionary::make({{"SetState", "Streaming"},
-        {"SetMarlinLogCodes",
-            Array::make({0x108A, 0x1183, 0x1192, 0x12B6, 0x119C, 0x119D, 0x127E, 0x134F})}}));
-    EXPECT_TRUE(waitUntil([&] { return client.codes().size() == 8; }));
-}
-
-TEST(KoratProcess, StreamsPropertyListsForIFX)
-{
-    const ProgramFolder folder;
-    KoratProgram korat(folder, {"--technology", "IFX", "--rate", "200"});
-    KoratClient client(folder.ports());
-    ASSERT_EQ(client.open(), 0);
-    EXPECT_EQ(client.technology(), Value("IFX"));
-    client.send(everything());
-    ASSERT_TRUE(waitUntil([&] { return client.messages.size() >= 20; }));
-    for (const Bytes& message : client.messages) {
-        const auto list = propertyListFromData(message);
-        EXPECT_TRUE(list.value && list.value->dictionary()) << list.error;
-    }
-}
-
 TEST(KoratProcess, ServesOneClientAtATime)
 {
     const ProgramFolder folder;
@@ -150,25 +124,6 @@ TEST(KoratProcess, RequestsThatMakeNoSenseAreRefused)
     }
 }
 
-TEST(KoratProcess, SlowClientHoldsUpNobodyAndLosesNothing)
-{
-    const ProgramFolder folder;
-    KoratProgram korat(folder, {"--rate", "20000"});
-    KoratClient client(folder.ports());
-    ASSERT_EQ(client.open(), 0);
-    client.send(everything());
-    ASSERT_TRUE(waitUntil([&] { return client.messages.size() > 100; }));
-
-    // The test's event loop stands still for longer than the backlog takes to fill.
-    std::this_thread::sleep_for(std::chrono::milliseconds(2500));
-    EXPECT_EQ(KoratClient(folder.ports(), "org.orvex.Test.Second").open(), EBUSY);
-
-    const std::size_t before = client.messages.size();
-    EXPECT_TRUE(waitUntil([&] { return client.messages.size() > before + 20'000; }));
-    const Bytes& last = client.messages.back();
-    EXPECT_EQ(last.size(), last[1] + last[2] * 256U + 1U);
-}
-
 TEST(KoratProcess, DiesWhenAsked)
 {
     const ProgramFolder folder;
@@ -182,14 +137,20 @@ TEST(KoratProcess, DiesWhenAsked)
     EXPECT_TRUE(waitUntil([&] { return !client.isServed(); }));
 }
 
-TEST(KoratProcess, ASecondServiceFindsThePlaceTaken)
+TEST(KoratProcess, ASecondServiceFindsThePlaceTakenAndLeavesTheRecordingAlone)
 {
     const ProgramFolder folder;
-    KoratProgram first(folder);
-    Program second(folder, KORATD_PATH, {});
+    const QString capture = QString::fromStdString(folder.path("capture"));
+    KoratProgram first(folder, {"--record", capture, "--rate", "2000", "--count", "50"});
+    KoratClient client(folder.ports());
+    ASSERT_EQ(client.open(), 0);
+    client.send(everything());
+    ASSERT_TRUE(waitUntil([&] { return client.messages.size() == 50; }));
+    Program second(folder, KORATD_PATH, {"--record", capture});
     EXPECT_EQ(second.waitForEnd(), 1);
     EXPECT_THAT(second.errors(), HasSubstr("another service is running already"));
-    EXPECT_EQ(first.terminateAndCount(), 0);
+    EXPECT_EQ(first.terminateAndCount(), 50);
+    EXPECT_GT(QFile(capture).size(), 50 * 16);
     KoratProgram third(folder); // nothing was left behind
     EXPECT_EQ(third.terminateAndCount(), 0);
 }

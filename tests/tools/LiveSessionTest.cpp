@@ -58,22 +58,6 @@ TEST(LiveSession, ValuesChange)
     }
 }
 
-TEST(LiveSession, AbsentServiceIsTriedAgainAfterFiveSeconds)
-{
-    const ProgramFolder folder;
-    ConsoleProgram monitor(folder);
-    ASSERT_TRUE(monitor.waitForError("Could not create KoratServerConnection"));
-    QElapsedTimer elapsed;
-    elapsed.start();
-    EXPECT_TRUE(monitor.waitForOutput("Connecting..."));
-    ASSERT_TRUE(monitor.waitForError("Could not create KoratServerConnection", 2));
-    EXPECT_GE(elapsed.elapsed(), 4500);
-    EXPECT_LE(elapsed.elapsed(), 8000);
-
-    const KoratProgram korat(folder);
-    EXPECT_TRUE(monitor.waitForOutput("Updated 2"));
-}
-
 TEST(LiveSession, ComesBackAfterTheServiceWasKilled)
 {
     const ProgramFolder folder;

@@ -6,7 +6,6 @@
 #include <gmock/gmock.h>
 
 #include <filesystem>
-#include <fstream>
 
 namespace orvex::korat {
 namespace {
@@ -25,11 +24,6 @@ protected:
         PcapWriter writer(path);
         for (std::size_t i = 0; i < messages.size(); ++i)
             writer.write(messages[i], kLongAgo + times[i]);
-    }
-    void writeBytes(const Bytes& bytes) const
-    {
-        std::ofstream(path, std::ios::binary)
-            .write(reinterpret_cast<const char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()));
     }
 
     // When the messages of one round are due.
@@ -103,26 +97,6 @@ TEST_F(ReplaySourceTest, MessagesAreWantedByTheCodesInTheirHeaders)
     }
 }
 
-TEST_F(ReplaySourceTest, RecordsOfADlfBecomeMessages)
-{
-    // As koratd writes times, 300 us apart; the last byte of the file makes no record.
-    writeBytes({13, 0, 0xC1, 0xB0, 0x00, 0x40, 0x1E, 0x18, 0x24, 0x0A, 6, 0, 0xAA, //
-        12, 0, 0x79, 0xB1, 0x2C, 0x41, 0x1E, 0x18, 0x24, 0x0A, 6, 0, 0x77});
-    ReplaySource source(path, false);
-    const auto first = source.nextIfAny();
-    const auto second = source.nextIfAny();
-    ASSERT_TRUE(first && second);
-    EXPECT_EQ(first->message.code, 0xB0C1U);
-    EXPECT_THAT(first->message.bytes,
-        ElementsAre(1, 13, 0, 0xC1, 0xB0, 0x00, 0x40, 0x1E, 0x18, 0x24, 0x0A, 6, 0, 0xAA));
-    EXPECT_EQ(second->message.code, 0xB179U);
-    EXPECT_EQ(second->due, 300us);
-    testing::internal::CaptureStderr();
-    EXPECT_FALSE(source.nextIfAny());
-    EXPECT_EQ(testing::internal::GetCapturedStderr(),
-        "koratd: " + path + ": 1 bytes that make no record were skipped (after 2 messages)\n");
-}
-
 TEST_F(ReplaySourceTest, CaptureThatBreaksIsPlayedUpToThereAndSaysSoOnce)
 {
     writePcap({kPacket, kPacket}, {0s, 1s});
@@ -139,20 +113,6 @@ TEST_F(ReplaySourceTest, CaptureThatBreaksIsPlayedUpToThereAndSaysSoOnce)
     ASSERT_TRUE(source.restart());
     EXPECT_FALSE(source.nextIfAny());
     EXPECT_EQ(testing::internal::GetCapturedStderr(), "");
-}
-
-TEST_F(ReplaySourceTest, SaysWhyAFileCannotBeReplayed)
-{
-    EXPECT_EQ(ReplaySource::faultOf("/no/such/capture"), "/no/such/capture: No such file or directory");
-    writeBytes({});
-    EXPECT_EQ(ReplaySource::faultOf(path), path + ": neither a pcap nor a DLF file");
-    writeBytes(Bytes(1000, 0));
-    EXPECT_EQ(ReplaySource::faultOf(path), path + ": neither a pcap nor a DLF file");
-    writePcap({kPacket}, {0s});
-    std::filesystem::resize_file(path, 24 + 16 + 5);
-    EXPECT_THAT(ReplaySource::faultOf(path), HasSubstr(path + ": truncated"));
-    writePcap({}, {});
-    EXPECT_EQ(ReplaySource::faultOf(path), "") << "a capture of nothing is one";
 }
 
 } // namespace

@@ -1,4 +1,5 @@
 #include "C2KFixture.h"
+#include "GeneratorFixture.h"
 
 #include "GSM/GSMLogGenerator.h"
 #include "MRLLogGenerator2.h"
@@ -9,8 +10,6 @@
 
 namespace orvex::test {
 namespace {
-
-using Lines = std::vector<std::string>;
 
 // What every decoder asks of the length of its packets.
 const struct {
@@ -45,7 +44,7 @@ TEST(C2KDecoders, RefuseShortPackets)
     }
 }
 
-class C2KLogGeneratorTest : public testing::Test {
+class C2KLogGeneratorTest : public GeneratorFixture {
 public:
     C2KLogGeneratorTest()
     {
@@ -63,22 +62,12 @@ public:
     {
         return std::make_unique<C2KLogGenerator>(environment());
     }
-    std::unique_ptr<LogGenerator> makeOther() const
+    // The display's section of that name.
+    std::string identityShown() const
     {
-        return std::make_unique<MRLLogGenerator2>(environment(), "Other", std::make_unique<ClassIndex>());
-    }
-    GeneratorEnvironment environment() const { return {resources, clock, {}}; }
-
-    std::string section(const char* name) const
-    {
-        const auto display = state["Display"].dictionary();
-        const auto rows = display ? (*display)[name].dictionary() : nullptr;
+        const auto rows = (*state["Display"].dictionary())["Identity"].dictionary();
         return rows ? shown(*rows) : "";
     }
-
-    FixedResources resources;
-    FixedClock clock;
-    Dictionary state;
 };
 
 // A system identity packet: system 258 of a network whose protocol revision this is.
@@ -91,18 +80,21 @@ TEST_F(C2KLogGeneratorTest, ShowsAValueInEveryRowThatNamesItsKey)
 {
     const auto generator = makeGenerator();
     RecordingLog log;
-    const auto display = generator->generateLogUsingState(state).dictionary();
+    const auto laidOut = generator->generateLogUsingState(state).dictionary();
     EXPECT_EQ(log.take(), Lines(4, "<4>Processing the template")) << "once a dictionary";
-    ASSERT_NE(display, nullptr) << "at once";
-    EXPECT_EQ(section("Identity"), "SID=, Revision=");
+    EXPECT_EQ(identityShown(), "SID=, Revision=");
     EXPECT_EQ(state["ExtraInfo"], Value(Dictionary::make())) << "for counters";
 
     generator->updateState(state, identity(7));
-    EXPECT_EQ(generator->generateLogUsingState(state).dictionary(), display);
-    EXPECT_EQ(section("Identity"), "SID=258, Revision=7");
-    EXPECT_EQ(section("Copies"), "_sorted=_sorted, 1;SID=258, Deep={SID=258, Mark=_sorted}");
+    EXPECT_EQ(generator->generateLogUsingState(state).dictionary(), laidOut);
+    EXPECT_EQ(display(),
+        "Identity={SID=258, Revision=7}, "
+        "Copies={_sorted=_sorted, 1;SID=258, Deep={SID=258, Mark=_sorted}}");
     EXPECT_EQ(log.take(), Lines{});
     EXPECT_EQ(*state["Template"].dictionary(), *resources.templates["C2KTemplate"]);
+    EXPECT_EQ(*generator->getStartCommand(),
+        Dictionary({{"SetState", "Streaming"},
+            {"SetMarlinLogCodes", Array::make({4234, 4483, 4498, 4790, 4508, 4509, 4734, 4943})}}));
 }
 
 TEST(Publisher, EndsAtADamagedEntry)
@@ -130,54 +122,42 @@ TEST_F(C2KLogGeneratorTest, FramesAndKeepsWhatReachesADecoder)
 {
     const char* const decoded = "SID=258, Revision=7";
     const char* const untouched = "SID=, Revision=";
-    const Bytes plain = identity(7);
-    const auto typed = [&plain](std::uint8_t type) {
-        Bytes bytes = plain;
-        bytes[0] = type;
-        return bytes;
-    };
-    Bytes prefixed = {0x81, 0};
-    prefixed.insert(prefixed.end(), plain.begin(), plain.end());
-    const Bytes tooShort = packetOfText("1183: ");
-    const Bytes prefixedHeader = {0x81, 0, 1, 0, 0, 0x83, 0x11, 0, 0, 0, 0, 0, 0};
+    const std::string body = " 00 00 4F 13 00*8 02 @46 02000000 0201 @133 07 @171";
     const struct {
-        const char* name;
-        Bytes message;
-        const char* shownIdentity;
-        Bytes kept;
-        Lines lines;
+        std::string message;
+        const char* identity;
+        std::string kept;
+        Lines lines = {};
     } cases[] = {
-        {"plain", plain, decoded, plain, {}},
-        {"prefixed", prefixed, decoded, plain, {}},
-        {"type 2 is decoded all the same", typed(2), decoded, typed(2),
-            {"<3>Invalid log type: 2. Dropping."}},
-        {"extra packet", typed(0xFF), untouched, {}, {"<3>Invalid log type: ff. Dropping."}},
-        {"another code", packet(0x1184, Bytes(200)), untouched, {}, {}},
-        {"12 bytes", Bytes(tooShort.begin(), tooShort.end() - 1), untouched, {}, {}},
-        {"13 bytes are kept, though refused", tooShort, untouched, tooShort,
+        {"01" + body, decoded, "01" + body},
+        {"02" + body, decoded, "02" + body, {"<3>Invalid log type: 2. Dropping."}}, // decoded all the same
+        {"FF" + body, untouched, "", {"<3>Invalid log type: ff. Dropping."}},
+        {"01 00 00 84 11 00*200", untouched, ""}, // another code
+        {"01 00 00 83 11 00*7", untouched, ""},
+        {"01 00 00 83 11 00*8", untouched, "01 00 00 83 11 00*8",
             {"<3>Log code 0x1183 is 13 bytes long but should be 50 bytes."}},
-        {"13 bytes with the prefix", prefixedHeader, untouched,
-            Bytes(prefixedHeader.begin() + 2, prefixedHeader.end()),
+        {"81 00 01 00 00 83 11 00*6", untouched, "01 00 00 83 11 00*6",
             {"<3>Log code 0x1183 is 11 bytes long but should be 50 bytes."}},
     };
-    for (const auto& [name, message, shownIdentity, kept, lines] : cases) {
+    for (const auto& [message, shownIdentity, kept, lines] : cases) {
+        const Bytes bytes = PacketText(message).bytes();
         const auto generator = makeGenerator();
         state.remove("Display");
         generator->generateLogUsingState(state);
         RecordingLog log;
-        generator->updateState(state, message);
-        EXPECT_EQ(log.take(), lines) << name;
-        EXPECT_EQ(section("Identity"), shownIdentity) << name;
-        generator->updateState(state, message);
+        generator->updateState(state, bytes);
+        EXPECT_EQ(log.take(), lines) << message;
+        EXPECT_EQ(identityShown(), shownIdentity) << message;
+        generator->updateState(state, bytes);
         generator->generateLogUsingState(state);
-        Bytes twice = kept;
-        twice.insert(twice.end(), kept.begin(), kept.end());
-        EXPECT_EQ(*state["DisplayState"].data(), twice) << name;
+        Bytes twice = PacketText(kept).bytes();
+        const Bytes once = twice;
+        twice.insert(twice.end(), once.begin(), once.end());
+        EXPECT_EQ(keptMessages(), twice) << message;
         const auto history = state["History"].array();
-        const auto entry = (*history)[history->size() - 1].dictionary();
-        EXPECT_EQ(*(*entry)["DisplayState"].data(), twice) << name;
+        EXPECT_EQ(*(*(*history)[history->size() - 1].dictionary())["DisplayState"].data(), twice) << message;
         generator->generateLogUsingState(state);
-        EXPECT_TRUE(state["DisplayState"].data()->empty()) << name;
+        EXPECT_TRUE(keptMessages().empty()) << message;
     }
     EXPECT_EQ(state["History"].array()->size(), 5U);
 }
@@ -196,18 +176,7 @@ TEST_F(C2KLogGeneratorTest, MissingTemplateIsTriedAgainAtEveryCall)
     EXPECT_NE(C2KLogGenerator::getDisplayFromState(laidOut, resources), nullptr) << "that of the state";
     resources.templates["C2KTemplate"] = skeleton;
     generator->updateState(state, identity(8));
-    EXPECT_EQ(section("Identity"), "SID=258, Revision=8");
-}
-
-TEST_F(C2KLogGeneratorTest, SuccessorWritesIntoTheDisplayThatIsThere)
-{
-    makeGenerator()->updateState(state, identity(7));
-    const auto display = state["Display"].dictionary();
-    const auto successor = makeGenerator();
-    EXPECT_EQ(successor->generateLogUsingState(state).dictionary(), display);
-    successor->updateState(state, identity(8));
-    EXPECT_EQ(state["Display"].dictionary(), display);
-    EXPECT_EQ(section("Identity"), "SID=258, Revision=8");
+    EXPECT_EQ(identityShown(), "SID=258, Revision=8");
 }
 
 TEST_F(C2KLogGeneratorTest, TechnologiesTakeTurnsOnOneState)
@@ -218,22 +187,20 @@ TEST_F(C2KLogGeneratorTest, TechnologiesTakeTurnsOnOneState)
         const std::string list = "<plist version=\"1.0\"><dict><key>A</key><string>x</string></dict></plist>";
         if (turn == 'C') {
             makeGenerator()->updateState(state, identity(7));
-            EXPECT_EQ(section("Identity"), "SID=258, Revision=7");
+            EXPECT_EQ(identityShown(), "SID=258, Revision=7");
+            const auto shared = state["Display"].dictionary();
+            makeGenerator()->updateState(state, identity(8));
+            EXPECT_EQ(identityShown(), "SID=258, Revision=8");
+            EXPECT_EQ(state["Display"].dictionary(), shared);
         } else if (turn == 'O') {
-            makeOther()->updateState(state, identity(7));
+            MRLLogGenerator2(environment(), "Other", std::make_unique<ClassIndex>())
+                .updateState(state, identity(7));
             EXPECT_EQ(state["Display"], resources.templates["Other"]);
         } else {
             GSMLogGenerator(environment()).updateState(state, Bytes(list.begin(), list.end()));
             EXPECT_EQ(state["Display"], Value(Dictionary::make({{"A", "x"}})));
         }
     }
-}
-
-TEST_F(C2KLogGeneratorTest, StartCommandAsksForTheCodesOfTheDecoders)
-{
-    EXPECT_EQ(*makeGenerator()->getStartCommand(),
-        Dictionary({{"SetState", "Streaming"},
-            {"SetMarlinLogCodes", Array::make({4234, 4483, 4498, 4790, 4508, 4509, 4734, 4943})}}));
 }
 
 // The texts of a template of texts and dictionaries.

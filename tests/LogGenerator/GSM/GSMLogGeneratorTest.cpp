@@ -2,17 +2,13 @@
 
 #include "AssertionFailure.h"
 
-#include "Array.h"
-#include "FixedClock.h"
-#include "FixedResources.h"
+#include "GeneratorFixture.h"
 #include "TextFormat.h"
-
-#include <gtest/gtest.h>
 
 namespace orvex::test {
 namespace {
 
-class GSMLogGeneratorTest : public testing::Test {
+class GSMLogGeneratorTest : public GeneratorFixture {
 public:
     static Bytes message(const std::string& inner)
     {
@@ -25,10 +21,7 @@ public:
         return generator.generateLogUsingState(state);
     }
 
-    FixedResources resources;
-    FixedClock clock;
-    GSMLogGenerator generator{GeneratorEnvironment{resources, clock, {}}};
-    Dictionary state;
+    GSMLogGenerator generator{environment()};
 };
 
 std::string dict(const std::vector<std::pair<const char*, std::string>>& entries)

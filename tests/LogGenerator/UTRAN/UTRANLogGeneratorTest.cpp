@@ -1,27 +1,16 @@
 #include "UTRAN/UTRANLogGenerator.h"
 
-#include "Array.h"
-#include "FixedClock.h"
-#include "FixedResources.h"
+#include "GeneratorFixture.h"
 #include "PacketText.h"
-#include "RecordingLog.h"
 
 #include <gmock/gmock.h>
 
 namespace orvex::test {
 namespace {
 
-class UTRANLogGeneratorTest : public testing::Test {
+class UTRANLogGeneratorTest : public GeneratorFixture {
 public:
-    std::unique_ptr<LogGenerator> make() const
-    {
-        return UTRANLogGenerator::generator({resources, clock, {}});
-    }
-
-    FixedResources resources;
-    FixedClock clock;
     RecordingLog log;
-    Dictionary state;
 };
 
 TEST_F(UTRANLogGeneratorTest, TakesTheFirstTemplateThatMentionsUTRAN)
@@ -29,7 +18,7 @@ TEST_F(UTRANLogGeneratorTest, TakesTheFirstTemplateThatMentionsUTRAN)
     resources.templates["A_utrANx"] = Dictionary::make({{"RRC Info", Dictionary::make()}});
     resources.templates["B_UTRAN"] = Dictionary::make();
     resources.templates["AAA"] = Dictionary::make();
-    const auto generator = make();
+    const auto generator = UTRANLogGenerator::generator(environment());
     EXPECT_EQ(log.lines.back(), "<3>Created UTRANLogGenerator object");
     generator->updateState(state, packet(0xD0E0, {1, 3}));
     EXPECT_EQ(*state["Display"].dictionary(),
@@ -43,7 +32,7 @@ TEST_F(UTRANLogGeneratorTest, TakesTheFirstTemplateThatMentionsUTRAN)
 TEST_F(UTRANLogGeneratorTest, WithoutATemplateItWantsNothingAndShowsNothing)
 {
     resources.templates["LTE"] = Dictionary::make({{"RRC Info", Dictionary::make()}});
-    const auto generator = make();
+    const auto generator = UTRANLogGenerator::generator(environment());
     EXPECT_TRUE(log.take().empty()) << "nothing was set up";
     EXPECT_EQ(*generator->getStartCommand(),
         Dictionary({{"SetState", "Streaming"}, {"SetMarlinLogCodes", Array::make()},

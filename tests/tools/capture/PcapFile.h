@@ -23,12 +23,13 @@ public:
         put(linkType, 4);
     }
 
-    // A packet of which the capture holds the first `captured` bytes.
+    // A packet, 654321 micro- or nanoseconds after a second, of which the capture holds the first `captured`
+    // bytes.
     PcapFile& add(const Bytes& message, std::size_t captured = static_cast<std::size_t>(-1))
     {
         captured = std::min(captured, message.size());
         put(1'700'000'000, 4);
-        put(0, 4);
+        put(654'321, 4);
         put(captured, 4);
         put(message.size(), 4);
         _bytes.insert(_bytes.end(), message.begin(), message.begin() + static_cast<std::ptrdiff_t>(captured));

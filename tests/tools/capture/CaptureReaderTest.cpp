@@ -1,0 +1,82 @@
+#include "CaptureReader.h"
+
+#include "DlfBytes.h"
+#include "PcapFile.h"
+#include "TemporaryFile.h"
+
+#include <gtest/gtest.h>
+
+namespace orvex {
+namespace {
+
+using namespace test;
+
+// The time of the first message, the lengths of all, and how it ended.
+std::string contentOf(const std::string& path)
+{
+    const auto reader = CaptureReader::open(path);
+    std::string result;
+    auto status = reader->next();
+    for (; status == CaptureReader::Status::message; status = reader->next()) {
+        if (result.empty())
+            result = std::to_string(reader->time().count() % 1'000'000) + " us:";
+        result += ' ' + std::to_string(reader->message().size());
+    }
+    if (status == CaptureReader::Status::broken)
+        result += "; " + reader->error().substr(std::min(reader->error().size(), path.size() + 2));
+    if (const std::string omissions = reader->omissions(); !omissions.empty())
+        result += "; " + omissions;
+    return result;
+}
+
+TEST(CaptureReader, GivesWhatIsWholeAndSaysWhatIsNot)
+{
+    const Bytes five(5, 7);
+    const Bytes seven(7, 7);
+    const auto two = [&](PcapFile file) { return file.add(five).add(seven); };
+    const auto dlf = [](Bytes end) {
+        Bytes bytes = dlfRecord(20, 1);
+        bytes += dlfRecord(30, 2);
+        return bytes += end;
+    };
+    const char* none = "; neither a pcap nor a DLF file";
+    const char* skipped = " bytes that make no record were skipped";
+    const struct {
+        const char* name;
+        Bytes bytes;
+        std::string content;
+    } cases[] = {
+        {"microseconds", two(PcapFile()).bytes(), "654321 us: 5 7"},
+        {"big-endian", two(PcapFile(147, true)).bytes(), "654321 us: 5 7"},
+        {"nanoseconds", two(PcapFile(147, false, 0xA1B23C4D)).bytes(), "654 us: 5 7"},
+        {"big-endian, nanoseconds", two(PcapFile(147, true, 0xA1B23C4D)).bytes(), "654 us: 5 7"},
+        {"of nothing", PcapFile().bytes(), ""},
+        {"another link type", two(PcapFile(1)).bytes(),
+            "; its link type is 1; log messages have 147 (USER0)"},
+        {"partial packet", PcapFile().add(five).add(seven, 6).add(five).bytes(),
+            "654321 us: 5 5; 1 packets hold only the beginning of their message and were left out"},
+        {"DLF", dlf({}), "1 us: 21 31"},
+        {"DLF, cut", dlf(Bytes{20, 0, 0xC1, 0xB0}), std::string("1 us: 21 31; 4") + skipped},
+        {"DLF, lengths of zero", dlf(Bytes(40)), std::string("1 us: 21 31; 40") + skipped},
+        {"DLF, a length beyond the end", dlf({0xFF, 0x7F, 0xC1, 0xB0}),
+            std::string("1 us: 21 31; 4") + skipped},
+        {"another file", Bytes(100, 'x'), none},
+        {"zero bytes", {}, none},
+        {"zeros", Bytes(1000), none},
+    };
+    const TemporaryFile file;
+    for (const auto& [name, bytes, content] : cases)
+        EXPECT_EQ(contentOf(writeFile(file.path, bytes)), content) << name;
+    for (std::size_t cut = 1; cut < 7 + 16; ++cut) {
+        const std::string content = contentOf(writeFile(file.path, two(PcapFile()).cut(cut).bytes()));
+        EXPECT_EQ(content.find("654321 us: 5; truncated"), 0U) << content;
+    }
+    const auto reader = CaptureReader::open(writeFile(file.path, dlf({})));
+    reader->next();
+    Bytes message{1}; // a record behind its log type
+    EXPECT_EQ(Bytes(reader->message().begin(), reader->message().end()), message += dlfRecord(20, 1));
+    EXPECT_EQ(contentOf("/no/such/capture"), "; No such file or directory");
+}
+
+} // namespace
+} // namespace orvex
