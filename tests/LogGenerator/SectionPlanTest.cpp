@@ -10,7 +10,6 @@
 
 #include <fstream>
 #include <iterator>
-#include <set>
 
 namespace orvex::test {
 namespace {
@@ -201,57 +200,6 @@ TEST(SectionPlan, SectionsRefusePacketsThatAreNotForThem)
             if (otherCodes == OtherCodes::reported)
                 expected.emplace_back("<3>Received an unknown log message: 4660");
             EXPECT_EQ(reactionTo(section, 0x1234, 400), std::pair(expected, false)) << name;
-        }
-    });
-}
-
-// A packet that holds a record of every list, with every key that a property list may have.
-Bytes fullPacket(LogCode code)
-{
-    std::string cells = "FF0001: ";
-    for (const char* radio : {"LTE", "UTRAN", "UMTS", "GSM"})
-        cells +=
-            text("%s Serving MCC=1 MNC=1 TAC=1 LAC=1 CellID=1 PhysicalCellID=1 BandInfo=1 ARFCN=1 UARFCN=1 "
-                 "ScramblingCode=1,",
-                radio);
-    std::string files;
-    for (const char* key : {"ICCID", "MSISDN", "MBDN", "HPPLMN", "LOCI", "PSLOCI", "ACC", "AD", "FPLMN",
-             "AHPLMN", "RATMODE", "PNN", "OPL", "OPLMNAcT"})
-        files += text("<key>kSimFile_%s</key><string>x</string>", key);
-    switch (code) {
-    case kExtraCodeSimFiles: return propertyListPacket(code, "<dict>" + files + "</dict>");
-    case kExtraCodeCellMonitorList: return packetOfText(cells);
-    case kExtraCodePDPContexts: return propertyListPacket(code, "<array/>");
-    default: return packet(code, Bytes(40, 1));
-    }
-}
-
-TEST(SectionPlan, TemplatesLayOutTheRowsThatTheirSectionsWrite)
-{
-    // The UARFCN of the cell-monitor list is taken away by the next serving cell packet.
-    const std::map<std::string, std::string> comeAndGo = {
-        {"LTE/Serving Cell Info", "UARFCN"}, {"MRL_GSM/UMTS RR Info", "UARFCN"}};
-    forEachTechnology([&comeAndGo](const auto& technology) {
-        for (const auto& [name, entry] : sectionsOfTemplate(technology.index, technology.templateName)) {
-            Base& section = *technology.index.getClass(name);
-            if (section.getLogCodeArray().empty())
-                continue; // its rows are the template's alone
-            const auto written = Dictionary::make();
-            section.updateSectionRef(written);
-            for (const LogCode code : section.getLogCodeArray())
-                section.updateWithData(fullPacket(code), code);
-            std::set<std::string> names;
-            for (const auto& row : *written)
-                names.insert(row.key);
-            std::set<std::string> laidOut;
-            if (const auto display = entry.dictionary()) {
-                for (const auto& row : *display)
-                    laidOut.insert(row.key);
-            }
-            const auto other = comeAndGo.find(std::string(technology.templateName) + "/" + name);
-            if (other != comeAndGo.end())
-                laidOut.insert(other->second);
-            EXPECT_EQ(names, laidOut) << name;
         }
     });
 }

@@ -52,15 +52,6 @@ TEST_F(OrvexAppTest, LaunchesBeforeItStartsTheSession)
     EXPECT_EQ(status(), "Connecting...") << "connected, and nothing has arrived";
 }
 
-TEST_F(OrvexAppTest, SaysThatItConnectsWhileTheServiceIsAbsent)
-{
-    telephony.serviceIsAbsent = true;
-    app->applicationDidFinishLaunching();
-    runLoop.runPosted();
-    QCoreApplication::processEvents();
-    EXPECT_EQ(status(), "[busy] Connecting...");
-}
-
 TEST_F(OrvexAppTest, SaysWhenItWasUpdatedAndLeavesAScreenWhoseRowIsGone)
 {
     launchAndShow(2);

@@ -1,4 +1,5 @@
 #include "OrvexConsole.h"
+#include "DisplayTreePrinter.h"
 #include "TerminalFrame.h"
 
 #include "SessionFixture.h"
@@ -77,6 +78,14 @@ TEST_F(OrvexConsoleTest, RedrawsATerminalInPlace)
         "    Version: 3\x1b[K\n"
         "... 3 more lines\x1b[K\n"
         "\x1b[J");
+}
+
+TEST(DisplayTreePrinter, WritesWhatWouldCommandATerminalVisibly)
+{
+    const Value display = Dictionary::make({{"a\nb", "\x1b[2J\t\x7f \xc2\x9b \xc3\xa9 \xc2"}});
+    NodesByPath paths;
+    EXPECT_EQ(DisplayTreePrinter::lines(*OrvexModelNode::makeTreeFromObject(display, paths))[1],
+        "  a\\nb: \\x1b[2J\\t\\x7f \\x9b \xc3\xa9 \xc2");
 }
 
 TEST(TerminalFrame, FillsColumnsDownwardsAndSaysWhatIsMissing)

@@ -126,27 +126,5 @@ TEST_F(OrvexPaneControllerTest, KeepsItsRowsUntilItIsReloaded)
     EXPECT_EQ(top().tableList().rowCount(), 0);
 }
 
-TEST_F(OrvexPaneControllerTest, DrawsManyRowsWithinTheTimeOfAFrame)
-{
-    const auto display = Dictionary::make();
-    for (int row = 0; row < 64; ++row)
-        display->set("Row " + std::to_string(row), "Value of the row " + std::to_string(row * 7919));
-    show(Tree(display));
-    stack->resize(375, 64 * 44 + 88); // all of them in view
-    QImage image(stack->size(), QImage::Format_RGB32);
-    ASSERT_NE(top().tableList().cellAtRow(63), nullptr);
-
-    qint64 best = std::numeric_limits<qint64>::max(); // as other processes take their turns too
-    for (int time = 0; time < 10; ++time) {
-        QElapsedTimer timer;
-        timer.start();
-        top().tableList().render(&image);
-        best = std::min(best, timer.nsecsElapsed());
-    }
-#if !defined(__SANITIZE_ADDRESS__)
-    EXPECT_LT(best, 8'000'000);
-#endif
-}
-
 } // namespace
 } // namespace orvex::test

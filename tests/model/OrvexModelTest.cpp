@@ -3,8 +3,8 @@
 #include "FakeTelephony.h"
 #include "FixedClock.h"
 #include "FixedResources.h"
-#include "PacketText.h"
 #include "ManualRunLoop.h"
+#include "PacketText.h"
 #include "RecordingLog.h"
 
 #include <gmock/gmock.h>

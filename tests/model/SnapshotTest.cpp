@@ -86,17 +86,6 @@ TEST_F(SnapshotTest, SaysWhyAFileIsNone)
     EXPECT_EQ(readSnapshot(directory).error, directory + ": Is a directory");
 }
 
-TEST_F(SnapshotTest, ACutFileGivesOneLineAndNoSnapshot)
-{
-    const std::string path = directory + "/whole.orvex";
-    ASSERT_TRUE(writeSnapshot(someSnapshot(), path));
-    std::ifstream file(path, std::ios::binary);
-    const std::string whole((std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());
-    const std::size_t end = whole.find("</plist>");
-    for (std::size_t length = 0; length < end; length += 7)
-        EXPECT_FALSE(readSnapshot(write(whole.substr(0, length))).snapshot) << length;
-}
-
 // Writes in a child process whose files may not grow beyond this, as on a full disk.
 int statusOfWritingWithin(rlim_t bytes, const std::string& path)
 {
@@ -125,36 +114,6 @@ TEST_F(SnapshotTest, TellsWhenItCouldNotBeWritten)
     EXPECT_EQ(std::filesystem::file_size(full), 100U) << "in place: what fitted is there";
     EXPECT_FALSE(readSnapshot(full).snapshot);
     EXPECT_EQ(statusOfWritingWithin(100'000, full), 0);
-}
-
-TEST_F(SnapshotTest, AWriterKilledInTheMiddleLeavesAFileThatTheReaderCopesWith)
-{
-    Snapshot large = someSnapshot();
-    for (int i = 0; i < 20; ++i)
-        large.data->append(Dictionary::make({{"DLF", std::make_shared<Bytes>(50'000)}}));
-    const std::string path = directory + "/killed.orvex";
-    int halves = 0;
-    for (int i = 0; i < 20; ++i) {
-        const pid_t child = ::fork();
-        if (child == 0) {
-            for (;;)
-                writeSnapshot(large, path);
-        }
-        ::usleep(static_cast<useconds_t>(5'000 + i * 1'700));
-        ::kill(child, SIGKILL);
-        ::waitpid(child, nullptr, 0);
-        const auto [read, error] = readSnapshot(path);
-        if (read) {
-            EXPECT_TRUE(*read->data == *large.data);
-        } else {
-            EXPECT_TRUE(error.starts_with(path + ": ")) << error;
-            EXPECT_EQ(error.find('\n'), std::string::npos);
-            ++halves;
-        }
-    }
-    EXPECT_TRUE(writeSnapshot(large, path)) << "the next one takes its place";
-    EXPECT_TRUE(readSnapshot(path).snapshot);
-    RecordProperty("halves", halves);
 }
 
 TEST(NumberedRows, NoRowHidesAnother)

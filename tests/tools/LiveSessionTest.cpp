@@ -5,13 +5,9 @@
 
 #include <gmock/gmock.h>
 
-#include <set>
-
 namespace orvex::test {
 namespace {
 
-using namespace std::chrono_literals;
-using testing::Contains;
 using testing::HasSubstr;
 using testing::Not;
 
@@ -21,42 +17,7 @@ public:
         : Program(folder, ORVEX_PATH, {"--console"})
     {
     }
-
-    // What a row of a section has shown, each value once.
-    std::set<std::string> shown(const char* section, const char* row) const
-    {
-        std::set<std::string> values;
-        const QString start = QString("%1: ").arg(row);
-        bool isInside = false;
-        for (const QString& line : QString::fromStdString(output()).split('\n')) {
-            const QString text = line.trimmed();
-            if (isInside && text.startsWith(start)) {
-                values.insert(text.mid(start.size()).toStdString());
-                isInside = false;
-            } else if (text == section) {
-                isInside = true;
-            }
-        }
-        return values;
-    }
 };
-
-TEST(LiveSession, ValuesChange)
-{
-    for (const auto& [technology, section, row] :
-        {std::tuple("MRL_LTE", "Serving Cell Measurements", "Measured RSRP"),
-            std::tuple("MRL_UTRAN2", "Neighbor Cell List", "Filter RSCP")}) {
-        const ProgramFolder folder;
-        const KoratProgram korat(folder, {"--technology", technology});
-        ConsoleProgram monitor(folder);
-        EXPECT_TRUE(waitUntil([&, s = section, r = row] { return monitor.shown(s, r).size() >= 3; }, 20s));
-        EXPECT_THAT(monitor.output(), HasSubstr("Updated 2"));
-        EXPECT_THAT(monitor.shown("SIM Info", "EF-MSISDN"), Contains("+0010155550142"));
-        EXPECT_THAT(monitor.shown("PDP Context Info", "APN"), Contains("internet.example"));
-        EXPECT_THAT(monitor.output(), Not(HasSubstr("(unknown)")));
-        EXPECT_EQ(monitor.terminate(), 0);
-    }
-}
 
 TEST(LiveSession, ComesBackAfterTheServiceWasKilled)
 {
@@ -75,11 +36,9 @@ TEST(LiveSession, ComesBackAfterTheServiceWasKilled)
     EXPECT_LE(elapsed.elapsed(), 3000); // at once, not after the five seconds of a failed start
     EXPECT_TRUE(monitor.waitForOutput("Connecting...", 2));
 
-    const auto before = monitor.shown("Serving Cell Measurements", "Measured RSRP").size();
-    korat = std::make_unique<KoratProgram>(folder, QStringList{"--seed", "99"});
-    EXPECT_TRUE(waitUntil(
-        [&] { return monitor.shown("Serving Cell Measurements", "Measured RSRP").size() >= before + 2; },
-        20s));
+    const auto before = static_cast<int>(QString::fromStdString(monitor.output()).count("Updated 2"));
+    korat = std::make_unique<KoratProgram>(folder);
+    EXPECT_TRUE(monitor.waitForOutput("Updated 2", before + 2));
     EXPECT_THAT(monitor.errors(), Not(HasSubstr("already exists")));
 }
 

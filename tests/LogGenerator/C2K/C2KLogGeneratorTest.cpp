@@ -4,8 +4,6 @@
 #include "GSM/GSMLogGenerator.h"
 #include "MRLLogGenerator2.h"
 
-#include "FileResources.h"
-
 #include <gtest/gtest.h>
 
 namespace orvex::test {
@@ -201,35 +199,6 @@ TEST_F(C2KLogGeneratorTest, TechnologiesTakeTurnsOnOneState)
             EXPECT_EQ(state["Display"], Value(Dictionary::make({{"A", "x"}})));
         }
     }
-}
-
-// The texts of a template of texts and dictionaries.
-void collectTexts(const Dictionary& dictionary, std::set<std::string>& texts)
-{
-    for (const auto& entry : dictionary) {
-        if (const auto section = entry.value.dictionary())
-            collectTexts(*section, texts);
-        else
-            texts.insert(*entry.value.string());
-    }
-}
-
-TEST(C2KTemplate, NamesTheKeysThatTheDecodersPublish)
-{
-    const FileResources files(ORVEX_SOURCE_DIR "/resources");
-    std::set<std::string> named;
-    collectTexts(*files.dictionaryNamed("C2KTemplate"), named);
-    EXPECT_EQ(named, (std::set<std::string>(kInternalKeys.begin(), kInternalKeys.end())));
-
-    C2KFixture fixture;
-    for (const char* bytes : {"1183: 00*37", "12B6: 00*12", "108A: 00*10", "134F: 02*173", "1192: 00*228",
-             "127E: 00*1737", "119D: EE 01 EE EE 0B EE 2200 01*30",
-             "119C: EE 04 EE EE 01 EE 2200 01*30 02 EE 2200 01*30 03 EE 2200 01*30 04 EE 0400"})
-        fixture.feed(packetOfText(bytes));
-    std::set<std::string> published;
-    for (const auto& row : *fixture.display)
-        published.insert(row.key);
-    EXPECT_EQ(published, named) << "each has its decoder";
 }
 
 } // namespace

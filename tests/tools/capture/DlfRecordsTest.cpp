@@ -1,6 +1,7 @@
 #include "DlfRecords.h"
 
 #include "DlfBytes.h"
+#include "ScenarioItems.h"
 
 #include <gmock/gmock.h>
 
@@ -11,6 +12,7 @@ namespace orvex {
 namespace {
 
 using namespace test;
+using namespace std::chrono_literals;
 
 constexpr int kNoType = -1;
 
@@ -176,13 +178,58 @@ TEST(DlfRecords, AnythingComesToAnEnd)
         EXPECT_FALSE(recordsOf(Bytes(kLength, byte), skipped).empty()) << int{byte};
 
     std::mt19937 random(7);
-    for (const std::size_t length : {kLength, std::size_t{5000}, std::size_t{100}, std::size_t{1}}) {
-        for (const bool isSnapshot : {false, true}) {
-            Bytes bytes = isSnapshot ? versionReport() : Bytes();
-            std::generate_n(
-                std::back_inserter(bytes), length, [&] { return static_cast<std::uint8_t>(random()); });
-            recordsOf(bytes, skipped);
-            EXPECT_LE(skipped, length);
+    for (const bool isSnapshot : {false, true}) {
+        Bytes bytes = isSnapshot ? versionReport() : Bytes();
+        std::generate_n(
+            std::back_inserter(bytes), kLength, [&] { return static_cast<std::uint8_t>(random()); });
+        recordsOf(bytes, skipped);
+        EXPECT_LE(skipped, kLength);
+    }
+}
+
+// A prefix by the number of the message: -1 none, else the prefix's second byte.
+int prefixOf(const std::string& kind, std::size_t number)
+{
+    if (kind == "none" || (kind == "now and then, any" && number % 3 != 0))
+        return -1;
+    if (kind == "zeros")
+        return 0;
+    return kind == "like a log type" ? (number % 2 == 0 ? 1 : 255) : static_cast<int>(number % 256);
+}
+
+TEST(DlfRecords, OfASnapshotGiveEveryMessageOfEveryScenarioBack)
+{
+    for (const korat::ScenarioEntry& entry : korat::scenarioTable()) {
+        if (entry.make({})->codes().empty())
+            continue; // no packets, so no DLF
+        const auto items = itemsOf(entry, 60s);
+        ASSERT_GT(items.size(), 200U);
+        for (const char* kind : {"none", "zeros", "now and then, any", "like a log type"}) {
+            std::vector<Bytes> messages;
+            for (const auto& [due, message] : items) {
+                const int prefix = prefixOf(kind, messages.size());
+                messages.push_back(prefix < 0 ? Bytes() : Bytes{0x81, static_cast<std::uint8_t>(prefix)});
+                messages.back() += message.bytes;
+            }
+            for (const std::size_t perInterval : {1U, 2U, 7U, 60U}) {
+                SCOPED_TRACE(
+                    testing::Message() << entry.technology << ", prefixes: " << kind << ", " << perInterval);
+                const Bytes dlf = snapshotDlf(messages, perInterval);
+                DlfRecords records(dlf);
+                records.next(); // the version report
+                for (std::size_t i = 0; i < messages.size(); ++i) {
+                    const std::size_t prefix = prefixOf(kind, i) < 0 ? 0 : 2;
+                    const bool losesType = i % perInterval == 0 && prefix == 0;
+                    const auto record = records.next();
+                    ASSERT_TRUE(record) << i;
+                    ASSERT_TRUE(std::ranges::equal(record->bytes, std::span(messages[i]).subspan(prefix + 1)))
+                        << i;
+                    ASSERT_EQ(record->logType, losesType ? std::nullopt : std::optional(messages[i][prefix]))
+                        << i;
+                }
+                EXPECT_FALSE(records.next());
+                EXPECT_EQ(records.skippedBytes(), 0U);
+            }
         }
     }
 }
