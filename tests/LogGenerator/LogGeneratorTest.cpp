@@ -5,11 +5,8 @@
 #include "LTE/LTELogGenerator.h"
 #include "UTRAN/UTRANLogGenerator.h"
 
-#include "Array.h"
 #include "Console.h"
-#include "FixedClock.h"
-#include "FixedResources.h"
-#include "RecordingLog.h"
+#include "GeneratorFixture.h"
 #include "TelephonyConstants.h"
 
 #include <gmock/gmock.h>
@@ -17,36 +14,36 @@
 namespace orvex::test {
 namespace {
 
-TEST(LogGenerator, ChoosesByTheTextOfTheTechnology)
+template <typename Generator>
+bool isMade(const GeneratorFixture& fixture, const Value& technology)
 {
-    const FixedResources resources;
-    const FixedClock clock;
-    const GeneratorEnvironment environment{resources, clock, {}};
-    const auto lte = LogGenerator::generatorFromTechnology(telephony::kTechnologyMRL_LTE, environment);
-    EXPECT_NE(dynamic_cast<LTELogGenerator*>(lte.get()), nullptr);
-    const auto gsm = LogGenerator::generatorFromTechnology(telephony::kTechnologyMRL_GSM, environment);
-    EXPECT_NE(dynamic_cast<MRL_GSMLogGenerator*>(gsm.get()), nullptr);
-    const auto utran = LogGenerator::generatorFromTechnology(telephony::kTechnologyMRL_UTRAN2, environment);
-    EXPECT_NE(dynamic_cast<UTRANLogGenerator*>(utran.get()), nullptr);
-    const auto c2k = LogGenerator::generatorFromTechnology(telephony::kTechnologyMRL_CDMA, environment);
-    EXPECT_NE(dynamic_cast<C2KLogGenerator*>(c2k.get()), nullptr);
-    const auto ifx = LogGenerator::generatorFromTechnology(telephony::kTechnologyIFX, environment);
-    EXPECT_NE(dynamic_cast<GSMLogGenerator*>(ifx.get()), nullptr);
+    const auto generator = LogGenerator::generatorFromTechnology(technology, fixture.environment());
+    return dynamic_cast<Generator*>(generator.get()) != nullptr;
+}
+
+class LogGeneratorTest : public GeneratorFixture { };
+
+TEST_F(LogGeneratorTest, ChoosesByTheTextOfTheTechnology)
+{
+    EXPECT_TRUE(isMade<LTELogGenerator>(*this, telephony::kTechnologyMRL_LTE));
+    EXPECT_TRUE(isMade<MRL_GSMLogGenerator>(*this, telephony::kTechnologyMRL_GSM));
+    EXPECT_TRUE(isMade<UTRANLogGenerator>(*this, telephony::kTechnologyMRL_UTRAN2));
+    EXPECT_TRUE(isMade<C2KLogGenerator>(*this, telephony::kTechnologyMRL_CDMA));
+    EXPECT_TRUE(isMade<GSMLogGenerator>(*this, telephony::kTechnologyIFX));
     for (const Value& unknown : {Value("MRL_LTE "), Value("mrl_lte"), Value(""), Value(), Value(1)})
-        EXPECT_EQ(LogGenerator::generatorFromTechnology(unknown, environment), nullptr);
+        EXPECT_FALSE(isMade<LogGenerator>(*this, unknown));
 }
 
 // What a generator with this many sections says from its birth to its end.
 template <typename Generator>
-void expectLife(const std::string& name, std::size_t sections, const std::string& indexName)
+void expectLife(const GeneratorEnvironment& environment, const std::string& name, std::size_t sections,
+    const std::string& indexName)
 {
     using testing::StartsWith;
-    const FixedResources resources;
-    const FixedClock clock;
     RecordingLog log;
     std::vector<std::string> console;
     installConsole([&console](std::string_view line) { console.emplace_back(line); });
-    Generator::generator({resources, clock, {}});
+    Generator::generator(environment);
     installConsole({});
 
     std::vector<testing::Matcher<std::string>> expected(
@@ -60,20 +57,20 @@ void expectLife(const std::string& name, std::size_t sections, const std::string
     EXPECT_EQ(console, (std::vector<std::string>{"Deallocing " + indexName, "Deallocing ClassIndex"}));
 }
 
-TEST(MarlinGenerators, TellOfTheirBirthAndTheirEnd)
+TEST_F(LogGeneratorTest, MarlinGeneratorsTellOfTheirBirthAndTheirEnd)
 {
-    expectLife<LTELogGenerator>("LTELogGenerator", 11, "LTEClassIndex");
-    expectLife<MRL_GSMLogGenerator>("MRL_GSMLogGenerator", 26, "MRL_GSMClassIndex");
+    expectLife<LTELogGenerator>(environment(), "LTELogGenerator", 11, "LTEClassIndex");
+    expectLife<MRL_GSMLogGenerator>(environment(), "MRL_GSMLogGenerator", 26, "MRL_GSMClassIndex");
 }
 
-TEST(LogGenerator, HistoryKeepsTheNewestFive)
+TEST_F(LogGeneratorTest, HistoryKeepsTheNewestFive)
 {
     for (const int before : {0, 4, 5, 7}) {
         const auto history = Array::make();
         for (int i = 0; i < before; ++i)
             history->append(i);
-        Dictionary state{{"History", history}};
-        LogGenerator::updateHistoryInState(state, FixedClock());
+        Dictionary from{{"History", history}};
+        LogGenerator::updateHistoryInState(from, clock);
         const int kept = std::min(before, 4);
         ASSERT_EQ(history->size(), static_cast<std::size_t>(kept + 1)) << before;
         for (int i = 0; i < kept; ++i)
@@ -82,50 +79,37 @@ TEST(LogGenerator, HistoryKeepsTheNewestFive)
     }
 }
 
-TEST(LogGenerator, HistoryEntryEndsAtTheFirstAbsentValue)
+TEST_F(LogGeneratorTest, HistoryEntryIsAShallowCopyUpToTheFirstAbsentValue)
 {
-    const std::vector<const char*> keys = {"DisplayState", "Display", "ExtraInfo"};
-    const struct {
-        const char* absent;
-        std::vector<std::string> entryKeys;
-    } cases[] = {
-        {"", {"DisplayState", "Display", "ExtraInfo", "Date", "Description"}},
-        {"DisplayState", {}},
-        {"Display", {"DisplayState"}},
-        {"ExtraInfo", {"DisplayState", "Display"}},
+    const std::pair<const char*, const char*> cases[] = {
+        {"",
+            "DisplayState=(data), Display={Section={Row=new}}, ExtraInfo={}, Date=2023-11-14 22:13:20 +0000, "
+            "Description=Snapshot (2023-11-14 22:13:20 +0000)"},
+        {"DisplayState", ""},
+        {"Display", "DisplayState=(data)"},
+        {"ExtraInfo", "DisplayState=(data), Display={Section={Row=new}}"},
     };
-    for (const auto& [absent, entryKeys] : cases) {
-        Dictionary state;
-        for (const char* key : keys) {
-            if (absent != std::string_view(key))
-                state.set(key, Dictionary::make());
-        }
-        LogGenerator::updateHistoryInState(state, FixedClock());
+    for (const auto& [absent, expected] : cases) {
+        clearState();
+        const auto section = Dictionary::make({{"Row", "old"}});
+        const auto laidOut = Dictionary::make({{"Section", section}});
+        state.set("DisplayState", std::make_shared<Bytes>(3));
+        state.set("Display", laidOut);
+        state.set("ExtraInfo", Dictionary::make());
+        state.remove(absent);
+        LogGenerator::updateHistoryInState(state, clock);
+        // Nested sections go on changing, the dictionary itself does not.
+        section->set("Row", "new");
+        laidOut->set("Other", "later");
+        if (const auto messages = state["DisplayState"].data())
+            messages->push_back(1);
         ASSERT_EQ(state["History"].array()->size(), 1U) << absent;
-        std::vector<std::string> found;
-        for (const auto& entry : *(*state["History"].array())[0].dictionary())
-            found.push_back(entry.key);
-        EXPECT_EQ(found, entryKeys) << absent;
+        const auto entry = (*state["History"].array())[0].dictionary();
+        EXPECT_EQ(shown(*entry), expected) << absent;
+        if (const auto messages = (*entry)["DisplayState"].data()) {
+            EXPECT_EQ(messages->size(), 3U);
+        }
     }
-}
-
-TEST(LogGenerator, HistoryEntryIsAShallowCopyWithItsDate)
-{
-    const auto section = Dictionary::make({{"Row", "old"}});
-    const auto display = Dictionary::make({{"Section", section}});
-    Dictionary state{{"DisplayState", std::make_shared<Bytes>(3)}, {"Display", display},
-        {"ExtraInfo", Dictionary::make()}};
-    LogGenerator::updateHistoryInState(state, FixedClock());
-    section->set("Row", "new");
-    display->set("Other", "later");
-    state["DisplayState"].data()->push_back(1);
-
-    const auto entry = (*state["History"].array())[0].dictionary();
-    EXPECT_EQ((*entry)["Display"], Value(Dictionary::make({{"Section", Dictionary::make({{"Row", "new"}})}})))
-        << "nested sections go on changing, the dictionary itself does not";
-    EXPECT_EQ((*entry)["DisplayState"].data()->size(), 3U);
-    EXPECT_EQ((*entry)["Date"], Value("2023-11-14 22:13:20 +0000"));
-    EXPECT_EQ((*entry)["Description"], Value("Snapshot (2023-11-14 22:13:20 +0000)"));
 }
 
 } // namespace

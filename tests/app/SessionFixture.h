@@ -5,8 +5,8 @@
 #include "FakeTelephony.h"
 #include "FixedClock.h"
 #include "FixedResources.h"
-#include "PacketText.h"
 #include "ManualRunLoop.h"
+#include "PacketText.h"
 
 #include "Array.h"
 #include "Dictionary.h"

@@ -100,43 +100,6 @@ TEST(KoratProcess, ServesOneClientAtATime)
     EXPECT_TRUE(korat.waitForError("org.orvex.Test.Client has left; sent 1 messages"));
 }
 
-TEST(KoratProcess, RequestsThatMakeNoSenseAreRefused)
-{
-    const ProgramFolder folder;
-    const KoratProgram korat(folder);
-    SocketMessagePorts ports(folder.ports());
-    const auto service = ports.createRemotePort(telephony::kServicePortName);
-    ASSERT_TRUE(service);
-    const Value create = telephony::kCreateLogChannelRequest;
-    const std::pair<Value, int> cases[] = {
-        {Array::make({"Request"}), EINVAL},
-        {Dictionary::make({{"Request", "Dial"}, {"PortName", "a"}}), EINVAL},
-        {Dictionary::make({{"Request", create}}), EINVAL},
-        {Dictionary::make({{"Request", create}, {"PortName", "org.orvex.Test.Nobody"}}), ENOENT},
-    };
-    for (const auto& [request, error] : cases) {
-        const Bytes bytes = *propertyListXML(request);
-        SCOPED_TRACE(std::string(bytes.begin(), bytes.end()));
-        const auto result = service->request(
-            telephony::kCreateLogChannelMessageId, bytes, std::chrono::seconds(1), std::chrono::seconds(5));
-        ASSERT_TRUE(result.reply);
-        EXPECT_EQ((*propertyListFromData(*result.reply).value->dictionary())["ErrorCode"], Value(error));
-    }
-}
-
-TEST(KoratProcess, DiesWhenAsked)
-{
-    const ProgramFolder folder;
-    KoratProgram korat(folder, {"--fault", "die-after=0.3"});
-    turnFor(std::chrono::milliseconds(500));
-    EXPECT_TRUE(korat.isRunning()); // the time counts from the first channel on
-    KoratClient client(folder.ports());
-    ASSERT_EQ(client.open(), 0);
-    EXPECT_EQ(korat.waitForEnd(), 1);
-    EXPECT_THAT(korat.errors(), HasSubstr("dying"));
-    EXPECT_TRUE(waitUntil([&] { return !client.isServed(); }));
-}
-
 TEST(KoratProcess, ASecondServiceFindsThePlaceTakenAndLeavesTheRecordingAlone)
 {
     const ProgramFolder folder;

@@ -63,21 +63,5 @@ TEST(GarbageSource, NothingOfItIsFatalToAGenerator)
     }
 }
 
-TEST(GarbageSource, KnowsWhatReceiversReadAsPropertyLists)
-{
-    const auto isRead = [](Bytes bytes, std::size_t length) {
-        bytes.resize(length);
-        return isReadAsPropertyList(bytes);
-    };
-    const Bytes prefixed{0x81, 0, 255, 0, 0, 0};
-    EXPECT_TRUE(isRead({255, 0, 0, 2, 0}, 13));
-    EXPECT_TRUE(isRead(prefixed, 13));
-    EXPECT_FALSE(isRead({255, 0, 0, 0, 0}, 12));
-    EXPECT_FALSE(isRead(prefixed, 12));
-    EXPECT_FALSE(isRead({255, 0, 0, 3, 0}, 40));
-    EXPECT_FALSE(isRead({255, 0, 0, 1, 1}, 40));
-    EXPECT_FALSE(isRead({1, 0, 0, 0, 0}, 40));
-}
-
 } // namespace
 } // namespace orvex::korat

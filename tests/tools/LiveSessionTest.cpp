@@ -1,6 +1,5 @@
 // The whole road with real programs: koratd, and the monitor in a terminal.
 
-#include "KoratClient.h"
 #include "KoratProgram.h"
 
 #include <gmock/gmock.h>
@@ -70,22 +69,6 @@ TEST(LiveSession, GarbageIsSurvived)
     EXPECT_THAT(monitor.errors(), HasSubstr("Invalid log type"));
     EXPECT_EQ(monitor.terminate(), 0);
     EXPECT_GT(korat.terminateAndCount(), 5000);
-}
-
-TEST(LiveSession, SeveralMonitorsOneAfterAnother)
-{
-    const ProgramFolder folder;
-    KoratProgram korat(folder, {"--rate", "100"});
-    for (int run = 1; run <= 3; ++run) {
-        ConsoleProgram monitor(folder);
-        EXPECT_TRUE(monitor.waitForOutput("Updated 2")) << "run " << run << ": " << monitor.errors();
-        EXPECT_EQ(KoratClient(folder.ports()).open(), EBUSY);
-        if (run == 2)
-            monitor.kill();
-        else
-            EXPECT_EQ(monitor.terminate(), 0);
-        EXPECT_TRUE(korat.waitForError("has left; sent ", run));
-    }
 }
 
 } // namespace

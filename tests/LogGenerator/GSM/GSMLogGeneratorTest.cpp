@@ -15,76 +15,67 @@ public:
         const std::string list = "<plist version=\"1.0\">" + inner + "</plist>";
         return {list.begin(), list.end()};
     }
-    Value displayAfter(const std::string& inner)
-    {
-        generator.updateState(state, message(inner));
-        return generator.generateLogUsingState(state);
-    }
 
     GSMLogGenerator generator{environment()};
 };
 
-std::string dict(const std::vector<std::pair<const char*, std::string>>& entries)
+// A property list of a tree as text: "{A=x, B=[h, y]}".
+std::string listOf(std::string_view& tree)
 {
-    std::string result = "<dict>";
-    for (const auto& [key, value] : entries)
-        result += std::string("<key>") + key + "</key>" + value;
-    return result + "</dict>";
-}
-std::string string(const std::string& text)
-{
-    return "<string>" + text + "</string>";
-}
-std::string array(const std::string& elements)
-{
-    return "<array>" + elements + "</array>";
+    const bool isDictionary = tree.starts_with('{');
+    if (!isDictionary && !tree.starts_with('[')) {
+        const std::string_view word = tree.substr(0, tree.find_first_of(",]}"));
+        tree.remove_prefix(word.size());
+        return "<string>" + std::string(word) + "</string>";
+    }
+    std::string result;
+    tree.remove_prefix(1);
+    while (!tree.starts_with('}') && !tree.starts_with(']')) {
+        if (tree.starts_with(", "))
+            tree.remove_prefix(2);
+        if (isDictionary) {
+            result += "<key>" + std::string(1, tree[0]) + "</key>";
+            tree.remove_prefix(2);
+        }
+        result += listOf(tree);
+    }
+    tree.remove_prefix(1);
+    return isDictionary ? "<dict>" + result + "</dict>" : "<array>" + result + "</array>";
 }
 
 TEST_F(GSMLogGeneratorTest, SimplifiesTheNesting)
 {
-    const auto x = string("x");
-    const auto y = string("y");
-    const auto h = string("h");
-    const auto only = [](const Value& value) { return Value(Dictionary::make({{"A", value}})); };
     const struct {
-        const char* name;
-        std::string message;
-        Value display;
+        std::string_view message;
+        const char* display;
     } cases[] = {
-        {"text alone", x, "x"},
-        {"top level stays", dict({{"A", x}}), only("x")},
-        {"one entry collapses", dict({{"A", dict({{"B", x}})}}), only("x")},
-        {"so does a chain", dict({{"A", dict({{"B", dict({{"C", dict({{"D", x}})}})}})}}), only("x")},
-        {"two entries do not", dict({{"A", dict({{"B", x}, {"C", y}})}}),
-            only(Dictionary::make({{"B", "x"}, {"C", "y"}}))},
-        {"two entries under one", dict({{"A", dict({{"B", dict({{"C", x}, {"D", y}})}})}}),
-            only(Dictionary::make({{"C", "x"}, {"D", "y"}}))},
-        {"none does not", dict({{"A", dict({})}}), only(Dictionary::make())},
-        {"array loses its first", dict({{"A", array(h + x + y)}}), only(Array::make({"x", "y"}))},
-        {"and its only one", dict({{"A", array(h)}}), only(Array::make())},
-        {"empty array", dict({{"A", array("")}}), only(Array::make())},
-        {"entry within an array", dict({{"A", array(h + dict({{"B", x}}))}}), only(Array::make({"x"}))},
-        {"array within an entry", dict({{"A", dict({{"B", array(h + x)}})}}), only(Array::make({"x"}))},
-        {"array within an array", array(h + array(h + x)), Array::make({Array::make({"x"})})},
-        {"what is left out counts", dict({{"A", dict({{"B", array(h)}, {"C", x}})}}),
-            only(Dictionary::make({{"B", Array::make()}, {"C", "x"}}))},
+        {"x", "x"}, {"{A=x}", "{A=x}"}, // the top level stays
+        {"{A={B=x}}", "{A=x}"}, {"{A={B={C={D=x}}}}", "{A=x}"}, {"{A={B=x, C=y}}", "{A={B=x, C=y}}"},
+        {"{A={B={C=x, D=y}}}", "{A={C=x, D=y}}"}, {"{A={}}", "{A={}}"},
+        {"{A=[h, x, y]}", "{A=[x | y]}"}, // without its first
+        {"{A=[h]}", "{A=[]}"}, {"{A=[]}", "{A=[]}"}, {"{A=[h, {B=x}]}", "{A=[x]}"},
+        {"{A={B=[h, x]}}", "{A=[x]}"}, {"[h, [h, x]]", "[[x]]"},
+        {"{A={B=[h], C=x}}", "{A={B=[], C=x}}"}, // what is left out counts
     };
-    for (const auto& [name, message, display] : cases)
-        EXPECT_EQ(displayAfter(message), display) << name;
-    EXPECT_EQ(generator.canCollapse(only("x")), Value("x"));
+    for (auto [tree, expected] : cases) {
+        generator.updateState(state, message(listOf(tree)));
+        EXPECT_EQ(shown(generator.generateLogUsingState(state)), expected);
+    }
+    const Value only = Dictionary::make({{"A", "x"}});
+    EXPECT_EQ(generator.canCollapse(only), Value("x"));
     EXPECT_TRUE(generator.canCollapse("x").isNull());
 }
 
 TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheDisplay)
 {
     EXPECT_TRUE(generator.generateLogUsingState(state).isNull());
-    generator.updateState(state, message(dict({{"A", string("first")}})));
+    generator.updateState(state, message("<dict><key>A</key><string>first</string></dict>"));
     state.set("ExtraInfo", Dictionary::make({{"of", "another"}}));
-    EXPECT_EQ(displayAfter(dict({{"B", array(string("h") + string("x"))}})),
-        Value(Dictionary::make({{"B", Array::make({"x"})}})));
-    EXPECT_EQ(state["DisplayState"], Value(Dictionary::make({{"B", Array::make({"h", "x"})}})))
-        << "as it came";
-    EXPECT_EQ(state["ExtraInfo"], Value(Dictionary::make()));
+    std::string_view second = "{B=[h, x]}";
+    generator.updateState(state, message(listOf(second)));
+    EXPECT_EQ(shown(generator.generateLogUsingState(state)), "{B=[x]}");
+    EXPECT_EQ(shown(state["DisplayState"]), "{B=[h | x]}") << "as it came";
+    EXPECT_EQ(shown(state["ExtraInfo"]), "{}");
 
     const auto saved = generator.getSaveContentsFromState(state);
     ASSERT_EQ(saved->size(), 2U);
@@ -105,10 +96,11 @@ TEST_F(GSMLogGeneratorTest, OtherMessagesAreFatal)
         int line;
     } cases[] = {
         {"<integer>1</integer>", "Unknown object of type integer encountered", 78},
-        {dict({{"A", dict({{"B", "<real>1</real>"}})}}), "Unknown object of type real encountered", 78},
-        {array(string("h") + "<true/>"), "Unknown object of type boolean encountered", 78},
-        {dict({{"A", "<data>AAAA</data>"}}), "Unknown object of type data encountered", 78},
-        {dict({{"A", "<date>2020-01-01T00:00:00Z</date>"}}), "Unknown object of type date encountered", 78},
+        {"<dict><key>A</key><real>1</real></dict>", "Unknown object of type real encountered", 78},
+        {"<array><string>h</string><true/></array>", "Unknown object of type boolean encountered", 78},
+        {"<array><true/><data>AAAA</data></array>", "Unknown object of type data encountered", 78},
+        {"<array><true/><date>2020-01-01T00:00:00Z</date></array>", "Unknown object of type date encountered",
+            78},
         {"<dict>", unreadable, 90},
         {deep, unreadable, 90},
     };
@@ -126,7 +118,7 @@ TEST_F(GSMLogGeneratorTest, OtherMessagesAreFatal)
         }
     }
     EXPECT_THROW(generator.updateState(state, {}), AssertionFailure);
-    EXPECT_NO_THROW(generator.updateState(state, message(array("<true/>"))))
+    EXPECT_NO_THROW(generator.updateState(state, message("<array><true/></array>")))
         << "nobody looks at a first element";
     EXPECT_EQ(*generator.getStartCommand(), Dictionary({{"SetState", "Streaming"}}));
 }

@@ -3,7 +3,6 @@
 #include "scenarios/ScenarioTable.h"
 
 #include "DecodeProgram.h"
-#include "PacketText.h"
 #include "PcapFile.h"
 
 #include "TextFormat.h"
@@ -92,27 +91,6 @@ TEST_F(SnapshotDecodeTest, SaysInOneLineWhyASnapshotCannotBeRead)
     EXPECT_EQ(result.output, "");
     EXPECT_THAT(result.errors, testing::StartsWith("orvex-decode: " + path("broken.orvex") + ": "));
     EXPECT_EQ(std::count(result.errors.begin(), result.errors.end(), '\n'), 1) << result.errors;
-}
-
-TEST_F(SnapshotDecodeTest, MessagesWhoseLengthLeadsNowhereAreLeftOut)
-{
-    Bytes messages = packet(0xB0C1, {0, 1, 2, 3, 4, 5, 6, 4, 8});
-    messages[1] = 21;
-    messages[2] = 0;
-    messages.insert(messages.end(), 30, 0); // a packet of no length
-    const std::string base64 =
-        QByteArray::fromRawData(reinterpret_cast<const char*>(messages.data()), std::ssize(messages))
-            .toBase64()
-            .toStdString();
-    const std::string list = "<plist version=\"1.0\"><dict><key>Timestamp</key><string>t</string>"
-                             "<key>Description</key><string/><key>Data</key><array><dict>"
-                             "<key>Description</key><string>one</string><key>DisplayState</key><data>"
-        + base64 + "</data></dict></array></dict></plist>";
-    const Result result = decode({"--technology", "MRL_LTE", "--resources", ORVEX_RESOURCES,
-        QString::fromStdString(file("odd.orvex", Bytes(list.begin(), list.end())))});
-    EXPECT_EQ(result.status, 0);
-    EXPECT_THAT(result.output, HasSubstr("Num Tx Antennas: 4\n"));
-    EXPECT_THAT(result.errors, HasSubstr("one: 30 bytes that make no message were left out\n"));
 }
 
 } // namespace
