@@ -23,8 +23,9 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     const QCommandLineOption open(QStringLiteral("open"), {}, QStringLiteral("FILE"));
     const QCommandLineOption light(QStringLiteral("light"));
     const QCommandLineOption dark(QStringLiteral("dark"));
+    const QCommandLineOption untilPainted(QStringLiteral("until-painted"));
     QCommandLineParser parser;
-    parser.addOptions({help, version, console, resources, open, light, dark});
+    parser.addOptions({help, version, console, resources, open, light, dark, untilPainted});
 
     // parse() rather than process(), which would end the program in its own way.
     if (!parser.parse(arguments))
@@ -42,6 +43,7 @@ CommandLine CommandLine::parse(const QStringList& arguments)
         result.action = Action::version;
     else if (parser.isSet(console))
         result.action = Action::console;
+    result.endsWhenPainted = parser.isSet(untilPainted);
     if (parser.isSet(light))
         result.theme = Theme::Mode::light;
     if (parser.isSet(dark))
@@ -63,6 +65,7 @@ std::string CommandLine::usage()
            "  --open FILE      Show a saved snapshot instead of a session.\n"
            "  --resources DIR  Take the section templates from this directory.\n"
            "  --light, --dark  Choose the colours. Default: as the desktop has them.\n"
+           "  --until-painted  Say when the window has been painted first, and end.\n"
            "  -h, --help       Show this help and exit.\n"
            "  -v, --version    Show the version and exit.\n";
 }

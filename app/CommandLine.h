@@ -17,6 +17,7 @@ struct CommandLine {
     Theme::Mode theme = Theme::Mode::system;
     std::optional<std::string> resources; // a directory in place of the default one
     std::optional<std::string> snapshot;  // a file to show in place of a session
+    bool endsWhenPainted = false;         // for measuring how long the start takes
     std::string error;                    // with wrongUsage: one line
 
     // The arguments as the program got them, its own name first.

@@ -1,6 +1,7 @@
 // orvex: the window, or with --console the terminal, on the handset's baseband.
 
 #include "CommandLine.h"
+#include "FirstPaint.h"
 #include "OrvexApp.h"
 #include "OrvexConsole.h"
 #include "SnapshotViewer.h"
@@ -32,6 +33,7 @@
 #include <cstdlib>
 #include <filesystem>
 #include <functional>
+#include <optional>
 #include <unistd.h>
 
 namespace {
@@ -133,12 +135,21 @@ int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<in
     return body();
 }
 
-int runWindow(int argc, char** argv, const std::string& resourceDirectory, Theme::Mode theme)
+int runWindow(
+    int argc, char** argv, const std::string& resourceDirectory, Theme::Mode theme, bool endsWhenPainted)
 {
-    return runInWindow(argc, argv, theme, [&resourceDirectory] {
+    return runInWindow(argc, argv, theme, [&resourceDirectory, endsWhenPainted] {
         LinuxPlatform platform(resourceDirectory);
         const auto app = OrvexApp::create(platform.forApp());
         const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
+        std::optional<FirstPaint> firstPaint;
+        if (endsWhenPainted) {
+            firstPaint.emplace([] {
+                std::puts("painted");
+                std::fflush(stdout);
+                QCoreApplication::quit();
+            });
+        }
         app->applicationDidFinishLaunching();
         const int status = QApplication::exec();
         app->applicationWillTerminate();
@@ -196,7 +207,7 @@ int main(int argc, char** argv)
             return showSnapshot(argc, argv, commandLine);
         return commandLine.action == CommandLine::Action::console
             ? runConsole(argc, argv, directory)
-            : runWindow(argc, argv, directory, commandLine.theme);
+            : runWindow(argc, argv, directory, commandLine.theme, commandLine.endsWhenPainted);
     };
     const int status = run();
     SystemLog::install(nullptr);

@@ -14,6 +14,7 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         Action action;
         Mode theme = Mode::system;
         std::optional<std::string> resources = {};
+        bool endsWhenPainted = false;
     } cases[] = {
         {{}, Action::window},
         {{"--console"}, Action::console},
@@ -22,6 +23,7 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         {{"--version", "--console"}, Action::version},
         {{"--resources", "/a b", "--dark"}, Action::window, Mode::dark, "/a b"},
         {{"--resources=x", "--light"}, Action::window, Mode::light, "x"},
+        {{"--until-painted"}, Action::window, Mode::system, {}, true},
         {{"--resources"}, Action::wrongUsage},
         {{"--no-such"}, Action::wrongUsage},
         {{"--console=yes"}, Action::wrongUsage},
@@ -34,6 +36,7 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         EXPECT_EQ(result.action, test.action);
         EXPECT_EQ(result.theme, test.theme);
         EXPECT_EQ(result.resources, test.resources);
+        EXPECT_EQ(result.endsWhenPainted, test.endsWhenPainted);
         EXPECT_EQ(result.error.empty(), test.action != Action::wrongUsage);
     }
 }

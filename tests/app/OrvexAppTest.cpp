@@ -3,6 +3,7 @@
 #include "PaneFixture.h"
 #include "SessionFixture.h"
 
+#include "FirstPaint.h"
 #include "FixedPaths.h"
 
 #include <filesystem>
@@ -50,6 +51,19 @@ TEST_F(OrvexAppTest, LaunchesBeforeItStartsTheSession)
     EXPECT_EQ(status(), "[busy] Connecting");
     QCoreApplication::processEvents(); // the stack tells of its root
     EXPECT_EQ(status(), "Connecting...") << "connected, and nothing has arrived";
+}
+
+TEST_F(OrvexAppTest, TellsOnceThatItsWindowWasPainted)
+{
+    int times = 0;
+    const FirstPaint firstPaint([&times] { ++times; });
+    QCoreApplication::processEvents();
+    EXPECT_EQ(times, 0) << "there is no window";
+    app->applicationDidFinishLaunching();
+    EXPECT_TRUE(QTest::qWaitFor([&times] { return times > 0; }));
+    app->window()->repaint();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(times, 1);
 }
 
 TEST_F(OrvexAppTest, SaysWhenItWasUpdatedAndLeavesAScreenWhoseRowIsGone)

@@ -18,6 +18,14 @@ public:
     }
 };
 
+TEST(LiveSession, EndsWhenItsWindowWasPaintedIfItIsTo)
+{
+    const ProgramFolder folder;
+    Program monitor(folder, ORVEX_PATH, {"--until-painted"});
+    EXPECT_EQ(monitor.waitForEnd(), 0) << monitor.errors();
+    EXPECT_EQ(monitor.output(), "painted\n");
+}
+
 TEST(LiveSession, ComesBackAfterTheServiceWasKilled)
 {
     const ProgramFolder folder;
