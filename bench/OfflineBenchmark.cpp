@@ -1,0 +1,125 @@
+// orvex-decode as it is started from a shell: a large capture and what memory it takes, and several captures
+// side by side.
+
+#include "Benchmarks.h"
+#include "ChildProcess.h"
+#include "RecordedStream.h"
+
+#include "PcapWriter.h"
+
+#include "TelephonyConstants.h"
+
+#include <benchmark/benchmark.h>
+
+#include <chrono>
+#include <filesystem>
+#include <thread>
+
+namespace orvex::bench {
+namespace {
+
+using Arguments = std::vector<std::string>;
+
+constexpr std::size_t kPcapRecordHeader = 16;
+constexpr std::size_t kPartMiB = 64;
+constexpr std::size_t kParts = 4;
+
+std::string theDirectory; // where captures are written
+
+// A capture of so many MiB: the recorded stream of LTE, again and again. It goes with the object.
+class LargeCapture {
+public:
+    explicit LargeCapture(std::size_t miB)
+        : _path(theDirectory + "/bench-" + std::to_string(miB) + ".pcap")
+    {
+        PcapWriter file(_path);
+        std::size_t bytes = 0;
+        while (bytes < miB << 20) {
+            for (const Bytes& message : recordedStream("lte")) {
+                file.write(message, std::chrono::microseconds(++_messageCount));
+                bytes += message.size() + kPcapRecordHeader;
+            }
+        }
+    }
+    ~LargeCapture() { std::filesystem::remove(_path); }
+    LargeCapture(const LargeCapture&) = delete;
+    LargeCapture& operator=(const LargeCapture&) = delete;
+
+    const std::string& path() const { return _path; }
+    std::size_t messageCount() const { return _messageCount; }
+
+private:
+    std::string _path;
+    std::size_t _messageCount = 0;
+};
+
+struct Run {
+    double seconds;
+    double peakMiB;
+};
+
+// Decodes the captures. No seconds when the program failed.
+Run decode(Arguments options)
+{
+    Arguments arguments = {ORVEX_DECODE, "--technology", telephony::kTechnologyMRL_LTE, "--refresh-every",
+        "1000", "--output", "/dev/null"};
+    arguments.insert(arguments.end(), options.begin(), options.end());
+    const auto start = std::chrono::steady_clock::now();
+    ChildProcess program(arguments);
+    const auto end = program.waitForEnd();
+    const double seconds = std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+    return {end.isGood ? seconds : 0, static_cast<double>(end.peakKiB) / 1024};
+}
+
+void decodeCapture(benchmark::State& state, std::size_t miB)
+{
+    const LargeCapture capture(miB);
+    for (auto _ : state) {
+        const Run run = decode({capture.path()});
+        if (run.seconds == 0)
+            return state.SkipWithError("orvex-decode failed");
+        state.SetIterationTime(run.seconds);
+        state.counters["messages/s"] = static_cast<double>(capture.messageCount()) / run.seconds;
+        state.counters["peak MiB"] = run.peakMiB;
+    }
+}
+
+// The same captures with one worker and with one for each core.
+void decodeSeveral(benchmark::State& state)
+{
+    const LargeCapture capture(kPartMiB);
+    const std::size_t cores = std::max(1U, std::thread::hardware_concurrency());
+    const auto withJobs = [&](std::size_t jobs) {
+        Arguments arguments = {"--jobs", std::to_string(jobs)};
+        arguments.insert(arguments.end(), std::max(kParts, cores), capture.path());
+        return decode(arguments).seconds;
+    };
+    for (auto _ : state) {
+        const double one = withJobs(1);
+        const double all = withJobs(cores);
+        if (one == 0 || all == 0)
+            return state.SkipWithError("orvex-decode failed");
+        state.SetIterationTime(all);
+        state.counters["speed-up"] = one / all;
+    }
+}
+
+} // namespace
+
+void registerOffline(const std::string& directory, std::size_t captureMiB)
+{
+    theDirectory = directory;
+    for (const auto& [name, miB] : {std::pair("offline/small", kPartMiB), {"offline/large", captureMiB}})
+        benchmark::RegisterBenchmark(name, decodeCapture, miB)
+            ->Unit(benchmark::kSecond)
+            ->UseManualTime()
+            ->Iterations(1)
+            ->Repetitions(1);
+    benchmark::RegisterBenchmark("offline/jobs", decodeSeveral)
+        ->Unit(benchmark::kSecond)
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Repetitions(1);
+}
+
+} // namespace orvex::bench

@@ -1,0 +1,146 @@
+// The message port, from another process to the decoded message: how many in a second when the sender never
+// rests, and how long one is on the way when nothing else is.
+
+#include "Benchmarks.h"
+#include "ChildProcess.h"
+#include "PortMessage.h"
+#include "RecordedStream.h"
+
+#include "SocketMessagePorts.h"
+
+#include "Array.h"
+#include "TelephonyConstants.h"
+
+#include <benchmark/benchmark.h>
+
+#include <QEventLoop>
+#include <QTemporaryDir>
+#include <QTimer>
+
+#include <algorithm>
+#include <cstring>
+#include <vector>
+
+namespace orvex::bench {
+namespace {
+
+using Nanoseconds = std::chrono::nanoseconds;
+
+constexpr const char* kPortName = "org.orvex.Bench";
+constexpr auto kLongestWait = std::chrono::seconds(60);
+
+// When a message was sent, and when it was decoded.
+struct Trip {
+    Nanoseconds sent;
+    Nanoseconds decoded;
+};
+
+// The receiving application: a port, a generator, and a note of every message.
+class Receiver {
+public:
+    explicit Receiver(std::size_t count)
+        : _count(count)
+    {
+        _trips.reserve(count);
+    }
+
+    // Starts a sender and takes what it sends. Empty when something else than all its messages arrived whole.
+    const std::vector<Trip>& run(std::chrono::microseconds pause)
+    {
+        const std::string directory = _directory.filePath("ports").toStdString();
+        SocketMessagePorts ports(directory);
+        const auto port =
+            ports.createLocalPort(kPortName, [this](std::int32_t, ByteView message) -> std::optional<Bytes> {
+                take(message);
+                return std::nullopt;
+            });
+        ChildProcess sender({ORVEX_BENCH_SENDER, directory, kPortName, std::to_string(_count),
+            std::to_string(pause.count())});
+        QTimer::singleShot(kLongestWait, &_loop, &QEventLoop::quit);
+        _loop.exec();
+        if (!sender.waitForEnd().isGood || !isWhole())
+            _trips.clear();
+        return _trips;
+    }
+
+private:
+    void take(ByteView message)
+    {
+        _generator->updateState(*_state, message);
+        Nanoseconds::rep sent = 0;
+        std::memcpy(&sent, message.data() + kPortMessageTime, sizeof sent);
+        _trips.push_back({Nanoseconds(sent), Nanoseconds(portTime())});
+        if (_trips.size() % kRefreshEvery == 0)
+            _generator->generateLogUsingState(*_state);
+        if (_trips.size() == _count)
+            _loop.quit();
+    }
+
+    bool isWhole() const
+    {
+        const auto display = (*_state)["Display"].dictionary();
+        const auto list = display ? (*display)["Neighbor Cells List"].array() : nullptr;
+        return _trips.size() == _count && list && list->size() == kPortMessageNeighbors;
+    }
+
+    // As a session would at this pace.
+    static constexpr std::size_t kRefreshEvery = 400'000;
+
+    std::size_t _count;
+    QTemporaryDir _directory;
+    QEventLoop _loop;
+    std::unique_ptr<LogGenerator> _generator = makeGenerator(telephony::kTechnologyMRL_LTE);
+    DictionaryRef _state = Dictionary::make();
+    std::vector<Trip> _trips;
+};
+
+double seconds(Nanoseconds time)
+{
+    return std::chrono::duration<double>(time).count();
+}
+
+void portThroughput(benchmark::State& state)
+{
+    constexpr std::size_t kCount = 400'000;
+    for (auto _ : state) {
+        Receiver receiver(kCount);
+        const auto& trips = receiver.run(std::chrono::microseconds(0));
+        if (trips.empty())
+            return state.SkipWithError("messages were lost");
+        const double time = seconds(trips.back().decoded - trips.front().decoded);
+        state.SetIterationTime(time);
+        state.counters["messages/s"] = kCount / time;
+    }
+}
+
+void portLatency(benchmark::State& state)
+{
+    constexpr std::size_t kCount = 1000;
+    for (auto _ : state) {
+        Receiver receiver(kCount);
+        std::vector<Nanoseconds> times;
+        for (const Trip& trip : receiver.run(std::chrono::milliseconds(2)))
+            times.push_back(trip.decoded - trip.sent);
+        if (times.empty())
+            return state.SkipWithError("messages were lost");
+        std::ranges::sort(times);
+        state.SetIterationTime(seconds(times[kCount / 2]));
+        state.counters["slowest 1 % µs"] = seconds(times[kCount / 100 * 99]) * 1e6;
+    }
+}
+
+} // namespace
+
+void registerPorts()
+{
+    benchmark::RegisterBenchmark("port", portThroughput)
+        ->Unit(benchmark::kMillisecond)
+        ->UseManualTime()
+        ->Iterations(1);
+    benchmark::RegisterBenchmark("port/idle", portLatency)
+        ->Unit(benchmark::kMicrosecond)
+        ->UseManualTime()
+        ->Iterations(1);
+}
+
+} // namespace orvex::bench

@@ -1,0 +1,61 @@
+#include "RecordedStream.h"
+
+#include "FileResources.h"
+#include "SystemClock.h"
+#include "scenarios/ScenarioTable.h"
+
+#include "Console.h"
+#include "TelephonyConstants.h"
+
+#include <benchmark/benchmark.h>
+
+#include <algorithm>
+#include <map>
+#include <string_view>
+
+namespace orvex::bench {
+
+namespace {
+constexpr std::size_t kMessageCount = 20'000;
+} // namespace
+
+const Technology kTechnologies[kTechnologyCount] = {
+    {"lte", telephony::kTechnologyMRL_LTE},
+    {"utran", telephony::kTechnologyMRL_UTRAN2},
+    {"gsm", telephony::kTechnologyMRL_GSM},
+    {"cdma", telephony::kTechnologyMRL_CDMA},
+    {"ifx", telephony::kTechnologyIFX},
+};
+
+const std::vector<Bytes>& recordedStream(const Technology& technology)
+{
+    static std::map<std::string_view, std::vector<Bytes>> streams;
+    const auto [stream, isNew] = streams.try_emplace(technology.identifier);
+    if (isNew) {
+        const auto scenario = korat::findScenario(technology.identifier, "")->make({});
+        while (stream->second.size() < kMessageCount)
+            stream->second.push_back(scenario->next().message.bytes);
+    }
+    return stream->second;
+}
+
+const std::vector<Bytes>& recordedStream(const char* name)
+{
+    return recordedStream(*std::ranges::find(kTechnologies, std::string_view(name), &Technology::name));
+}
+
+std::unique_ptr<LogGenerator> makeGenerator(const char* identifier)
+{
+    static const FileResources kResources(ORVEX_RESOURCES);
+    static const SystemClock kClock;
+    installConsole([](std::string_view) {});
+    return LogGenerator::generatorFromTechnology(identifier, {kResources, kClock, {}});
+}
+
+void countMessages(benchmark::State& state, std::size_t messagesPerIteration)
+{
+    const auto count = static_cast<double>(state.iterations()) * static_cast<double>(messagesPerIteration);
+    state.counters["messages/s"] = benchmark::Counter(count, benchmark::Counter::kIsRate);
+}
+
+} // namespace orvex::bench

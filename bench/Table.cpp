@@ -1,0 +1,193 @@
+#include "Table.h"
+
+#include "TextFormat.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace orvex::bench {
+
+namespace {
+
+enum class Unit { perSecond, milliseconds, microseconds, mebibytes, times, percent };
+
+// A figure that was measured: the time of a benchmark, or one of its counters.
+struct Figure {
+    const char* benchmark;
+    const char* counter; // null: the time
+};
+
+// What a figure is to reach: so much, or so many times another figure.
+struct Bound {
+    enum class Kind { none, atLeast, atMost } kind = Kind::none;
+    double factor = 0;
+    Figure of = {nullptr, nullptr}; // without a benchmark the factor is the bound
+};
+
+struct Row {
+    const char* what;
+    Unit unit;
+    Figure figure;
+    const char* copyFloor = nullptr; // with which the figure can be compared
+    Bound bound = {};
+};
+
+constexpr const char* kRate = "messages/s";
+constexpr const char* kPeak = "peak MiB";
+constexpr const char* kPrintFloor = "print";
+
+constexpr Bound atLeast(double factor, Figure of = {nullptr, nullptr})
+{
+    return {Bound::Kind::atLeast, factor, of};
+}
+constexpr Bound atMost(double factor, Figure of = {nullptr, nullptr})
+{
+    return {Bound::Kind::atMost, factor, of};
+}
+constexpr Bound kDecodeBound = atLeast(1.5, {kPrintFloor, kRate});
+
+constexpr Row kRows[] = {
+    {"floor: copy, LTE", Unit::perSecond, {"copy/lte", kRate}},
+    {"floor: copy, UTRAN", Unit::perSecond, {"copy/utran", kRate}},
+    {"floor: copy, GSM/UMTS", Unit::perSecond, {"copy/gsm", kRate}},
+    {"floor: copy, CDMA2000", Unit::perSecond, {"copy/cdma", kRate}},
+    {"floor: copy, IFX", Unit::perSecond, {"copy/ifx", kRate}},
+    {"floor: print", Unit::perSecond, {kPrintFloor, kRate}},
+
+    {"decode LTE", Unit::perSecond, {"decode/lte", kRate}, "copy/lte", kDecodeBound},
+    {"decode UTRAN", Unit::perSecond, {"decode/utran", kRate}, "copy/utran", kDecodeBound},
+    {"decode GSM/UMTS", Unit::perSecond, {"decode/gsm", kRate}, "copy/gsm", kDecodeBound},
+    {"decode CDMA2000", Unit::perSecond, {"decode/cdma", kRate}, "copy/cdma", kDecodeBound},
+    {"decode IFX", Unit::perSecond, {"decode/ifx", kRate}, "copy/ifx", kDecodeBound},
+
+    {"decode LTE, log file", Unit::perSecond, {"decode+file/lte", kRate}, "copy/lte",
+        atLeast(1.0 / 3, {"decode/lte", kRate})},
+    {"decode UTRAN, log file", Unit::perSecond, {"decode+file/utran", kRate}, "copy/utran",
+        atLeast(1.0 / 3, {"decode/utran", kRate})},
+    {"decode GSM/UMTS, log file", Unit::perSecond, {"decode+file/gsm", kRate}, "copy/gsm",
+        atLeast(1.0 / 3, {"decode/gsm", kRate})},
+    {"decode CDMA2000, log file", Unit::perSecond, {"decode+file/cdma", kRate}, "copy/cdma",
+        atLeast(1.0 / 3, {"decode/cdma", kRate})},
+    {"decode IFX, log file", Unit::perSecond, {"decode+file/ifx", kRate}, "copy/ifx",
+        atLeast(1.0 / 3, {"decode/ifx", kRate})},
+
+    {"decode LTE, log queue", Unit::perSecond, {"decode+queue/lte", kRate}, "copy/lte",
+        atLeast(1.0 / 3, {"decode/lte", kRate})},
+    {"— lines that were not dropped", Unit::percent, {"decode+queue/lte", "kept %"}},
+    {"decode UTRAN, log queue", Unit::perSecond, {"decode+queue/utran", kRate}, "copy/utran",
+        atLeast(1.0 / 3, {"decode/utran", kRate})},
+    {"— lines that were not dropped", Unit::percent, {"decode+queue/utran", "kept %"}},
+    {"decode GSM/UMTS, log queue", Unit::perSecond, {"decode+queue/gsm", kRate}, "copy/gsm",
+        atLeast(1.0 / 3, {"decode/gsm", kRate})},
+    {"— lines that were not dropped", Unit::percent, {"decode+queue/gsm", "kept %"}},
+    {"decode CDMA2000, log queue", Unit::perSecond, {"decode+queue/cdma", kRate}, "copy/cdma",
+        atLeast(1.0 / 3, {"decode/cdma", kRate})},
+    {"— lines that were not dropped", Unit::percent, {"decode+queue/cdma", "kept %"}},
+    {"decode IFX, log queue", Unit::perSecond, {"decode+queue/ifx", kRate}, "copy/ifx",
+        atLeast(1.0 / 3, {"decode/ifx", kRate})},
+    {"— lines that were not dropped", Unit::percent, {"decode+queue/ifx", "kept %"}},
+
+    {"rebuild the tree, LTE", Unit::microseconds, {"rebuild/lte", nullptr}},
+    {"rebuild the tree, UTRAN", Unit::microseconds, {"rebuild/utran", nullptr}},
+    {"rebuild the tree, GSM/UMTS", Unit::microseconds, {"rebuild/gsm", nullptr}},
+    {"rebuild the tree, CDMA2000", Unit::microseconds, {"rebuild/cdma", nullptr}},
+    {"rebuild the tree, IFX", Unit::microseconds, {"rebuild/ifx", nullptr}},
+    {"rebuild the fullest tree, GSM/UMTS", Unit::microseconds, {"rebuild/fullest", nullptr}, nullptr,
+        atMost(150e-6)},
+
+    {"refresh to painted, 64 rows", Unit::milliseconds, {"paint/handset", nullptr}, nullptr, atMost(8e-3)},
+    {"— all of them in view", Unit::milliseconds, {"paint/all rows", nullptr}, nullptr, atMost(8e-3)},
+    {"start to first window painted", Unit::milliseconds, {"start/alone", nullptr}, nullptr, atMost(150e-3)},
+    {"— beside a service that answers", Unit::milliseconds, {"start/service", nullptr}, nullptr,
+        atMost(150e-3)},
+
+    {"message port, process to decoded", Unit::perSecond, {"port", kRate}, "copy/lte", atLeast(200e3)},
+    {"— median latency when idle", Unit::microseconds, {"port/idle", nullptr}, nullptr, atMost(100e-6)},
+
+    {"orvex-decode, large capture", Unit::perSecond, {"offline/large", kRate}, "copy/lte", atLeast(1e6)},
+    {"— most memory it held", Unit::mebibytes, {"offline/large", kPeak}, nullptr,
+        atMost(1.1, {"offline/small", kPeak})},
+    {"orvex-decode, capture of 64 MiB", Unit::perSecond, {"offline/small", kRate}, "copy/lte", atLeast(1e6)},
+    {"— most memory it held", Unit::mebibytes, {"offline/small", kPeak}},
+    {"orvex-decode, a job for each core", Unit::times, {"offline/jobs", "speed-up"}},
+};
+
+std::optional<double> valueOf(const Results& results, const Figure& figure)
+{
+    return figure.counter ? results.counter(figure.benchmark, figure.counter)
+                          : results.seconds(figure.benchmark);
+}
+
+// Three digits that count.
+std::string digits(double value)
+{
+    const int decimals =
+        value <= 0 ? 0 : std::clamp(2 - static_cast<int>(std::floor(std::log10(value))), 0, 3);
+    return text("%.*f", decimals, value);
+}
+
+std::string textOf(double value, Unit unit)
+{
+    switch (unit) {
+    case Unit::perSecond: return value >= 1e6 ? digits(value / 1e6) + " M/s" : digits(value / 1e3) + " k/s";
+    case Unit::milliseconds: return digits(value * 1e3) + " ms";
+    case Unit::microseconds: return digits(value * 1e6) + " µs";
+    case Unit::mebibytes: return digits(value) + " MiB";
+    case Unit::times: return digits(value) + " ×";
+    case Unit::percent: return digits(value) + " %";
+    }
+    return {};
+}
+
+// Of a rate: how many times the floor's. Of a time: how many messages the floor does meanwhile.
+std::string ratioTo(const Results& results, const char* floor, double value, Unit unit)
+{
+    const auto rate = floor ? results.counter(floor, kRate) : std::nullopt;
+    if (!rate)
+        return {};
+    if (unit == Unit::perSecond)
+        return digits(value / *rate) + " ×";
+    if (unit == Unit::milliseconds || unit == Unit::microseconds)
+        return text("%.0f msg", value * *rate);
+    return {};
+}
+
+struct Verdict {
+    std::string bound;
+    const char* isMet;
+};
+
+Verdict verdictOn(const Results& results, const Row& row, double value)
+{
+    const Bound& bound = row.bound;
+    const auto base = bound.of.benchmark ? valueOf(results, bound.of) : std::optional(1.0);
+    if (bound.kind == Bound::Kind::none || !base)
+        return {"", ""};
+    const double limit = bound.factor * *base;
+    const bool isLowest = bound.kind == Bound::Kind::atLeast;
+    return {(isLowest ? "≥ " : "≤ ") + textOf(limit, row.unit),
+        (isLowest ? value >= limit : value <= limit) ? "yes" : "**no**"};
+}
+
+} // namespace
+
+std::string markdownTable(const Results& results)
+{
+    std::string table = "| what | figure | of copy | of print | bound | met |\n|---|--:|--:|--:|--:|---|\n";
+    for (const Row& row : kRows) {
+        if (!results.hasRun(row.figure.benchmark))
+            continue;
+        const auto value = valueOf(results, row.figure);
+        if (!value) {
+            table += text("| %s | failed | | | | |\n", row.what);
+            continue;
+        }
+        const auto [bound, isMet] = verdictOn(results, row, *value);
+        table += text("| %s | %s | %s | %s | %s | %s |\n", row.what, textOf(*value, row.unit).c_str(),
+            ratioTo(results, row.copyFloor, *value, row.unit).c_str(),
+            ratioTo(results, kPrintFloor, *value, row.unit).c_str(), bound.c_str(), isMet);
+    }
+    return table;
+}
+
+} // namespace orvex::bench

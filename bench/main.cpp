@@ -1,0 +1,68 @@
+// orvex_bench: all benchmarks, or those that --benchmark_filter names. scripts/bench runs it.
+//
+//   --table=FILE      write the table of figures into this file
+//   --capture-mib=N   size of the large capture, 1024 without the option
+//   --directory=DIR   where captures are written for a while; the current one without the option
+
+#include "Benchmarks.h"
+#include "Table.h"
+
+#include "Console.h"
+
+#include <benchmark/benchmark.h>
+
+#include <QApplication>
+#include <QString>
+
+#include <cstdio>
+#include <fstream>
+#include <string_view>
+
+namespace {
+
+// Takes "--name=VALUE" off the arguments.
+std::string takeOption(int& argc, char** argv, std::string_view name, std::string usual)
+{
+    for (int i = 1; i < argc; ++i) {
+        const std::string_view argument = argv[i];
+        if (!argument.starts_with(name))
+            continue;
+        usual = argument.substr(name.size());
+        std::copy(argv + i + 1, argv + argc + 1, argv + i);
+        --argc;
+    }
+    return usual;
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    using namespace orvex::bench;
+    const std::string table = takeOption(argc, argv, "--table=", "");
+    const std::string directory = takeOption(argc, argv, "--directory=", ".");
+    const std::size_t captureMiB = std::stoul(takeOption(argc, argv, "--capture-mib=", "1024"));
+
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    const QApplication application(argc, argv);
+    registerFloors();
+    registerDecoding();
+    registerLoggedDecoding();
+    registerRebuilding();
+    registerPainting();
+    registerStarting();
+    registerPorts();
+    registerOffline(directory, captureMiB);
+
+    benchmark::Initialize(&argc, argv);
+    if (benchmark::ReportUnrecognizedArguments(argc, argv))
+        return EXIT_FAILURE;
+    Results results;
+    benchmark::RunSpecifiedBenchmarks(&results);
+    orvex::installConsole({});
+    if (table.empty())
+        return EXIT_SUCCESS;
+    std::ofstream file(table);
+    file << markdownTable(results) << std::flush;
+    return file ? EXIT_SUCCESS : EXIT_FAILURE;
+}
