@@ -14,6 +14,8 @@ namespace {
 constexpr const char* kTechnologies[] = {telephony::kTechnologyIFX, telephony::kTechnologyMRL_GSM,
     telephony::kTechnologyMRL_CDMA, telephony::kTechnologyMRL_LTE, telephony::kTechnologyMRL_UTRAN2};
 
+constexpr int kMostJobs = 256;
+
 DecodeOptions wrongUsage(const QString& error)
 {
     DecodeOptions result;
@@ -40,6 +42,16 @@ std::optional<std::string> valueOf(const QCommandLineParser& parser, const QComm
     return parser.value(option).toStdString();
 }
 
+// False when the option is there and its value is no number from 1 on.
+bool readNumber(const QCommandLineParser& parser, const QCommandLineOption& option, std::size_t& number)
+{
+    if (!parser.isSet(option))
+        return true;
+    bool isNumber = false;
+    number = parser.value(option).toULongLong(&isNumber);
+    return isNumber && number > 0;
+}
+
 } // namespace
 
 DecodeOptions DecodeOptions::parse(int count, char** arguments)
@@ -58,9 +70,10 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
     const QCommandLineOption snapshot = withValue("snapshot");
     const QCommandLineOption description = withValue("description");
     const QCommandLineOption dlf = withValue("dlf");
+    const QCommandLineOption jobs = withValue("jobs");
     QCommandLineParser parser;
     parser.addOptions({help, version, technology, format, refreshEvery, resources, output, log, snapshot,
-        description, dlf});
+        description, dlf, jobs});
 
     QStringList list;
     for (int i = 0; i < count; ++i)
@@ -94,12 +107,10 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
         else if (parser.value(format) != QLatin1String("tree"))
             return wrongUsage(QStringLiteral("Unknown format '%1'.").arg(parser.value(format)));
     }
-    if (parser.isSet(refreshEvery)) {
-        bool isNumber = false;
-        result.refreshEvery = parser.value(refreshEvery).toULongLong(&isNumber);
-        if (!isNumber || result.refreshEvery == 0)
-            return wrongUsage(QStringLiteral("--refresh-every takes a number of messages from 1 on."));
-    }
+    if (!readNumber(parser, refreshEvery, result.refreshEvery))
+        return wrongUsage(QStringLiteral("--refresh-every takes a number of messages from 1 on."));
+    if (!readNumber(parser, jobs, result.jobs) || result.jobs > kMostJobs)
+        return wrongUsage(QStringLiteral("--jobs takes a number from 1 to %1.").arg(kMostJobs));
     result.resources = valueOf(parser, resources);
     result.outputFile = valueOf(parser, output);
     result.logFile = valueOf(parser, log);
@@ -110,6 +121,11 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
         return wrongUsage(QStringLiteral("--snapshot saves what captures hold, not another snapshot."));
     if (parser.isSet(description) && !result.snapshotFile)
         return wrongUsage(QStringLiteral("--description goes with --snapshot."));
+    if (result.jobs > 0 && result.areSnapshots)
+        return wrongUsage(QStringLiteral("--jobs decodes captures, not snapshots."));
+    if (result.jobs > 0 && result.snapshotFile)
+        return wrongUsage(
+            QStringLiteral("--snapshot saves one session; with --jobs each capture has its own."));
     if (result.dlfFile && (!result.areSnapshots || result.captures.size() > 1))
         return wrongUsage(QStringLiteral("--dlf takes the binary log out of one snapshot."));
     return result;
@@ -131,6 +147,9 @@ const char* DecodeOptions::usage()
            "  --format tree|json   How to print the tree. Default: tree.\n"
            "  --refresh-every N    Ask for the display after every N messages too, as a session\n"
            "                       does every two seconds. Default: at the end alone.\n"
+           "  --jobs N             Decode each capture in a session of its own, N of them at a time,\n"
+           "                       and print their trees one after another, in order. Without it\n"
+           "                       one session takes all captures, and prints one tree.\n"
            "  --output FILE        Print into this file.\n"
            "  --log FILE           Write every line of the system log into this file, as\n"
            "                       <PRIORITY>TEXT.\n"

@@ -25,6 +25,7 @@ struct DecodeOptions {
     std::string description;                 // the user's words in it
     std::optional<std::string> dlfFile;      // of a snapshot: where its binary log goes
     std::vector<std::string> captures;
+    std::size_t jobs = 0;      // 0: one session takes all captures; else each has its own, so many at a time
     bool areSnapshots = false; // the captures, all of them
 
     // The arguments as the program got them, its own name first.

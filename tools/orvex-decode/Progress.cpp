@@ -11,15 +11,19 @@ namespace {
 constexpr std::uintmax_t kLargeJob = std::uintmax_t{64} << 20;
 constexpr std::uintmax_t kStep = std::uintmax_t{8} << 20;
 constexpr std::size_t kPcapRecordHeader = 16;
+
+std::uintmax_t sizeOf(const std::string& capture)
+{
+    std::error_code unreadable;
+    const std::uintmax_t size = std::filesystem::file_size(capture, unreadable);
+    return unreadable ? 0 : size;
+}
 } // namespace
 
 Progress::Progress(const std::vector<std::string>& captures)
 {
-    for (const std::string& capture : captures) {
-        std::error_code unreadable;
-        const std::uintmax_t size = std::filesystem::file_size(capture, unreadable);
-        _totalBytes += unreadable ? 0 : size;
-    }
+    for (const std::string& capture : captures)
+        _totalBytes += sizeOf(capture);
     _isShown = _totalBytes >= kLargeJob && isatty(STDERR_FILENO) == 1;
 }
 
@@ -31,7 +35,17 @@ Progress::~Progress()
 
 void Progress::advance(std::size_t messageLength)
 {
-    _bytes += messageLength + kPcapRecordHeader;
+    advanceBy(messageLength + kPcapRecordHeader);
+}
+
+void Progress::advanceOverFile(const std::string& capture)
+{
+    advanceBy(sizeOf(capture));
+}
+
+void Progress::advanceBy(std::uintmax_t bytes)
+{
+    _bytes += bytes;
     if (!_isShown || _bytes < _nextShown)
         return;
     _nextShown = _bytes + kStep;

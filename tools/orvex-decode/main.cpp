@@ -1,7 +1,9 @@
+#include "CaptureJobs.h"
 #include "CaptureReader.h"
 #include "DecodeOptions.h"
 #include "OfflineSession.h"
 #include "Progress.h"
+#include "Reporting.h"
 #include "SnapshotDocument.h"
 #include "TreeJson.h"
 
@@ -17,10 +19,6 @@
 
 #include <nlohmann/json.hpp>
 
-#include <cerrno>
-#include <cstdio>
-#include <cstring>
-#include <fstream>
 #include <iostream>
 
 using namespace orvex;
@@ -29,12 +27,6 @@ namespace {
 
 constexpr int kFailure = 1;
 constexpr int kWrongUsage = 2;
-
-bool complain(const std::string& message)
-{
-    std::cerr << "orvex-decode: " << message << '\n';
-    return false;
-}
 
 // Feeds the messages of one capture. False, after a line on standard error, when it could not be read whole.
 bool feed(OfflineSession& session, const std::string& path, Progress& progress)
@@ -53,21 +45,6 @@ bool feed(OfflineSession& session, const std::string& path, Progress& progress)
     const std::size_t whole = session.messageCount() - before;
     return complain(
         reader->error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
-}
-
-bool write(const std::string& path, std::string_view content)
-{
-    std::ofstream file(path, std::ios::binary);
-    file << content << std::flush;
-    return file ? true : complain(path + ": " + std::strerror(errno));
-}
-
-bool print(const std::string& document, const DecodeOptions& options)
-{
-    if (options.outputFile)
-        return write(*options.outputFile, document);
-    std::cout << document << std::flush;
-    return std::cout ? true : complain("standard output: could not be written");
 }
 
 std::string textOf(const Value& display, DecodeOptions::Format format)
@@ -116,7 +93,7 @@ int decodeCaptures(const DecodeOptions& options)
     // What could be read is shown, whatever could not; but nothing at all is no document.
     if (!isGood && session.messageCount() == 0)
         return kFailure;
-    isGood = print(textOf(session.display(), options.format), options) && isGood;
+    isGood = printDocument(textOf(session.display(), options.format), options) && isGood;
     if (options.snapshotFile)
         isGood = save(session, begun, options) && isGood;
     return isGood ? 0 : kFailure;
@@ -126,7 +103,7 @@ bool extractDlf(const SnapshotDocument& document, const DecodeOptions& options)
 {
     if (!document.dlf())
         return complain(options.captures.front() + ": holds no binary log");
-    return write(
+    return writeFile(
         *options.dlfFile, {reinterpret_cast<const char*>(document.dlf()->data()), document.dlf()->size()});
 }
 
@@ -157,7 +134,32 @@ int showSnapshots(const DecodeOptions& options)
     }
     if (tree.empty() && json.empty())
         return kFailure;
-    return print(isJson ? documentText({{"snapshots", json}}) : tree, options) && isGood ? 0 : kFailure;
+    return printDocument(isJson ? documentText({{"snapshots", json}}) : tree, options) && isGood ? 0
+                                                                                                 : kFailure;
+}
+
+// Decodes what the options name, with the log that they want.
+int decode(const DecodeOptions& options)
+{
+    std::unique_ptr<FileSystemLog> log;
+    if (options.logFile) {
+        log = std::make_unique<FileSystemLog>(*options.logFile);
+        if (!log->error().empty()) {
+            complain(log->error());
+            return kFailure;
+        }
+        SystemLog::install(log.get());
+    }
+    int status = options.areSnapshots ? showSnapshots(options) : decodeCaptures(options);
+    SystemLog::install(nullptr);
+    if (log) {
+        log->flush();
+        if (!log->error().empty()) {
+            complain(log->error());
+            status = kFailure;
+        }
+    }
+    return status;
 }
 
 } // namespace
@@ -177,22 +179,5 @@ int main(int argc, char** argv)
 
     installConsole([](std::string_view) {}); // standard output carries the document alone
     installFatalErrorHandler();
-    std::unique_ptr<FileSystemLog> log;
-    if (options.logFile) {
-        log = std::make_unique<FileSystemLog>(*options.logFile);
-        SystemLog::install(log.get());
-    }
-    const bool canLog = !log || log->error().empty() || complain(log->error());
-    int status = kFailure;
-    if (canLog)
-        status = options.areSnapshots ? showSnapshots(options) : decodeCaptures(options);
-    SystemLog::install(nullptr);
-    if (log && canLog) {
-        log->flush();
-        if (!log->error().empty()) {
-            complain(log->error());
-            status = kFailure;
-        }
-    }
-    return status;
+    return options.jobs > 0 ? decodeInJobs(options, decode) : decode(options);
 }

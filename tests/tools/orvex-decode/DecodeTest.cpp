@@ -146,7 +146,11 @@ TEST_F(DecodeTest, WrongUsageIsAnsweredWithTheRightOne)
         {"--technology", "MRL_LTE", "--refresh-every", "0", "x.pcap"}, {"--nonsense"},
         {"--technology", "MRL_LTE", "x.orvex", "x.pcap"}, {"--snapshot", "y.orvex", "x.orvex"},
         {"--technology", "MRL_LTE", "--dlf", "y", "x.pcap"}, {"--dlf", "y", "x.orvex", "z.orvex"},
-        {"--technology", "MRL_LTE", "--description", "y", "x.pcap"}, {"--technology", "GSM", "x.orvex"}};
+        {"--technology", "MRL_LTE", "--description", "y", "x.pcap"},
+        {"--technology", "MRL_LTE", "--jobs", "0", "x.pcap"},
+        {"--technology", "MRL_LTE", "--jobs", "2", "x.orvex"},
+        {"--technology", "MRL_LTE", "--jobs", "2", "--snapshot", "y", "x.pcap"},
+        {"--technology", "GSM", "x.orvex"}};
     for (const QStringList& arguments : cases) {
         const Result result = decode(arguments);
         EXPECT_EQ(result.status, 2) << arguments.join(' ').toStdString();

@@ -1,0 +1,19 @@
+#pragma once
+
+#include "DecodeOptions.h"
+
+#include <string>
+#include <string_view>
+
+namespace orvex {
+
+// What the decoder says and writes. All return whether it is well.
+
+// One line on standard error. False, always.
+bool complain(const std::string& message);
+// Replaces the file.
+bool writeFile(const std::string& path, std::string_view content);
+// Where the options want the document to go.
+bool printDocument(const std::string& document, const DecodeOptions& options);
+
+} // namespace orvex

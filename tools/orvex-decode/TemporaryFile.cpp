@@ -1,0 +1,53 @@
+#include "TemporaryFile.h"
+
+#include <array>
+#include <cerrno>
+#include <system_error>
+
+#include <unistd.h>
+
+namespace orvex {
+
+namespace {
+using Chunk = std::array<char, 65536>;
+} // namespace
+
+TemporaryFile::TemporaryFile()
+    : _file(std::tmpfile())
+{
+    if (!_file)
+        throw std::system_error(errno, std::generic_category(), "temporary file");
+}
+
+void TemporaryFile::takePlaceOf(int descriptor) const
+{
+    dup2(fileno(_file.get()), descriptor);
+}
+
+std::string TemporaryFile::path() const
+{
+    return "/dev/fd/" + std::to_string(fileno(_file.get()));
+}
+
+std::string TemporaryFile::contents() const
+{
+    std::string result;
+    Chunk chunk;
+    std::rewind(_file.get());
+    while (const std::size_t length = std::fread(chunk.data(), 1, chunk.size(), _file.get()))
+        result.append(chunk.data(), length);
+    return result;
+}
+
+bool TemporaryFile::appendTo(std::FILE* stream) const
+{
+    Chunk chunk;
+    std::rewind(_file.get());
+    while (const std::size_t length = std::fread(chunk.data(), 1, chunk.size(), _file.get())) {
+        if (std::fwrite(chunk.data(), 1, length, stream) != length)
+            return false;
+    }
+    return true;
+}
+
+} // namespace orvex

@@ -1,0 +1,35 @@
+#pragma once
+
+#include <cstdio>
+#include <memory>
+#include <string>
+
+namespace orvex {
+
+// A file without a name, gone when nobody has it open any more. A worker process writes into it what its
+// parent reads afterwards.
+class TemporaryFile {
+public:
+    TemporaryFile();
+
+    // Makes it what the descriptor, of standard output say, leads to.
+    void takePlaceOf(int descriptor) const;
+    // A path under which this process and its children can open it.
+    std::string path() const;
+
+    std::string contents() const;
+    // False when the stream could not be written.
+    bool appendTo(std::FILE* stream) const;
+
+private:
+    struct Close {
+        void operator()(std::FILE* file) const
+        {
+            std::fclose(file);
+        } // NOLINT(cppcoreguidelines-owning-memory)
+    };
+
+    std::unique_ptr<std::FILE, Close> _file;
+};
+
+} // namespace orvex
