@@ -101,6 +101,7 @@ void decodeSeveral(benchmark::State& state)
             return state.SkipWithError("orvex-decode failed");
         state.SetIterationTime(all);
         state.counters["speed-up"] = one / all;
+        state.counters["cores"] = static_cast<double>(cores);
     }
 }
 

@@ -109,7 +109,8 @@ constexpr Row kRows[] = {
         atMost(1.1, {"offline/small", kPeak})},
     {"orvex-decode, capture of 64 MiB", Unit::perSecond, {"offline/small", kRate}, "copy/lte", atLeast(1e6)},
     {"— most memory it held", Unit::mebibytes, {"offline/small", kPeak}},
-    {"orvex-decode, a job for each core", Unit::times, {"offline/jobs", "speed-up"}},
+    {"orvex-decode, a job for each core", Unit::times, {"offline/jobs", "speed-up"}, nullptr,
+        atLeast(0.9, {"offline/jobs", "cores"})},
 };
 
 std::optional<double> valueOf(const Results& results, const Figure& figure)
