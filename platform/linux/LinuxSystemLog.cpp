@@ -28,7 +28,7 @@ void writeToSyslog(const QueuedSystemLog::Lines& lines)
     for (const auto& line : lines) {
         // Bits beyond those of a severity name a facility there, and are meant to.
         syslog(static_cast<int>(line.priority), "%.*s",
-            static_cast<int>(std::min(line.text.size(), kLongest)), line.text.c_str());
+            static_cast<int>(std::min(line.text.size(), kLongest)), line.text.data());
     }
 }
 } // namespace

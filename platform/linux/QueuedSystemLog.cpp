@@ -2,10 +2,19 @@
 
 #include "TextFormat.h"
 
+#include <chrono>
 #include <csignal>
 #include <utility>
 
 namespace orvex {
+
+namespace {
+using namespace std::chrono_literals;
+
+// How long the thread lets lines gather once the first has come, and how many of them it waits for at most.
+constexpr auto kMoment = 1ms;
+constexpr std::size_t kManyLines = QueuedSystemLog::kMostLines / 4;
+} // namespace
 
 void appendLogLine(std::string& text, Priority priority, std::string_view line)
 {
@@ -15,6 +24,30 @@ void appendLogLine(std::string& text, Priority priority, std::string_view line)
     text += line;
     if (!line.ends_with('\n'))
         text += '\n';
+}
+
+void QueuedSystemLog::Batch::append(Priority priority, std::string_view line)
+{
+    text += line;
+    entries.push_back({priority, line.size()});
+}
+
+void QueuedSystemLog::Batch::clear()
+{
+    text.clear();
+    entries.clear();
+}
+
+QueuedSystemLog::Lines QueuedSystemLog::Batch::lines() const
+{
+    Lines result;
+    result.reserve(entries.size());
+    std::size_t start = 0;
+    for (const auto& [priority, length] : entries) {
+        result.push_back({priority, std::string_view(text).substr(start, length)});
+        start += length;
+    }
+    return result;
 }
 
 QueuedSystemLog::QueuedSystemLog(std::function<void(const Lines&)> writer)
@@ -35,24 +68,24 @@ QueuedSystemLog::~QueuedSystemLog()
         const std::lock_guard lock(_mutex);
         _isEnding = true;
     }
-    _changed.notify_all();
+    _queued.notify_one();
     _thread.join();
 }
 
 void QueuedSystemLog::write(Priority priority, std::string_view line)
 {
+    std::size_t count = 0;
     {
         const std::lock_guard lock(_mutex);
-        if (_queue.size() >= kMostLines || _queuedBytes + line.size() > kMostBytes) {
+        if (_queue.entries.size() >= kMostLines || _queue.text.size() + line.size() > kMostBytes) {
             ++_dropped;
             return;
         }
-        _queuedBytes += line.size();
-        _queue.push_back({priority, std::string(line)});
-        if (_queue.size() > 1)
-            return; // the thread has been told
+        _queue.append(priority, line);
+        count = _queue.entries.size();
     }
-    _changed.notify_all();
+    if (count == 1 || count == kManyLines)
+        _queued.notify_one();
 }
 
 void QueuedSystemLog::flush()
@@ -60,26 +93,33 @@ void QueuedSystemLog::flush()
     if (std::this_thread::get_id() == _thread.get_id())
         return; // the process is ending from inside the writer
     std::unique_lock lock(_mutex);
-    _changed.wait(lock, [this] { return _queue.empty() && _dropped == 0 && !_isWriting; });
+    ++_flushes;
+    _queued.notify_one();
+    _written.wait(lock, [this] { return _queue.entries.empty() && _dropped == 0 && !_isWriting; });
+    --_flushes;
 }
 
 void QueuedSystemLog::run()
 {
+    Batch batch; // takes turns with the queue, so that both keep their storage
     std::unique_lock lock(_mutex);
     for (;;) {
-        _changed.wait(lock, [this] { return _isEnding || !_queue.empty() || _dropped > 0; });
-        if (_queue.empty() && _dropped == 0)
+        const auto isIdle = [this] { return _queue.entries.empty() && _dropped == 0; };
+        _queued.wait(lock, [&] { return _isEnding || !isIdle(); });
+        if (isIdle())
             return;
-        Lines lines = std::exchange(_queue, {});
-        _queuedBytes = 0;
+        _queued.wait_for(
+            lock, kMoment, [this] { return isHurried() || _queue.entries.size() >= kManyLines; });
+        std::swap(batch, _queue);
         if (const std::size_t dropped = std::exchange(_dropped, 0); dropped > 0)
-            lines.push_back({Priority::warning, text("%zu log lines were dropped", dropped)});
+            batch.append(Priority::warning, text("%zu log lines were dropped", dropped));
         _isWriting = true;
         lock.unlock();
-        _writer(lines);
+        _writer(batch.lines());
+        batch.clear();
         lock.lock();
         _isWriting = false;
-        _changed.notify_all();
+        _written.notify_all();
     }
 }
 

@@ -69,7 +69,7 @@ TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
                 go.get_future().wait();
             }
             for (const auto& line : lines)
-                written.push_back(line.text);
+                written.emplace_back(line.text);
         });
         // The writer is stuck with the first line; of the others those are kept that fit the queue.
         log.write(Priority::notice, "0");
