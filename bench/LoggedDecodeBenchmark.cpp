@@ -18,42 +18,61 @@ namespace {
 
 constexpr const char* kNowhere = "/dev/null";
 
-class CountingLog final : public SystemLog {
+// A queue whose lines end nowhere, and which knows how many it was given and how many it wrote.
+class CountedQueue final : public SystemLog {
 public:
-    void write(Priority, std::string_view) override { ++lines; }
+    CountedQueue() = default;
+    ~CountedQueue() override
+    {
+        _queue.flush();
+        std::fclose(_file);
+    }
+    CountedQueue(const CountedQueue&) = delete;
+    CountedQueue& operator=(const CountedQueue&) = delete;
 
-    std::size_t lines = 0;
+    void write(Priority priority, std::string_view line) override
+    {
+        ++_given;
+        _queue.write(priority, line);
+    }
+    // Of a hundred lines that many were kept.
+    double keptPercent()
+    {
+        _queue.flush();
+        return _given == 0 ? 100 : 100.0 * static_cast<double>(_written) / static_cast<double>(_given);
+    }
+
+private:
+    void writeAll(const QueuedSystemLog::Lines& lines)
+    {
+        std::string text;
+        for (const auto& line : lines)
+            appendLogLine(text, line.priority, line.text);
+        std::fwrite(text.data(), 1, text.size(), _file);
+        _written += lines.size();
+    }
+
+    std::FILE* _file = std::fopen(kNowhere, "we");
+    std::size_t _given = 0;
+    std::atomic<std::size_t> _written = 0;
+    QueuedSystemLog _queue{[this](const QueuedSystemLog::Lines& lines) { writeAll(lines); }};
 };
 
-// Decodes a stream as often as the state says. Returns how often.
-std::size_t decodeInto(SystemLog& log, benchmark::State& state, const Technology& technology)
+void decodeInto(SystemLog& log, benchmark::State& state, const Technology& technology)
 {
     SystemLog::install(&log);
-    const auto generator = makeGenerator(technology.identifier);
-    const auto& messages = recordedStream(technology);
-    Dictionary session;
-    std::size_t rounds = 0;
-    for (auto _ : state) {
-        for (const Bytes& message : messages)
-            generator->updateState(session, message);
-        generator->generateLogUsingState(session);
-        ++rounds;
+    {
+        const auto generator = makeGenerator(technology.identifier);
+        const auto& messages = recordedStream(technology);
+        Dictionary session;
+        for (auto _ : state) {
+            for (const Bytes& message : messages)
+                generator->updateState(session, message);
+            generator->generateLogUsingState(session);
+        }
+        countMessages(state, messages.size());
     }
     SystemLog::install(nullptr);
-    countMessages(state, messages.size());
-    return rounds;
-}
-
-std::size_t linesOfOneRound(const Technology& technology)
-{
-    CountingLog log;
-    SystemLog::install(&log);
-    const auto generator = makeGenerator(technology.identifier);
-    Dictionary session;
-    for (const Bytes& message : recordedStream(technology))
-        generator->updateState(session, message);
-    SystemLog::install(nullptr);
-    return log.lines;
 }
 
 void decodeIntoFile(benchmark::State& state, const Technology& technology)
@@ -62,25 +81,12 @@ void decodeIntoFile(benchmark::State& state, const Technology& technology)
     decodeInto(log, state, technology);
 }
 
-// The queue drops lines when its thread cannot keep pace; how many of a hundred it kept is counted.
+// The queue drops lines when its thread cannot keep pace.
 void decodeIntoQueue(benchmark::State& state, const Technology& technology)
 {
-    std::FILE* const file = std::fopen(kNowhere, "we");
-    std::atomic<std::size_t> written = 0;
-    std::size_t rounds = 0;
-    {
-        QueuedSystemLog log([&](const QueuedSystemLog::Lines& lines) {
-            std::string text;
-            for (const auto& line : lines)
-                appendLogLine(text, line.priority, line.text);
-            std::fwrite(text.data(), 1, text.size(), file);
-            written += lines.size();
-        });
-        rounds = decodeInto(log, state, technology);
-    }
-    std::fclose(file);
-    const auto wanted = static_cast<double>(rounds * linesOfOneRound(technology));
-    state.counters["kept %"] = 100.0 * static_cast<double>(written) / wanted;
+    CountedQueue log;
+    decodeInto(log, state, technology);
+    state.counters["kept %"] = log.keptPercent();
 }
 
 } // namespace

@@ -1,5 +1,5 @@
 // The message port, from another process to the decoded message: how many in a second when the sender never
-// rests, and how long one is on the way when nothing else is.
+// rests, also without the decoding, and how long one is on the way when nothing else is.
 
 #include "Benchmarks.h"
 #include "ChildProcess.h"
@@ -38,8 +38,9 @@ struct Trip {
 // The receiving application: a port, a generator, and a note of every message.
 class Receiver {
 public:
-    explicit Receiver(std::size_t count)
+    explicit Receiver(std::size_t count, bool decodes = true)
         : _count(count)
+        , _decodes(decodes)
     {
         _trips.reserve(count);
     }
@@ -66,7 +67,8 @@ public:
 private:
     void take(ByteView message)
     {
-        _generator->updateState(*_state, message);
+        if (_decodes)
+            _generator->updateState(*_state, message);
         Nanoseconds::rep sent = 0;
         std::memcpy(&sent, message.data() + kPortMessageTime, sizeof sent);
         _trips.push_back({Nanoseconds(sent), Nanoseconds(portTime())});
@@ -78,6 +80,8 @@ private:
 
     bool isWhole() const
     {
+        if (!_decodes)
+            return _trips.size() == _count;
         const auto display = (*_state)["Display"].dictionary();
         const auto list = display ? (*display)["Neighbor Cells List"].array() : nullptr;
         return _trips.size() == _count && list && list->size() == kPortMessageNeighbors;
@@ -87,6 +91,7 @@ private:
     static constexpr std::size_t kRefreshEvery = 400'000;
 
     std::size_t _count;
+    bool _decodes;
     QTemporaryDir _directory;
     QEventLoop _loop;
     std::unique_ptr<LogGenerator> _generator = makeGenerator(telephony::kTechnologyMRL_LTE);
@@ -99,11 +104,11 @@ double seconds(Nanoseconds time)
     return std::chrono::duration<double>(time).count();
 }
 
-void portThroughput(benchmark::State& state)
+void portThroughput(benchmark::State& state, bool decodes)
 {
     constexpr std::size_t kCount = 400'000;
     for (auto _ : state) {
-        Receiver receiver(kCount);
+        Receiver receiver(kCount, decodes);
         const auto& trips = receiver.run(std::chrono::microseconds(0));
         if (trips.empty())
             return state.SkipWithError("messages were lost");
@@ -133,10 +138,11 @@ void portLatency(benchmark::State& state)
 
 void registerPorts()
 {
-    benchmark::RegisterBenchmark("port", portThroughput)
-        ->Unit(benchmark::kMillisecond)
-        ->UseManualTime()
-        ->Iterations(1);
+    for (const bool decodes : {true, false})
+        benchmark::RegisterBenchmark(decodes ? "port/decoded" : "port/alone", portThroughput, decodes)
+            ->Unit(benchmark::kMillisecond)
+            ->UseManualTime()
+            ->Iterations(1);
     benchmark::RegisterBenchmark("port/idle", portLatency)
         ->Unit(benchmark::kMicrosecond)
         ->UseManualTime()

@@ -101,7 +101,9 @@ constexpr Row kRows[] = {
     {"— beside a service that answers", Unit::milliseconds, {"start/service", nullptr}, nullptr,
         atMost(150e-3)},
 
-    {"message port, process to decoded", Unit::perSecond, {"port", kRate}, "copy/lte", atLeast(200e3)},
+    {"message port, process to decoded", Unit::perSecond, {"port/decoded", kRate}, "copy/lte",
+        atLeast(200e3)},
+    {"— without the decoding", Unit::perSecond, {"port/alone", kRate}, "copy/lte"},
     {"— median latency when idle", Unit::microseconds, {"port/idle", nullptr}, nullptr, atMost(100e-6)},
 
     {"orvex-decode, large capture", Unit::perSecond, {"offline/large", kRate}, "copy/lte", atLeast(1e6)},
