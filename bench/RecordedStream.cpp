@@ -4,7 +4,6 @@
 #include "SystemClock.h"
 #include "scenarios/ScenarioTable.h"
 
-#include "Console.h"
 #include "TelephonyConstants.h"
 
 #include <benchmark/benchmark.h>
@@ -48,7 +47,6 @@ std::unique_ptr<LogGenerator> makeGenerator(const char* identifier)
 {
     static const FileResources kResources(ORVEX_RESOURCES);
     static const SystemClock kClock;
-    installConsole([](std::string_view) {});
     return LogGenerator::generatorFromTechnology(identifier, {kResources, kClock, {}});
 }
 

@@ -23,7 +23,7 @@ extern const Technology kTechnologies[kTechnologyCount];
 const std::vector<Bytes>& recordedStream(const Technology& technology);
 const std::vector<Bytes>& recordedStream(const char* name);
 
-// A generator with its real template. Its console lines go nowhere.
+// A generator with its real template.
 std::unique_ptr<LogGenerator> makeGenerator(const char* identifier);
 
 // The counter that the table reads: so many messages in each iteration.

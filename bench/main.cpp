@@ -45,6 +45,7 @@ int main(int argc, char** argv)
 
     qputenv("QT_QPA_PLATFORM", "offscreen");
     const QApplication application(argc, argv);
+    orvex::installConsole([](std::string_view) {}); // the terminal is the benchmarks'
     registerFloors();
     registerDecoding();
     registerLoggedDecoding();
@@ -59,7 +60,6 @@ int main(int argc, char** argv)
         return EXIT_FAILURE;
     Results results;
     benchmark::RunSpecifiedBenchmarks(&results);
-    orvex::installConsole({});
     if (table.empty())
         return EXIT_SUCCESS;
     std::ofstream file(table);
