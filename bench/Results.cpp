@@ -13,8 +13,10 @@ void Results::ReportRuns(const std::vector<Run>& runs)
             continue;
         if (const auto known = _figures.find(name); known != _figures.end() && known->second.isMedian)
             continue;
-        Figures figures{
-            run.GetAdjustedRealTime() / benchmark::GetTimeUnitMultiplier(run.time_unit), {}, isMedian};
+        // What is of one thread is told in processor time, whatever else the machine does.
+        const double time =
+            run.run_name.time_type.empty() ? run.GetAdjustedCPUTime() : run.GetAdjustedRealTime();
+        Figures figures{time / benchmark::GetTimeUnitMultiplier(run.time_unit), {}, isMedian};
         for (const auto& [counter, value] : run.counters)
             figures.counters[counter] = value;
         _figures[name] = std::move(figures);
