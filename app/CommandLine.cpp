@@ -21,11 +21,13 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     const QCommandLineOption console(QStringLiteral("console"));
     const QCommandLineOption resources(QStringLiteral("resources"), {}, QStringLiteral("DIR"));
     const QCommandLineOption open(QStringLiteral("open"), {}, QStringLiteral("FILE"));
+    const QCommandLineOption printStatus(QStringLiteral("print-status"));
     const QCommandLineOption light(QStringLiteral("light"));
     const QCommandLineOption dark(QStringLiteral("dark"));
     const QCommandLineOption untilPainted(QStringLiteral("until-painted"));
     QCommandLineParser parser;
-    parser.addOptions({help, version, console, resources, open, light, dark, untilPainted});
+    parser.addOptions(
+        {help, version, console, resources, open, printStatus, light, dark, untilPainted});
 
     // parse() rather than process(), which would end the program in its own way.
     if (!parser.parse(arguments))
@@ -35,8 +37,11 @@ CommandLine CommandLine::parse(const QStringList& arguments)
             QStringLiteral("Unexpected argument '%1'.").arg(parser.positionalArguments().first()));
     if (parser.isSet(light) && parser.isSet(dark))
         return wrongUsage(QStringLiteral("--light and --dark exclude each other."));
+    if (parser.isSet(printStatus) && (parser.isSet(console) || parser.isSet(open)))
+        return wrongUsage(QStringLiteral("--print-status goes with a session in a window."));
 
     CommandLine result;
+    result.printsStatus = parser.isSet(printStatus);
     if (parser.isSet(help))
         result.action = Action::help;
     else if (parser.isSet(version))
@@ -63,6 +68,8 @@ std::string CommandLine::usage()
            "Options:\n"
            "  --console        Write to the terminal instead of opening a window.\n"
            "  --open FILE      Show a saved snapshot instead of a session.\n"
+           "  --print-status   Write the status line to standard output whenever it changes,\n"
+           "                   after the number of messages decoded so far.\n"
            "  --resources DIR  Take the section templates from this directory.\n"
            "  --light, --dark  Choose the colours. Default: as the desktop has them.\n"
            "  --until-painted  Say when the window has been painted first, and end.\n"

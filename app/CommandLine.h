@@ -17,6 +17,7 @@ struct CommandLine {
     Theme::Mode theme = Theme::Mode::system;
     std::optional<std::string> resources; // a directory in place of the default one
     std::optional<std::string> snapshot;  // a file to show in place of a session
+    bool printsStatus = false;            // the window's status line goes to standard output too
     bool endsWhenPainted = false;         // for measuring how long the start takes
     std::string error;                    // with wrongUsage: one line
 

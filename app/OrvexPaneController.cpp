@@ -128,6 +128,7 @@ void OrvexPaneController::createToolbarItems()
     label->setLine(QString::fromStdString(_status));
     label->setAccessibleDescription(QStringLiteral("Status"));
     label->adjustSize();
+    _statusLabel = label.get();
 
     std::vector<ToolbarItem> items;
     items.push_back(ToolbarItem::view(std::move(indicator)));

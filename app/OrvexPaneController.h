@@ -6,6 +6,9 @@
 #include "Screen.h"
 #include "TableList.h"
 
+#include <QLabel>
+#include <QPointer>
+
 #include <optional>
 #include <string>
 
@@ -21,6 +24,8 @@ public:
     const std::string& path() const { return _keyPath; }
     const std::string& status() const { return _status; }
     bool isLoading() const { return _isLoading; }
+    // Shows the status in the toolbar; each change of the toolbar brings another.
+    const QLabel* statusLabel() const { return _statusLabel; }
     TableList& tableList() const { return *_list; }
 
     // No status is an empty one.
@@ -47,7 +52,8 @@ private:
     std::string _keyPath;
     std::string _status;
     bool _isLoading = true;
-    TableList* _list; // child
+    QPointer<QLabel> _statusLabel; // the toolbar row's
+    TableList* _list;              // child
 };
 
 } // namespace orvex

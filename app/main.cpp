@@ -6,6 +6,7 @@
 #include "OrvexConsole.h"
 #include "SnapshotViewer.h"
 #include "StandardOutput.h"
+#include "StatusPrinter.h"
 
 #include "DisplayTreePrinter.h"
 #include "SnapshotTree.h"
@@ -97,6 +98,12 @@ void keepDecimalPoints()
     std::setlocale(LC_NUMERIC, "C");
 }
 
+// For programs whose standard output is for others to read.
+void writeConsoleToStandardError(std::string_view line)
+{
+    std::fprintf(stderr, "%.*s\n", static_cast<int>(line.size()), line.data());
+}
+
 int runConsole(int argc, char** argv, const std::string& resourceDirectory)
 {
     const QCoreApplication application(argc, argv);
@@ -105,7 +112,7 @@ int runConsole(int argc, char** argv, const std::string& resourceDirectory)
     const bool wouldDisturb = ::isatty(STDOUT_FILENO) && ::isatty(STDERR_FILENO);
     installConsole([wouldDisturb](std::string_view line) {
         if (!wouldDisturb)
-            std::fprintf(stderr, "%.*s\n", static_cast<int>(line.size()), line.data());
+            writeConsoleToStandardError(line);
     });
     LinuxPlatform platform(resourceDirectory);
     StandardOutput output([] { QCoreApplication::quit(); });
@@ -135,15 +142,20 @@ int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<in
     return body();
 }
 
-int runWindow(
-    int argc, char** argv, const std::string& resourceDirectory, Theme::Mode theme, bool endsWhenPainted)
+int runWindow(int argc, char** argv, const std::string& resourceDirectory, const CommandLine& commandLine)
 {
-    return runInWindow(argc, argv, theme, [&resourceDirectory, endsWhenPainted] {
+    return runInWindow(argc, argv, commandLine.theme, [&resourceDirectory, &commandLine] {
         LinuxPlatform platform(resourceDirectory);
         const auto app = OrvexApp::create(platform.forApp());
+        StandardOutput output([] {}); // the window stays when nobody reads
+        std::optional<StatusPrinter> statusPrinter;
+        if (commandLine.printsStatus) {
+            installConsole(writeConsoleToStandardError);
+            statusPrinter.emplace(*app, output);
+        }
         const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
         std::optional<FirstPaint> firstPaint;
-        if (endsWhenPainted) {
+        if (commandLine.endsWhenPainted) {
             firstPaint.emplace([] {
                 std::puts("painted");
                 std::fflush(stdout);
@@ -207,7 +219,7 @@ int main(int argc, char** argv)
             return showSnapshot(argc, argv, commandLine);
         return commandLine.action == CommandLine::Action::console
             ? runConsole(argc, argv, directory)
-            : runWindow(argc, argv, directory, commandLine.theme, commandLine.endsWhenPainted);
+            : runWindow(argc, argv, directory, commandLine);
     };
     const int status = run();
     SystemLog::install(nullptr);

@@ -210,8 +210,10 @@ void OrvexModel::refresh()
 
 void OrvexModel::updateWithData(ByteView data)
 {
-    if (_logGenerator)
+    if (_logGenerator) {
         _logGenerator->updateState(*_state, data);
+        ++_decodedMessages;
+    }
     _updated = true;
 }
 

@@ -7,6 +7,7 @@
 #include "RunLoop.h"
 #include "TelephonyService.h"
 
+#include <cstdint>
 #include <memory>
 
 namespace orvex {
@@ -52,6 +53,9 @@ public:
     // Takes one log message.
     void updateWithData(ByteView data);
 
+    // Messages that a generator has decoded, over all sessions.
+    std::uint64_t decodedMessages() const { return _decodedMessages; }
+
     // The root of the display tree, built on demand. Null while no technology is known.
     OrvexModelNodeRef topLevelNodes();
     // Null when no node has the path.
@@ -75,6 +79,7 @@ private:
     std::shared_ptr<RemotePort> _sendPort;
     std::unique_ptr<RunLoop::Timer> _displayUpdateTimer; // set while the monitor is running
     bool _updated = false;                               // something arrived since the last refresh
+    std::uint64_t _decodedMessages = 0;
 
     std::unique_ptr<LogGenerator> _logGenerator;
     DictionaryRef _state; // the generator state; survives restarts

@@ -14,6 +14,7 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         Action action;
         Mode theme = Mode::system;
         std::optional<std::string> resources = {};
+        bool printsStatus = false;
         bool endsWhenPainted = false;
     } cases[] = {
         {{}, Action::window},
@@ -23,8 +24,11 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         {{"--version", "--console"}, Action::version},
         {{"--resources", "/a b", "--dark"}, Action::window, Mode::dark, "/a b"},
         {{"--resources=x", "--light"}, Action::window, Mode::light, "x"},
-        {{"--until-painted"}, Action::window, Mode::system, {}, true},
+        {{"--until-painted"}, Action::window, Mode::system, {}, false, true},
         {{"--resources"}, Action::wrongUsage},
+        {{"--print-status"}, Action::window, Mode::system, {}, true},
+        {{"--print-status", "--console"}, Action::wrongUsage},
+        {{"--print-status", "--open", "a"}, Action::wrongUsage},
         {{"--no-such"}, Action::wrongUsage},
         {{"--console=yes"}, Action::wrongUsage},
         {{"file"}, Action::wrongUsage},
@@ -36,6 +40,7 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         EXPECT_EQ(result.action, test.action);
         EXPECT_EQ(result.theme, test.theme);
         EXPECT_EQ(result.resources, test.resources);
+        EXPECT_EQ(result.printsStatus, test.printsStatus);
         EXPECT_EQ(result.endsWhenPainted, test.endsWhenPainted);
         EXPECT_EQ(result.error.empty(), test.action != Action::wrongUsage);
     }

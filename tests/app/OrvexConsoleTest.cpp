@@ -2,6 +2,7 @@
 #include "DisplayTreePrinter.h"
 #include "TerminalFrame.h"
 
+#include "RecordingOutput.h"
 #include "SessionFixture.h"
 
 #include <gtest/gtest.h>
@@ -12,16 +13,6 @@ namespace orvex::test {
 namespace {
 
 using Lines = std::vector<std::string>;
-
-class RecordingOutput final : public ConsoleOutput {
-public:
-    void write(std::string_view text) override { written += text; }
-    std::optional<TerminalSize> terminalSize() const override { return size; }
-    std::string take() { return std::exchange(written, {}); }
-
-    std::optional<TerminalSize> size;
-    std::string written;
-};
 
 struct OrvexConsoleTest : testing::Test, SessionFixture {
     RecordingOutput output;
