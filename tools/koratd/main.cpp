@@ -23,8 +23,8 @@ int serve(const orvex::korat::Options& options)
     SocketMessagePorts ports;
     korat::KoratService service({runLoop, ports}, options);
     const TerminationSignals stopSignals([&service] {
+        service.reportSent();
         service.stop();
-        korat::report("sent %llu messages", static_cast<unsigned long long>(service.sent()));
         QCoreApplication::exit(0);
     });
     return service.start() ? QCoreApplication::exec() : EXIT_FAILURE;

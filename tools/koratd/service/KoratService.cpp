@@ -80,6 +80,14 @@ void KoratService::stop()
     _port.reset();
 }
 
+void KoratService::reportSent() const
+{
+    const std::uint64_t sent = _sentBefore + (_channel ? _channel->sent() : 0);
+    report("sent %llu messages", static_cast<unsigned long long>(sent));
+    if (const std::size_t pending = _channel ? _channel->pendingBytes() : 0; pending > 0)
+        report("the client has not taken the last %zu bytes", pending);
+}
+
 std::optional<Bytes> KoratService::receive(std::int32_t messageId, ByteView data)
 {
     if (messageId != telephony::kCreateLogChannelMessageId)
@@ -128,8 +136,9 @@ void KoratService::armDeath()
 {
     if (!_options.faults.dieAfter || _channelNumber != 1)
         return;
-    _platform.runLoop.postAfter(*_options.faults.dieAfter, [] {
+    _platform.runLoop.postAfter(*_options.faults.dieAfter, [this] {
         report("dying, as asked");
+        reportSent();
         ::_exit(1);
     });
 }

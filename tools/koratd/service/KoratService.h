@@ -19,8 +19,8 @@ public:
     // Closes all ports and the recorded capture.
     void stop();
 
-    // Messages sent to all clients together.
-    std::uint64_t sent() const { return _sentBefore + (_channel ? _channel->sent() : 0); }
+    // Reports how many messages were sent to all clients together, and what has not reached the present one.
+    void reportSent() const;
 
 private:
     std::optional<Bytes> receive(std::int32_t messageId, ByteView data);

@@ -26,6 +26,8 @@ public:
 
     bool isClientThere() const { return _client->isValid(); }
     const std::string& clientPortName() const { return _clientPortName; }
+    // Bytes sent that the client has not taken yet.
+    std::size_t pendingBytes() const { return _client->pendingBytes(); }
     std::uint64_t sent() const { return _sentBefore + (_streamer ? _streamer->sent() : 0); }
 
 private:
