@@ -1,12 +1,9 @@
 #pragma once
 
-#include "Program.h"
-
-#include "TelephonyConstants.h"
+#include "ServiceProbe.h"
 
 #include <gtest/gtest.h>
 
-#include <QLocalSocket>
 #include <QRegularExpression>
 
 namespace orvex::test {
@@ -17,13 +14,7 @@ public:
     explicit KoratProgram(const ProgramFolder& folder, const QStringList& arguments = {})
         : Program(folder, KORATD_PATH, arguments)
     {
-        // Its socket file is there a moment before it listens.
-        const QString socket = QString::fromStdString(folder.ports() + "/" + telephony::kServicePortName);
-        EXPECT_TRUE(waitUntil([&] {
-            QLocalSocket probe;
-            probe.connectToServer(socket);
-            return probe.waitForConnected(100) || !isRunning();
-        }));
+        EXPECT_TRUE(waitForService(folder, *this));
     }
 
     // Ends it. What it says that it has sent to all its clients; -1 when it did not end well.

@@ -55,6 +55,7 @@ public:
     // Standard error: log lines, for the monitor.
     std::string errors() const { return _errors.toStdString(); }
     bool isRunning() const { return _process.state() == QProcess::Running; }
+    qint64 id() const { return _process.processId(); }
 
     // Wait until the text was written so many times.
     bool waitForOutput(const char* text, int times = 1, std::chrono::milliseconds longest = kLongest)
