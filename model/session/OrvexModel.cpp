@@ -192,8 +192,10 @@ void OrvexModel::restartMonitor()
 void OrvexModel::refresh()
 {
     if (_sendPort && _recvPort && !_sendPort->isValid()) {
-        // Invalidating restarts the monitor, which lets go of the port.
         const auto port = _recvPort;
+        // When the refresh is late, the last words of the service that has gone are still unread.
+        port->deliverWaiting();
+        // Restarts the monitor, which lets go of the port.
         port->invalidate();
     }
     if (!_updated)

@@ -29,7 +29,11 @@ public:
 };
 
 // The receiving end. Messages arrive on the run loop, in the order in which their sender sent them.
-class LocalPort : public MessagePort { };
+class LocalPort : public MessagePort {
+public:
+    // Hands over at once what has come already and waits for the run loop. A port that is closed drops it.
+    virtual void deliverWaiting() { }
+};
 
 // The sending end.
 class RemotePort : public MessagePort {

@@ -4,6 +4,7 @@
 
 #include <QLocalServer>
 #include <QLocalSocket>
+#include <QPointer>
 
 #include <algorithm>
 #include <cerrno>
@@ -134,6 +135,18 @@ void LocalSocketPort::invalidate()
     // The callback may destroy the port.
     if (const auto callback = std::exchange(_invalidationCallback, {}))
         callback();
+}
+
+void LocalSocketPort::deliverWaiting()
+{
+    // A receiver may close the port, and a connection may end.
+    std::vector<QPointer<PortConnection>> connections;
+    for (const auto& connection : _connections)
+        connections.emplace_back(connection.get());
+    for (const auto& connection : connections) {
+        if (connection)
+            connection->handleWaiting();
+    }
 }
 
 void LocalSocketPort::setInvalidationCallback(std::function<void()> callback)

@@ -32,6 +32,7 @@ public:
 
     bool isValid() const override { return _server != nullptr; }
     void invalidate() override;
+    void deliverWaiting() override;
     void setInvalidationCallback(std::function<void()> callback) override;
 
 private:

@@ -11,6 +11,7 @@ namespace orvex {
 
 namespace {
 constexpr int kMessagesPerTurn = 64;
+constexpr int kTurnsAtOnce = 2048;
 constexpr qint64 kUnhandledBytes = qint64{1} << 20; // read from the socket ahead of being handled
 constexpr qint64 kUnreadReplyBytes = qint64{1} << 20;
 } // namespace
@@ -47,7 +48,18 @@ void PortConnection::timerEvent(QTimerEvent*) noexcept
     handleMessages();
 }
 
-void PortConnection::handleMessages()
+void PortConnection::handleWaiting()
+{
+    const QPointer<PortConnection> alive(this);
+    bool goesOn = !_isHandling;
+    for (int turn = 0; goesOn && turn < kTurnsAtOnce; ++turn) {
+        const bool hasCome = _socket->state() == QLocalSocket::ConnectedState && _socket->waitForReadyRead(0);
+        goesOn = (handleMessages() || hasCome) && alive;
+    }
+}
+
+// Whether there were any.
+bool PortConnection::handleMessages()
 {
     const QPointer<PortConnection> alive(this);
     const auto reader = _reader;
@@ -67,25 +79,28 @@ void PortConnection::handleMessages()
         const auto receiver = _receiver;
         const auto answer = (*receiver)(message->messageId, message->payload);
         if (!alive)
-            return;
+            return true;
         if (answer && message->kind == FrameKind::request)
             reply(*message, *answer);
     }
     _isHandling = false;
-    if (handled == kMessagesPerTurn)
-        return wake();
+    if (handled == kMessagesPerTurn) {
+        wake();
+        return true;
+    }
     if (isWaitingForPeer())
-        return;
+        return handled > 0;
 
     // Everything that came is handled.
     if (reader->fault())
         systemLog(
             Priority::error, "Message port %s: connection closed, %s", _portName.c_str(), reader->fault());
     else if (_socket->state() == QLocalSocket::ConnectedState)
-        return;
+        return handled > 0;
     else if (reader->isInsideFrame())
         systemLog(Priority::warning, "Message port %s: a peer left inside a message", _portName.c_str());
     _onEnd(this); // destroys this
+    return handled > 0;
 }
 
 bool PortConnection::readMore()

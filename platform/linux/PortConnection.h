@@ -29,13 +29,17 @@ public:
         std::string portName, std::unique_ptr<QLocalSocket> socket, Receiver receiver, EndHandler onEnd);
     ~PortConnection() override;
 
+    // Handles what has come so far without the event loop. A peer that goes on sending does not hold it up
+    // for ever.
+    void handleWaiting();
+
     // True when it can be given up for another: it has never sent a whole message.
     bool isIdle() const { return !_hasSpoken && !_isHandling; }
 
 private:
     void timerEvent(QTimerEvent*) noexcept override;
     void wake();
-    void handleMessages();
+    bool handleMessages();
     bool readMore();
     bool isWaitingForPeer() const;
     void reply(const Frame& request, const Bytes& payload);

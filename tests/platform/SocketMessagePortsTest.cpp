@@ -173,5 +173,51 @@ TEST_F(SocketMessagePortsTest, SendingWaitsForAPeerThatDoesNotReadAndLosesNothin
     EXPECT_EQ(arrived, accepted) << "a message that was not accepted must not arrive";
 }
 
+TEST_F(SocketMessagePortsTest, WhatWaitsIsDeliveredWithoutTheEventLoop)
+{
+    const auto local = ports.createLocalPort("a", collector());
+    RawPeer gone;
+    RawPeer present;
+    ASSERT_TRUE(gone.connectTo(pathOf("a")) && present.connectTo(pathOf("a")));
+    ASSERT_TRUE(present.write({0, FrameKind::oneWay, 0, bytesOf("first")}));
+    ASSERT_TRUE(waitUntil([&] { return received == "0:first "; })); // both are known to the port
+    received.clear();
+
+    std::string expected;
+    for (int i = 1; i <= 150; ++i) { // more than a turn of the event loop takes
+        ASSERT_TRUE(gone.write({i, FrameKind::oneWay, 0, bytesOf("x")}));
+        expected += std::to_string(i) + ":x ";
+    }
+    gone.leave();
+    ASSERT_TRUE(present.write({7, FrameKind::oneWay, 0, bytesOf("y")}));
+    ASSERT_TRUE(present.write(ByteView(Bytes{1, 0, 0}))); // the beginning of another
+    local.port->deliverWaiting();
+    EXPECT_EQ(received, expected + "7:y ");
+    local.port->deliverWaiting();
+    local.port->invalidate();
+    EXPECT_EQ(received, expected + "7:y ");
+}
+
+TEST_F(SocketMessagePortsTest, AReceiverMayCloseThePortThatDeliversWhatWaits)
+{
+    std::shared_ptr<LocalPort> port;
+    const auto local = ports.createLocalPort("a", [&](std::int32_t messageId, ByteView data) {
+        collector()(messageId, data);
+        if (messageId == 2)
+            port->invalidate();
+        return std::nullopt;
+    });
+    port = local.port;
+    RawPeer first;
+    RawPeer second;
+    ASSERT_TRUE(first.connectTo(pathOf("a")) && second.connectTo(pathOf("a")));
+    turnFor(50ms);
+    ASSERT_TRUE(first.write({1, FrameKind::oneWay, 0, {}}) && first.write({2, FrameKind::oneWay, 0, {}})
+        && first.write({3, FrameKind::oneWay, 0, {}}) && second.write({4, FrameKind::oneWay, 0, {}}));
+    port->deliverWaiting();
+    EXPECT_EQ(received, "1: 2: ");
+    EXPECT_FALSE(port->isValid());
+}
+
 } // namespace
 } // namespace orvex
