@@ -7,6 +7,8 @@
 
 #include <QRegularExpression>
 
+#include <algorithm>
+
 namespace orvex::soak {
 
 namespace {
@@ -84,7 +86,8 @@ Range ServiceProgram::sent() const
     expect(sent.has_value(), "koratd says how many messages it has sent", _program.errors());
     // What the monitor had not taken yet may be lost when koratd ends: that is nobody's fault.
     const auto pending = numberIn(_program, "^koratd: the client has not taken the last (\\d+) bytes$");
-    return {*sent - (pending ? *pending / kFrameHeader + 1 : 0), *sent};
+    const long long lost = pending ? *pending / kFrameHeader + 1 : 0;
+    return {std::max(*sent - lost, 0LL), *sent};
 }
 
 } // namespace orvex::soak

@@ -23,7 +23,7 @@ constexpr std::size_t kFewestSteps = 3; // the warm-up and two that can be compa
 Soak::Soak(unsigned seed, std::chrono::milliseconds slack)
     : _monitor(_folder)
     , _watch(_monitor, slack)
-    , _steps(seed, _folder, _watch)
+    , _steps(seed, _folder, _monitor, _watch)
 {
     _watch.awaitLaunch();
 }

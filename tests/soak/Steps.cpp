@@ -12,7 +12,8 @@ constexpr const char* kPropertyLists = "IFX"; // the monitor ends, as it should,
 constexpr std::optional<int> kRates[] = {std::nullopt, 20, 200, 2000};
 // So slow that the socket takes what comes for more than a second, however busy the monitor is: nothing waits
 // inside koratd when it is killed, and what it has recorded has gone out.
-constexpr int kRateOfTheKilled = 100;
+constexpr int kGentleRate = 30;
+constexpr auto kSleep = 2100ms; // a little more than a refresh
 constexpr int kFastRate = 20'000;
 constexpr int kFastMessages = 20'000;
 } // namespace
@@ -26,6 +27,7 @@ std::vector<Steps::Kind> Steps::round()
         {"replaced", &Steps::replaced},
         {"frozen", &Steps::frozen},
         {"rested", &Steps::rested},
+        {"asleep", &Steps::asleep},
         {"garbage", &Steps::garbage},
         {"absent", &Steps::absent},
         {"refused channel", &Steps::refusedChannel},
@@ -57,7 +59,7 @@ void Steps::ended()
 void Steps::killed()
 {
     Scene scene = anyScene();
-    scene.rate = kRateOfTheKilled;
+    scene.rate = kGentleRate;
     const auto service = stream(scene);
     _watch.watchStream(aWhile());
     _watch.expectLoss();
@@ -109,6 +111,22 @@ void Steps::rested()
     _watch.awaitDecoded(kFastMessages);
     _watch.watchSilence(3s);
     endInOrder(*service);
+}
+
+// The service goes while the monitor stands still, and a refresh is due when it goes on.
+void Steps::asleep()
+{
+    Scene scene = anyScene();
+    scene.rate = kGentleRate;
+    const auto service = stream(scene);
+    _watch.watchStream(aWhile());
+    {
+        const auto asleep = test::freezeFor(_monitor.id(), kSleep);
+        std::this_thread::sleep_for(kSleep / 2);
+        _watch.expectLoss();
+        _sent += service->terminate();
+    }
+    _watch.awaitLoss(_sent);
 }
 
 void Steps::garbage()

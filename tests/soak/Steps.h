@@ -20,9 +20,10 @@ public:
     // In an order of its own at each call.
     std::vector<Kind> round();
 
-    Steps(unsigned seed, const test::ProgramFolder& folder, MonitorWatch& watch)
+    Steps(unsigned seed, const test::ProgramFolder& folder, MonitorProgram& monitor, MonitorWatch& watch)
         : _random(seed)
         , _folder(folder)
+        , _monitor(monitor)
         , _watch(watch)
     {
     }
@@ -40,6 +41,7 @@ private:
     void replaced();
     void frozen();
     void rested();
+    void asleep();
     void garbage();
     // Sessions that do not come about, or only just.
     void absent();
@@ -62,6 +64,7 @@ private:
 
     std::mt19937 _random;
     const test::ProgramFolder& _folder;
+    MonitorProgram& _monitor;
     MonitorWatch& _watch;
 
     QString _technology; // of the generator that the monitor has; empty: it has none

@@ -34,6 +34,16 @@ private:
     QTemporaryDir _folder;
 };
 
+// Stops a process where it is, and lets it go on after a while, whatever the test does meanwhile.
+inline std::jthread freezeFor(qint64 process, std::chrono::milliseconds time)
+{
+    ::kill(static_cast<pid_t>(process), SIGSTOP);
+    return std::jthread([process, time] {
+        std::this_thread::sleep_for(time);
+        ::kill(static_cast<pid_t>(process), SIGCONT);
+    });
+}
+
 // A real program that runs beside the test, and all that it has written so far.
 class Program {
 public:
@@ -66,16 +76,7 @@ public:
     {
         return waitUntil([&] { return _errors.count(text) >= times; }, longest);
     }
-    // Stops it where it is, and lets it go on after a while, whatever the test does meanwhile.
-    std::jthread freezeFor(std::chrono::milliseconds time)
-    {
-        const auto process = static_cast<pid_t>(_process.processId());
-        ::kill(process, SIGSTOP);
-        return std::jthread([process, time] {
-            std::this_thread::sleep_for(time);
-            ::kill(process, SIGCONT);
-        });
-    }
+    std::jthread freezeFor(std::chrono::milliseconds time) { return test::freezeFor(id(), time); }
 
     void kill()
     {
