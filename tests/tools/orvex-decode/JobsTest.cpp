@@ -3,7 +3,7 @@
 #include "scenarios/ScenarioTable.h"
 
 #include "DecodeProgram.h"
-#include "LogPackets.h"
+#include "PacketText.h"
 
 #include <QRegularExpression>
 
