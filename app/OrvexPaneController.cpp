@@ -4,6 +4,7 @@
 
 #include "ActivityIndicator.h"
 #include "NavigationStack.h"
+#include "NodesByPath.h"
 #include "TextLabel.h"
 #include "Theme.h"
 

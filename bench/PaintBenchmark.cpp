@@ -7,8 +7,8 @@
 #include "OrvexPaneController.h"
 
 #include "FakeTelephony.h"
-#include "LogPackets.h"
 #include "ManualRunLoop.h"
+#include "PacketText.h"
 
 #include "Animation.h"
 #include "FileResources.h"

@@ -5,7 +5,7 @@
 #include "Benchmarks.h"
 #include "RecordedStream.h"
 
-#include "OrvexModelNode.h"
+#include "NodesByPath.h"
 
 #include "Array.h"
 #include "TelephonyConstants.h"
@@ -48,13 +48,26 @@ void fill(const LongestLists& longest, const std::string& path, const Value& sho
     }
 }
 
+std::size_t count(const OrvexModelNode& node)
+{
+    std::size_t result = 1;
+    if (const auto* children = node.childNodes()) {
+        for (const auto& child : *children)
+            result += count(*child);
+    }
+    return result;
+}
+
 void rebuild(benchmark::State& state, const Value& display)
 {
     std::size_t nodeCount = 0;
     for (auto _ : state) {
         NodesByPath nodes;
         benchmark::DoNotOptimize(OrvexModelNode::makeTreeFromObject(display, nodes));
-        nodeCount = nodes.size();
+        for (const char* path :
+            {"/", "/Neighbors", "/Neighbors/Neighboring Cells"}) // the screens that are open
+            benchmark::DoNotOptimize(nodes[path]);
+        nodeCount = nodeCount ? nodeCount : count(*nodes["/"]);
     }
     state.counters["nodes"] = static_cast<double>(nodeCount);
 }

@@ -5,7 +5,7 @@
 
 #include "Console.h"
 #include "FileResources.h"
-#include "OrvexModelNode.h"
+#include "NodesByPath.h"
 #include "Snapshot.h"
 #include "SystemLog.h"
 #include "TelephonyConstants.h"

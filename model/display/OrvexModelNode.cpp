@@ -1,12 +1,12 @@
 #include "OrvexModelNode.h"
 
 #include "ArrayLock.h"
+#include "NodesByPath.h"
 #include "OrvexModelLeafNode.h"
 #include "OrvexModelTreeNode.h"
 
 #include "Array.h"
 #include "Dictionary.h"
-#include "TextFormat.h"
 
 #include <algorithm>
 #include <string_view>
@@ -26,84 +26,69 @@ std::string nameWithoutSortPrefix(const std::string& key)
     return key.substr(separator + 1);
 }
 
-class TreeBuilder {
-public:
-    explicit TreeBuilder(NodesByPath& nodesByPath)
-        : _nodesByPath(nodesByPath)
-    {
+using Nodes = std::vector<OrvexModelNodeRef>;
+
+OrvexModelNodeRef build(std::string name, const Value& object);
+
+Nodes childrenInOrder(const Dictionary& dictionary)
+{
+    Nodes children;
+    children.reserve(dictionary.size());
+    for (const auto& [key, value] : dictionary) {
+        if (!value.isNull())
+            children.push_back(build(key, value));
     }
+    return children;
+}
 
-    OrvexModelNodeRef build(std::string name, const Value& object, const std::string& path)
-    {
-        auto node = makeNode(std::move(name), object, path);
-        _nodesByPath[path] = node;
-        return node;
+Nodes childrenSorted(const Dictionary& dictionary)
+{
+    std::vector<const Dictionary::Entry*> entries;
+    entries.reserve(dictionary.size());
+    for (const Dictionary::Entry& entry : dictionary)
+        entries.push_back(&entry);
+    std::ranges::sort(entries, {}, &Dictionary::Entry::key);
+
+    Nodes children;
+    children.reserve(entries.size());
+    for (const Dictionary::Entry* entry : entries) {
+        if (entry->key != kSortedKey && !entry->value.isNull())
+            children.push_back(build(nameWithoutSortPrefix(entry->key), entry->value));
     }
+    return children;
+}
 
-private:
-    OrvexModelNodeRef makeNode(std::string name, const Value& object, const std::string& path)
-    {
-        if (const std::string* string = object.string())
-            return std::make_shared<OrvexModelLeafNode>(std::move(name), *string);
-        if (const auto dictionary = object.dictionary())
-            return std::make_shared<OrvexModelTreeNode>(std::move(name), childrenOf(*dictionary, path));
-        if (const auto array = object.array())
-            return std::make_shared<OrvexModelTreeNode>(std::move(name), childrenOf(*array, path));
-        return std::make_shared<OrvexModelLeafNode>(std::move(name), "(unknown)");
+Nodes childrenOf(const Array& array)
+{
+    const ArrayLockScope lock;
+    Nodes children;
+    children.reserve(array.size());
+    for (const Value& element : array)
+        children.push_back(build(std::to_string(children.size()), element));
+    return children;
+}
+
+OrvexModelNodeRef build(std::string name, const Value& object)
+{
+    if (const std::string* string = object.string())
+        return std::make_shared<OrvexModelLeafNode>(std::move(name), *string);
+    if (const Dictionary* dictionary = object.heldDictionary()) {
+        const bool isSorted = dictionary->contains(kSortedKey);
+        return std::make_shared<OrvexModelTreeNode>(
+            std::move(name), isSorted ? childrenSorted(*dictionary) : childrenInOrder(*dictionary));
     }
-
-    std::vector<OrvexModelNodeRef> childrenOf(const Dictionary& dictionary, const std::string& path)
-    {
-        const bool isSorted = dictionary.contains(kSortedKey);
-        std::vector<const Dictionary::Entry*> entries;
-        entries.reserve(dictionary.size());
-        for (const Dictionary::Entry& entry : dictionary)
-            entries.push_back(&entry);
-        if (isSorted)
-            std::ranges::sort(entries, {}, &Dictionary::Entry::key);
-
-        std::vector<OrvexModelNodeRef> children;
-        children.reserve(entries.size());
-        for (const Dictionary::Entry* entry : entries) {
-            if (entry->key == kSortedKey || entry->value.isNull())
-                continue;
-            std::string name = isSorted ? nameWithoutSortPrefix(entry->key) : entry->key;
-            const std::string childPath = pathByAppending(path, name);
-            children.push_back(build(std::move(name), entry->value, childPath));
-        }
-        return children;
-    }
-
-    std::vector<OrvexModelNodeRef> childrenOf(const Array& array, const std::string& path)
-    {
-        const ArrayLockScope lock;
-        std::vector<OrvexModelNodeRef> children;
-        children.reserve(array.size());
-        for (const Value& element : array) {
-            std::string name = text("%d", static_cast<int>(children.size()));
-            const std::string childPath = pathByAppending(path, name);
-            children.push_back(build(std::move(name), element, childPath));
-        }
-        return children;
-    }
-
-    NodesByPath& _nodesByPath;
-};
+    if (const Array* array = object.heldArray())
+        return std::make_shared<OrvexModelTreeNode>(std::move(name), childrenOf(*array));
+    return std::make_shared<OrvexModelLeafNode>(std::move(name), "(unknown)");
+}
 
 } // namespace
 
 OrvexModelNodeRef OrvexModelNode::makeTreeFromObject(const Value& object, NodesByPath& pathDictionary)
 {
-    return TreeBuilder(pathDictionary).build("Orvex", object, "/");
-}
-
-std::string pathByAppending(const std::string& path, const std::string& component)
-{
-    const auto first = component.find_first_not_of('/');
-    if (first == std::string::npos)
-        return path;
-    const auto last = component.find_last_not_of('/');
-    return path + (path.ends_with('/') ? "" : "/") + component.substr(first, last - first + 1);
+    auto root = build("Orvex", object);
+    pathDictionary = NodesByPath(root);
+    return root;
 }
 
 } // namespace orvex

@@ -4,7 +4,6 @@
 
 #include <memory>
 #include <string>
-#include <unordered_map>
 #include <vector>
 
 namespace orvex {
@@ -12,8 +11,7 @@ namespace orvex {
 class OrvexModelNode;
 using OrvexModelNodeRef = std::shared_ptr<const OrvexModelNode>;
 
-// Every node of one tree under its path. Of two nodes with one path, the one stored last is kept.
-using NodesByPath = std::unordered_map<std::string, OrvexModelNodeRef>;
+class NodesByPath;
 
 // A node of the display tree: what one row of the screens shows. Immutable; a screen may keep a node of a
 // tree that the model has dropped.
@@ -33,8 +31,8 @@ public:
     virtual const std::vector<OrvexModelNodeRef>* childNodes() const { return nullptr; }
     virtual const std::string* value() const { return nullptr; }
 
-    // Builds the tree of a display dictionary (or of any other value) and enters every node into the path
-    // dictionary. The root is named "Orvex" and has the path "/".
+    // Builds the tree of a display dictionary (or of any other value) and fills the path dictionary with it.
+    // The root is named "Orvex" and has the path "/".
     //
     // A dictionary that holds the key "_sorted" shows its keys in string order, and a key of the form
     // "prefix;name" under its name. Values that are neither texts nor containers show as "(unknown)".
@@ -43,9 +41,5 @@ public:
 private:
     std::string _name;
 };
-
-// Appends a display name to a path: exactly one "/" between the two, none at the end. A name without
-// anything but "/" leaves the path as it is.
-std::string pathByAppending(const std::string& path, const std::string& component);
 
 } // namespace orvex

@@ -236,8 +236,7 @@ OrvexModelNodeRef OrvexModel::nodeAtPath(const std::string& path)
         topLevelNodes();
     if (!_nodesByPath)
         return nullptr;
-    const auto found = _nodesByPath->find(path);
-    return found == _nodesByPath->end() ? nullptr : found->second;
+    return (*_nodesByPath)[path];
 }
 
 ArrayRef OrvexModel::getSaveContents() const

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator.h"
-#include "OrvexModelNode.h"
+#include "NodesByPath.h"
 
 #include "MessagePort.h"
 #include "RunLoop.h"

@@ -1,5 +1,6 @@
 #include "SnapshotTree.h"
 
+#include "NodesByPath.h"
 #include "NumberedRows.h"
 
 #include "TextFormat.h"

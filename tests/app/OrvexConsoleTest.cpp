@@ -1,5 +1,6 @@
 #include "OrvexConsole.h"
 #include "DisplayTreePrinter.h"
+#include "NodesByPath.h"
 #include "TerminalFrame.h"
 
 #include "RecordingOutput.h"

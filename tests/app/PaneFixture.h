@@ -7,6 +7,7 @@
 #include "Array.h"
 #include "Dictionary.h"
 #include "NavigationStack.h"
+#include "NodesByPath.h"
 #include "TextLabel.h"
 
 #include <QTest>
@@ -87,10 +88,7 @@ protected:
     }
     void reload(const Tree& tree)
     {
-        reloadPanes(*stack, tree.root, [&tree](const std::string& path) {
-            const auto found = tree.byPath.find(path);
-            return found == tree.byPath.end() ? nullptr : found->second;
-        });
+        reloadPanes(*stack, tree.root, [&tree](const std::string& path) { return tree.byPath[path]; });
     }
     OrvexPaneController& top() const { return static_cast<OrvexPaneController&>(stack->topScreen()); }
     void key(Qt::Key pressed) const { QTest::keyClick(&top().tableList(), pressed); }

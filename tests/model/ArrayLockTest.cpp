@@ -2,7 +2,7 @@
 
 #include "Array.h"
 #include "Base.h"
-#include "OrvexModelNode.h"
+#include "NodesByPath.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "OrvexModelNode.h"
+#include "NodesByPath.h"
 
 #include "Array.h"
 #include "Dictionary.h"
@@ -72,12 +72,19 @@ TEST(OrvexModelNode, ShowsEveryKindOfObject)
 TEST(OrvexModelNode, PathDictionaryKeepsTheLaterOfTwoNodes)
 {
     NodesByPath nodes;
-    OrvexModelNode::makeTreeFromObject(Dictionary::make({{"_sorted", ""}, {"1;Cell", "first"},
-                                           {"2;Cell", "second"}, {"3;a/b", nested("deep")}}),
+    OrvexModelNode::makeTreeFromObject(
+        Dictionary::make({{"_sorted", ""}, {"1;Cell", "first"}, {"2;Cell", "second"},
+            {"3;a/b", nested("deep")}, {"4;//", nested("of no name")}, {"5;c/", nested("trimmed")}}),
         nodes);
-    EXPECT_EQ(*nodes.at("/Cell")->value(), "second");
-    EXPECT_EQ(*nodes.at("/a/b/x")->value(), "deep");
-    EXPECT_FALSE(nodes.contains("/a"));
+    EXPECT_EQ(*nodes["/Cell"]->value(), "second");
+    EXPECT_EQ(*nodes["/a/b/x"]->value(), "deep");
+    EXPECT_EQ(*nodes["/x"]->value(), "of no name");
+    EXPECT_EQ(*nodes["/c/x"]->value(), "trimmed");
+    EXPECT_EQ(nodes["/"]->displayName(), "Orvex") << "stored after the child that has its path";
+    for (const char* path :
+        {"", "Cell", "/a", "/a/b/", "/a/bx", "//Cell", "/Cell/", "/Cell2", "/c/x/y", "/Cel"})
+        EXPECT_FALSE(nodes[path]) << path;
+    EXPECT_FALSE(NodesByPath()["/"]);
 }
 
 TEST(OrvexModelNode, NodeOutlivesItsTree)

@@ -4,6 +4,7 @@
 #include "TreeJson.h"
 
 #include "DisplayTreePrinter.h"
+#include "NodesByPath.h"
 #include "NumberedRows.h"
 #include "PropertyList.h"
 #include "RawMessages.h"

@@ -1,5 +1,7 @@
 #include "TreeJson.h"
 
+#include "NodesByPath.h"
+
 #include <nlohmann/json.hpp>
 
 namespace orvex {

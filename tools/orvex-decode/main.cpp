@@ -11,6 +11,7 @@
 #include "FatalErrors.h"
 #include "FileResources.h"
 #include "FileSystemLog.h"
+#include "NodesByPath.h"
 #include "SystemClock.h"
 
 #include "Console.h"
