@@ -58,7 +58,7 @@ TEST(ExtraPackets, AreReadInBinaryFormToo)
         Bytes bytes(xml.begin(), xml.begin() + kPacketHeaderLength);
         bytes.insert(bytes.end(), binary.begin(), binary.end());
         const std::string shown = outcomeOf(*index.getClass(name), {xml}).shown;
-        EXPECT_TRUE(shown.find("=") != std::string::npos) << shown;
+        EXPECT_TRUE(shown.find('=') != std::string::npos) << shown;
         EXPECT_EQ(outcomeOf(*index.getClass(name), {bytes}).shown, shown);
         bytes.pop_back();
         const std::string cut = outcomeOf(*index.getClass(name), {bytes}).shown;

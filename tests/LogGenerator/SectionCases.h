@@ -22,7 +22,7 @@ struct SectionCase {
     const char* section;
     std::string packets;
     std::string shown;       // "#3": three records, whatever they say
-    std::string errors = ""; // log lines at error priority, one after the other
+    const char* errors = ""; // log lines at error priority, one after the other
 };
 
 // What one byte of a packet makes of one row: "A|B|7=C" are the texts of 0, 1 and 7, all other values have

@@ -118,6 +118,21 @@ TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
     }
 }
 
+TEST(HostilePropertyList, LimitsAreExact)
+{
+    const Bytes lists[] = {bytesOf(nestedXML(3)), binaryList({{0xA1, 1}, {0xA1, 2}, {0xA0}})};
+    for (const Bytes& list : lists) {
+        PropertyListLimits limits;
+        limits.maximumDepth = limits.maximumNodes = 3;
+        EXPECT_EQ(propertyListFromData(list, limits).error, "");
+        limits.maximumDepth = 2;
+        EXPECT_THAT(propertyListFromData(list, limits).error, HasSubstr("nested deeper than 2"));
+        limits.maximumDepth = 3;
+        limits.maximumNodes = 2;
+        EXPECT_THAT(propertyListFromData(list, limits).error, HasSubstr("more than 2 values"));
+    }
+}
+
 // A list with every kind of value, in both forms.
 std::vector<Bytes> goodLists()
 {

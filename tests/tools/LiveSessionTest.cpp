@@ -68,16 +68,5 @@ TEST(LiveSession, AFaultIsLoggedAndLeavesTheMonitorConnecting)
     }
 }
 
-TEST(LiveSession, GarbageIsSurvived)
-{
-    const ProgramFolder folder;
-    KoratProgram korat(folder, {"--fault", "garbage=50", "--rate", "3000"});
-    ConsoleProgram monitor(folder);
-    EXPECT_TRUE(monitor.waitForOutput("Updated 2", 3)) << monitor.errors();
-    EXPECT_THAT(monitor.errors(), HasSubstr("Invalid log type"));
-    EXPECT_EQ(monitor.terminate(), 0);
-    EXPECT_GT(korat.terminateAndCount(), 5000);
-}
-
 } // namespace
 } // namespace orvex::test

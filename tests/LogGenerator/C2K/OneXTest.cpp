@@ -80,9 +80,10 @@ TEST(OneXStatus, FieldBehindThePacketLeavesItsRow)
     const std::pair<std::size_t, const char*> cases[] = {{0, ""}, {1, "k1xTxAGC"}, {3, "k1xRxAGC1"},
         {4, "k1xRxAGC0"}, {5, "k1xRx1ChanNum"}, {7, "k1xRx0ChanNum"}, {9, "k1xRx1BandClass"},
         {10, "k1xRx0BandClass"}};
+    const std::string radioLast = kFour + kState + kNoPilots + kFingers + kRadio;
     std::size_t rows = 9;
     for (const auto& [cut, lost] : cases) {
-        cutBy(kFour + kState + kNoPilots + kFingers + kRadio, cut);
+        cutBy(radioLast, cut);
         EXPECT_EQ(fixture.display->size(), rows--) << cut;
         EXPECT_FALSE(fixture.display->contains(lost)) << cut;
     }
@@ -126,10 +127,12 @@ TEST(OneXStatus, ListsPilotsWithTheirStrength)
         std::size_t pilots;
     } lengths[] = {{0, 25, 0}, {0, 26, 1}, {0, 37, 1}, {0, 38, 2}, {2, 33, 0}, {2, 34, 1}, {2, 58, 2},
         {20, 237, 1}, {20, 238, 2}, {255, 120, 0}};
+    const std::string setLast = kFour + kState + kRadio + kFingers;
     for (const auto& [fingers, length, pilots] : lengths) {
-        fixture.shownAfter(kFour + kState + kRadio + kFingers
-            + text("03 EE %02zX00 0100 01 09 FF %02X 00*%zu", length, static_cast<unsigned>(fingers),
-                length - 10));
+        fixture.clear();
+        const std::string lastSet = text(
+            "03 EE %02zX00 0100 01 09 FF %02X 00*%zu", length, static_cast<unsigned>(fingers), length - 10);
+        fixture.feed(packetOfText(setLast + lastSet));
         EXPECT_EQ((*fixture.display)["k1xActiveSetInfo"].dictionary()->size(), pilots + 1) << length;
     }
 }
@@ -172,14 +175,16 @@ TEST(SubpacketWalk, FindsWithinItsBounds)
     const struct {
         const char* packet;
         bool isFound;
-        std::string lines = "";
+        const char* lines = "";
     } cases[] = {
         {"119D: EE 01 EE EE 0B EE 1900 01*21", true}, {"119D: EE 01 EE EE 0B EE 0000 01*21", true},
         {"119D: EE 01 EE EE 0B EE 2900 01*21", true},
         {"119D: EE 01 EE EE 0B EE 2A00 01*21", false,
-            std::string("<3>Log code error in subpkt#0: bad size (42).") + missing},
+            "<3>Log code error in subpkt#0: bad size (42).<4>Log code 0x119d: missing traffic demod "
+            "subpacket."},
         {"119D: EE 02 EE EE 05 EE 0400 0B EE FFFF 01*21", false,
-            std::string("<3>Log code error in subpkt#1: bad size (65535).") + missing},
+            "<3>Log code error in subpkt#1: bad size (65535).<4>Log code 0x119d: missing traffic demod "
+            "subpacket."},
         {"119D: EE 00 EE EE 0B EE 1900 01*21", false, missing},
         {"119D: EE 01 EE EE 05 EE 0400 0B EE 1900 01*21", false, missing},
         {"119D: EE FF EE EE 05 EE 0000 0B EE 1900 01*21", false, missing}, // stays at a size of zero

@@ -66,8 +66,8 @@ TEST(UTRANSections, ServingCellInfo)
         {name, two,
             "Local Area Code=5, Cell ID=2, Freq Band Indicator=3, Cell Scrambling Code=6, "
             "Uplink UARFCN=10054, Downlink UARFCN=10054",
-            some},
-        {name, "FF0001: UTRAN Serving", "(nothing)", all},
+            some.c_str()},
+        {name, "FF0001: UTRAN Serving", "(nothing)", all.c_str()},
         {name, "FF0001: no list", "(nothing)", "Cell Info Array data could not be constructed"},
         {name, "FF0001: <string>x</string>", "throws orvex::CellMonitorList::WrongKindException"},
     });

@@ -34,7 +34,7 @@ TEST(CaptureReader, GivesWhatIsWholeAndSaysWhatIsNot)
     const Bytes five(5, 7);
     const Bytes seven(7, 7);
     const auto two = [&](PcapFile file) { return file.add(five).add(seven); };
-    const auto dlf = [](Bytes end) {
+    const auto dlf = [](const Bytes& end) {
         Bytes bytes = dlfRecord(20, 1);
         bytes += dlfRecord(30, 2);
         return bytes += end;

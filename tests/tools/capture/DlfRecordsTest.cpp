@@ -6,7 +6,6 @@
 #include <gmock/gmock.h>
 
 #include <algorithm>
-#include <random>
 
 namespace orvex {
 namespace {
@@ -176,15 +175,6 @@ TEST(DlfRecords, AnythingComesToAnEnd)
     EXPECT_EQ(skipped, kLength);
     for (const std::uint8_t byte : Bytes{0x01, 0x0C, 0x81, 0xFF})
         EXPECT_FALSE(recordsOf(Bytes(kLength, byte), skipped).empty()) << int{byte};
-
-    std::mt19937 random(7);
-    for (const bool isSnapshot : {false, true}) {
-        Bytes bytes = isSnapshot ? versionReport() : Bytes();
-        std::generate_n(
-            std::back_inserter(bytes), kLength, [&] { return static_cast<std::uint8_t>(random()); });
-        recordsOf(bytes, skipped);
-        EXPECT_LE(skipped, kLength);
-    }
 }
 
 // A prefix by the number of the message: -1 none, else the prefix's second byte.
