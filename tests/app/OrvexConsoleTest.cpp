@@ -74,10 +74,10 @@ TEST_F(OrvexConsoleTest, RedrawsATerminalInPlace)
 
 TEST(DisplayTreePrinter, WritesWhatWouldCommandATerminalVisibly)
 {
-    const Value display = Dictionary::make({{"a\nb", "\x1b[2J\t\x7f \xc2\x9b \xc3\xa9 \xc2"}});
+    const Value display = Dictionary::make({{"a\nb", "\x1b[2J\t\x7f \xc2\x9b \xc3\xa9 \xc2"}, {"c", ""}});
     NodesByPath paths;
-    EXPECT_EQ(DisplayTreePrinter::lines(*OrvexModelNode::makeTreeFromObject(display, paths))[1],
-        "  a\\nb: \\x1b[2J\\t\\x7f \\x9b \xc3\xa9 \xc2");
+    EXPECT_EQ(DisplayTreePrinter::text(*OrvexModelNode::makeTreeFromObject(display, paths)),
+        "Orvex\n  a\\nb: \\x1b[2J\\t\\x7f \\x9b \xc3\xa9 \xc2\n  c:\n");
 }
 
 TEST(TerminalFrame, FillsColumnsDownwardsAndSaysWhatIsMissing)

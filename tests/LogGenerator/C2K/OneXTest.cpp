@@ -2,7 +2,7 @@
 
 #include "C2KFixture.h"
 
-#include <cmath>
+#include <bit>
 
 namespace orvex::test {
 namespace {
