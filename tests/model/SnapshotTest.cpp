@@ -116,6 +116,36 @@ TEST_F(SnapshotTest, TellsWhenItCouldNotBeWritten)
     EXPECT_EQ(statusOfWritingWithin(100'000, full), 0);
 }
 
+TEST_F(SnapshotTest, AWriterKilledInTheMiddleLeavesAFileThatTheReaderCopesWith)
+{
+    Snapshot large = someSnapshot();
+    for (int i = 0; i < 20; ++i)
+        large.data->append(Dictionary::make({{"DLF", std::make_shared<Bytes>(50'000)}}));
+    const std::string path = directory + "/killed.orvex";
+    int halves = 0;
+    for (int i = 0; i < 20; ++i) {
+        const pid_t child = ::fork();
+        if (child == 0) {
+            for (;;)
+                writeSnapshot(large, path);
+        }
+        ::usleep(static_cast<useconds_t>(5'000 + i * 1'700));
+        ::kill(child, SIGKILL);
+        ::waitpid(child, nullptr, 0);
+        const auto [read, error] = readSnapshot(path);
+        if (read) {
+            EXPECT_TRUE(*read->data == *large.data);
+        } else {
+            EXPECT_TRUE(error.starts_with(path + ": ")) << error;
+            EXPECT_EQ(error.find('\n'), std::string::npos);
+            ++halves;
+        }
+    }
+    EXPECT_TRUE(writeSnapshot(large, path)) << "the next one takes its place";
+    EXPECT_TRUE(readSnapshot(path).snapshot);
+    RecordProperty("halves", halves);
+}
+
 TEST(NumberedRows, NoRowHidesAnother)
 {
     NumberedRows rows{{"A", 0}};
