@@ -24,8 +24,8 @@ void Base::updateLogCodeDict(CodeDictionary& codeDict)
 
 void Base::updateSectionRef(const Value& container)
 {
-    _dictionaryRef = container.dictionary();
-    _arrayRef = container.array();
+    _dictionary = container.dictionary();
+    _array = container.array();
     systemLog(Priority::warning, "%s", getSectionName().c_str());
 }
 
@@ -44,13 +44,13 @@ void Base::replaceArray(Array& array, const Array& with)
 
 void Base::clearSection() const
 {
-    if (const auto bound = array())
+    if (Array* bound = array())
         clearElementsInArray(*bound);
 }
 
 void Base::replaceSection(const Array& with) const
 {
-    if (const auto bound = array())
+    if (Array* bound = array())
         replaceArray(*bound, with);
 }
 

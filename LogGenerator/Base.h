@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Bound.h"
 #include "CodeDictionary.h"
 #include "PacketReader.h"
 #include "RowList.h"
@@ -49,9 +50,9 @@ protected:
         CodeDictionary& codeDict);
 
     // The bound dictionary, to write into; a writer over nothing while none is bound.
-    Rows rows() const { return Rows(_dictionaryRef.lock()); }
+    Rows rows() const { return Rows(_dictionary.get()); }
     // The bound array; null while none is bound.
-    ArrayRef array() const { return _arrayRef.lock(); }
+    Array* array() const { return _array.get(); }
     // The two array operations on the bound array, if there is one.
     void clearSection() const;
     void replaceSection(const Array& with) const;
@@ -59,8 +60,7 @@ protected:
     template <typename Filler>
     void fillSection(Filler fill) const
     {
-        const auto bound = array();
-        fillList(bound.get(), fill);
+        fillList(array(), fill);
     }
     // The same with one row dictionary a record, written by print(Rows&, record).
     template <typename Records, typename Printer>
@@ -96,8 +96,8 @@ private:
 
     std::string _sectionName;
     std::vector<LogCode> _logCodes;
-    std::weak_ptr<Dictionary> _dictionaryRef;
-    std::weak_ptr<Array> _arrayRef;
+    Bound<Dictionary> _dictionary;
+    Bound<Array> _array;
 };
 
 } // namespace orvex

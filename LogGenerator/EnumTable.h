@@ -1,5 +1,7 @@
 #pragma once
 
+#include "LateText.h"
+
 #include <span>
 
 namespace orvex {
@@ -18,6 +20,13 @@ constexpr const char* textFor(int value, std::span<const EnumText> table, const 
             return entry.text;
     }
     return fallback;
+}
+
+// The same with a fallback that names the number.
+inline LateText textOrNumberFor(int value, std::span<const EnumText> table, PrintfFormat<int> fallback)
+{
+    const char* name = textFor(value, table, nullptr);
+    return name ? LateText(name) : LateText(fallback, value);
 }
 
 } // namespace orvex

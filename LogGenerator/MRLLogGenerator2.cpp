@@ -39,7 +39,8 @@ MRLLogGenerator2::~MRLLogGenerator2()
 
 void MRLLogGenerator2::updateState(Dictionary& state, ByteView data)
 {
-    getDisplayFromState(state);
+    if (!isBoundToDisplayOf(state))
+        getDisplayFromState(state);
     updateWithData(data);
     if (_binData)
         _binData->insert(_binData->end(), data.begin(), data.end());
@@ -74,7 +75,7 @@ Value MRLLogGenerator2::generateLogUsingState(Dictionary& state)
 Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
 {
     const DictionaryRef display = state["Display"].dictionary();
-    if (display && isBoundTo(display))
+    if (isBoundToDisplayOf(state))
         return display;
 
     DictionaryRef skeleton = _template.in(state);
@@ -103,10 +104,10 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
     return {}; // deliberately: only the next call gets it
 }
 
-bool MRLLogGenerator2::isBoundTo(const DictionaryRef& display) const
+bool MRLLogGenerator2::isBoundToDisplayOf(const Dictionary& state) const
 {
-    // The same owner, without a lock: this is asked for every message.
-    return !_boundDisplay.owner_before(display) && !display.owner_before(_boundDisplay);
+    const Dictionary* display = state["Display"].heldDictionary();
+    return display && display == _boundDisplay.get();
 }
 
 Value MRLLogGenerator2::processTemplate(const Value& object)

@@ -57,13 +57,13 @@ protected:
 
 private:
     void printDict(const Value& object) const;
-    bool isBoundTo(const DictionaryRef& display) const;
+    bool isBoundToDisplayOf(const Dictionary& state) const;
     void bindToDisplay(const Value& templateObject, const Value& display);
     void bindSection(std::string_view name, const Value& container);
 
     StateTemplate _template{""};
-    std::unique_ptr<ClassIndex> _cIndex;     // null in a generator that was never set up
-    std::weak_ptr<Dictionary> _boundDisplay; // whose entries the sections write into
+    std::unique_ptr<ClassIndex> _cIndex; // null in a generator that was never set up
+    Bound<Dictionary> _boundDisplay;     // whose entries the sections write into
 };
 
 } // namespace orvex

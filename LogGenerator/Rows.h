@@ -11,15 +11,18 @@ namespace orvex {
 // as the program.
 class Rows {
 public:
-    // Sets rows and leaves the others.
-    explicit Rows(DictionaryRef dictionary)
-        : _owner(std::move(dictionary))
-        , _dictionary(_owner.get())
+    // Sets rows and leaves the others. The dictionary outlives the writer.
+    explicit Rows(Dictionary* dictionary)
+        : _dictionary(dictionary)
     {
     }
-    // Writes a dictionary, which outlives the writer, anew: only what is set from now on is in it after
-    // end().
-    static Rows anew(Dictionary* dictionary) { return Rows(dictionary); }
+    // Writes a dictionary anew: only what is set from now on is in it after end().
+    static Rows anew(Dictionary* dictionary)
+    {
+        Rows rows(dictionary);
+        rows._isWrittenAnew = true;
+        return rows;
+    }
 
     void set(std::string_view name, const char* text)
     {
@@ -53,11 +56,6 @@ public:
     const Dictionary* dictionary() const { return _dictionary; }
 
 private:
-    explicit Rows(Dictionary* dictionary)
-        : _dictionary(dictionary)
-        , _isWrittenAnew(true)
-    {
-    }
     // Rows are mostly written in the order in which they stand.
     Value& slot(std::string_view name)
     {
@@ -69,7 +67,6 @@ private:
     }
     Value& slotElsewhere(std::string_view name);
 
-    DictionaryRef _owner; // null for one that is written anew
     Dictionary* _dictionary;
     std::size_t _next = 0; // where the next row is expected
     bool _isWrittenAnew = false;

@@ -1,6 +1,7 @@
 #include "RecordedStream.h"
 
 #include "FileResources.h"
+#include "MessageFrame.h"
 #include "SystemClock.h"
 #include "scenarios/ScenarioTable.h"
 
@@ -9,6 +10,7 @@
 #include <benchmark/benchmark.h>
 
 #include <algorithm>
+#include <iterator>
 #include <map>
 #include <string_view>
 
@@ -41,6 +43,14 @@ const std::vector<Bytes>& recordedStream(const Technology& technology)
 const std::vector<Bytes>& recordedStream(const char* name)
 {
     return recordedStream(*std::ranges::find(kTechnologies, std::string_view(name), &Technology::name));
+}
+
+std::vector<Bytes> basebandStream(const Technology& technology)
+{
+    std::vector<Bytes> result;
+    std::ranges::copy_if(recordedStream(technology), std::back_inserter(result),
+        [](const Bytes& message) { return MessageFrame(message).logType() == MessageFrame::kTypeBaseband; });
+    return result;
 }
 
 std::unique_ptr<LogGenerator> makeGenerator(const char* identifier)

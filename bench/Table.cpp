@@ -58,6 +58,10 @@ constexpr Row kRows[] = {
     {"decode UTRAN", Unit::perSecond, {"decode/utran", kRate}, "copy/utran", kDecodeBound},
     {"decode GSM/UMTS", Unit::perSecond, {"decode/gsm", kRate}, "copy/gsm", kDecodeBound},
     {"decode CDMA2000", Unit::perSecond, {"decode/cdma", kRate}, "copy/cdma", kDecodeBound},
+    {"decode LTE, baseband packets", Unit::perSecond, {"baseband/lte", kRate}, "copy/lte", kDecodeBound},
+    {"decode UTRAN, baseband packets", Unit::perSecond, {"baseband/utran", kRate}, "copy/utran",
+        kDecodeBound},
+    {"decode GSM/UMTS, baseband packets", Unit::perSecond, {"baseband/gsm", kRate}, "copy/gsm", kDecodeBound},
     {"decode IFX", Unit::perSecond, {"decode/ifx", kRate}, "copy/ifx", kDecodeBound},
 
     {"decode LTE, log file", Unit::perSecond, {"decode+file/lte", kRate}, "copy/lte",

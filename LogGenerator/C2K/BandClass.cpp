@@ -2,8 +2,6 @@
 
 #include "EnumTable.h"
 
-#include "TextFormat.h"
-
 namespace orvex {
 
 namespace {
@@ -24,10 +22,9 @@ constexpr EnumText kBandClasses[] = {
 };
 } // namespace
 
-std::string bandClassText(int bandClass)
+LateText bandClassText(int bandClass)
 {
-    const char* name = textFor(bandClass, kBandClasses, nullptr);
-    return name ? name : text("[Bad Value %d]", bandClass);
+    return textOrNumberFor(bandClass, kBandClasses, "[Bad Value %d]");
 }
 
 } // namespace orvex

@@ -1,10 +1,10 @@
 #pragma once
 
-#include <string>
+#include "LateText.h"
 
 namespace orvex {
 
 // The text of a CDMA2000 band class, shared by 1x and EV-DO.
-std::string bandClassText(int bandClass);
+LateText bandClassText(int bandClass);
 
 } // namespace orvex

@@ -5,7 +5,6 @@
 #include "EnumTable.h"
 
 #include "SystemLog.h"
-#include "TextFormat.h"
 
 namespace orvex {
 
@@ -19,21 +18,21 @@ constexpr EnumText kDeviceStates[] = {{0, "Inactive [0]"}, {1, "Acquisition [1]"
 constexpr EnumText kSessionStates[] = {{0, "Closed [0]"}, {1, "AMP setup [1]"}, {2, "AT-initiated neg [2]"},
     {3, "Initiated neg [3]"}, {4, "Open [4]"}};
 
-std::string stateText(int value, std::span<const EnumText> states)
+LateText stateText(int value, std::span<const EnumText> states)
 {
-    const char* name = textFor(value, states, nullptr);
-    return name ? name : text("[Reserved %d]", value);
+    return textOrNumberFor(value, states, "[Reserved %d]");
 }
 
 // Antenna 1 and the transmitter are off outside access and connection, and their fields left over.
-std::string powerText(int dBm, bool isOn)
+LateText powerText(int dBm, bool isOn)
 {
-    return isOn ? text("%+d dBm", dBm) : "N/A";
+    return isOn ? LateText("%+d dBm", dBm) : LateText("N/A");
 }
 
-std::string pnOffsetText(int offset)
+LateText pnOffsetText(int offset)
 {
-    return offset == LogCode_0x1183::kNoPNOffset ? "Invalid Value" : text("%d × 64chips", offset);
+    return offset == LogCode_0x1183::kNoPNOffset ? LateText("Invalid Value")
+                                                 : LateText("%d × 64chips", offset);
 }
 
 } // namespace

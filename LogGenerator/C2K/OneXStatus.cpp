@@ -8,8 +8,6 @@
 #include "C2K/TrafficFER.h"
 #include "EnumTable.h"
 
-#include "TextFormat.h"
-
 namespace orvex {
 
 namespace {
@@ -34,26 +32,30 @@ constexpr EnumText kDeviceStates[] = {
 // Rows of what works in traffic alone.
 constexpr const char* kTrafficRows[] = {"k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1", "k1xTxAGC"};
 
-std::string deviceStateText(int state)
+LateText deviceStateText(int state)
 {
-    const char* name = textFor(state, kDeviceStates, nullptr);
-    return name ? name : text("[Bad Value %d]", state);
+    return textOrNumberFor(state, kDeviceStates, "[Bad Value %d]");
 }
 
-std::string channelText(int channel)
+LateText channelText(int channel)
 {
-    return text("%d", channel);
+    return LateText("%d", channel);
 }
 
-std::string powerText(double dBm)
+LateText powerText(double dBm)
 {
-    return text("%+.2f dBm", dBm);
+    return LateText("%+.2f dBm", dBm);
+}
+
+std::string referenceText(double strength)
+{
+    return "(ref pilot) " + decibelText(strength);
 }
 
 // A field that the packet does not hold leaves its row as it is.
 template <typename Field>
 void publishField(const Publisher& publisher, const char* internalKey, const std::optional<Field>& field,
-    std::string (*textOf)(Field))
+    LateText (*textOf)(Field))
 {
     if (field)
         publisher.publish(internalKey, textOf(*field));
@@ -76,8 +78,8 @@ void publishActiveSet(const LogCode_0x119C_ActiveSet& set, const Publisher& publ
         const auto pilot = set.pilot(index);
         if (!pilot)
             break;
-        const char* mark = pilot->pn == set.referencePN() ? "(ref pilot) " : "";
-        pilots.add(index, pilot->pn, mark + decibelText(pilot->strength));
+        const bool isReference = pilot->pn == set.referencePN();
+        pilots.add(index, pilot->pn, LateText(isReference ? referenceText : decibelText, pilot->strength));
     }
     publisher.publish("k1xActiveSetInfo", pilots.rows());
 }

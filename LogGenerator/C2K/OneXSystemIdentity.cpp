@@ -4,8 +4,6 @@
 #include "C2K/PacketLength.h"
 #include "EnumTable.h"
 
-#include "TextFormat.h"
-
 namespace orvex {
 
 namespace {
@@ -27,10 +25,9 @@ constexpr EnumText kRoamingIndicators[] = {
     {12, "Banner OFF [12]"},
 };
 
-std::string roamingText(int indicator)
+LateText roamingText(int indicator)
 {
-    const char* name = textFor(indicator, kRoamingIndicators, nullptr);
-    return name ? name : text("ERI - %d", indicator);
+    return textOrNumberFor(indicator, kRoamingIndicators, "ERI - %d");
 }
 
 } // namespace

@@ -15,9 +15,9 @@ PilotList::PilotList()
 {
 }
 
-void PilotList::add(int index, int pn, std::string content)
+void PilotList::add(int index, int pn, LateText content)
 {
-    _rows->set(text("%d;%d", index, pn), std::move(content));
+    _rows->set(std::to_string(index) + ';' + std::to_string(pn), content);
     _isEmpty = false;
 }
 

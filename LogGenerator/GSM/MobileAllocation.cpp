@@ -13,7 +13,7 @@ void MobileAllocation::update(const LogCode_0x51F8& report)
     row.print("HSN", "%d", report.hoppingSequenceNumber());
     fillList(row.list("ARFCNs"), [&](RowList& list) {
         for (const auto& channel : report.channels())
-            list.append(LateText(PrintfFormat<int>("%d"), channel.arfcn()));
+            list.append(LateText("%d", channel.arfcn()));
     });
 }
 

@@ -10,7 +10,7 @@ void printRecord(Rows& row, const LogCode_0xD00C::CompositeChannel& channel)
     row.print("TSNUM", "%d", channel.timeSlotNumber());
     RowList ratios(row.list("SIR"));
     for (std::size_t i = 0; i < LogCode_0xD00C::CompositeChannel::kSIRCount; ++i)
-        ratios.append(LateText(PrintfFormat<int>("%d"), channel.sir(i)));
+        ratios.append(LateText("%d", channel.sir(i)));
 }
 
 } // namespace

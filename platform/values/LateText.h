@@ -25,8 +25,18 @@ public:
         , _print([](const LateText& late) { return std::string(late._format); })
     {
     }
+    // What the function makes of a number.
+    LateText(std::string (*make)(double), double number)
+        : _format(nullptr)
+        , _print([](const LateText& late) {
+            return late.argument<std::string (*)(double)>(1)(late.argument<double>(0));
+        })
+    {
+        store(_arguments[0], number);
+        store(_arguments[1], make);
+    }
     template <typename... Arguments>
-    explicit LateText(PrintfFormat<Arguments...> format, Arguments... arguments)
+    explicit LateText(PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
         : _format(format.text())
         , _print(&printed<PrintfArgument<Arguments>...>)
     {

@@ -97,7 +97,13 @@ public:
     Array* ownArray() const { return own(reference<ArrayRef>()); }
     Dictionary* ownDictionary() const { return own(reference<DictionaryRef>()); }
 
-    void set(LateText text) { _content.emplace<LateText>(text); }
+    void set(LateText text)
+    {
+        if (auto* late = std::get_if<LateText>(&_content))
+            *late = text;
+        else
+            _content.emplace<LateText>(text);
+    }
 
     // A container of its own kind holding the same elements; any other value as it is.
     Value shallowCopy() const;

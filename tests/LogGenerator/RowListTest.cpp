@@ -92,13 +92,13 @@ TEST(RowsTest, KeepsTheOthersAndTheirOrder)
 {
     const auto dictionary = Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}});
     {
-        Rows rows(dictionary);
+        Rows rows(dictionary.get());
         rows.print("C", "%d", 30);
         rows.print("A", "%d", 10);
         rows.set("D", "40");
     }
     EXPECT_EQ(described(Array({dictionary})), "A=10 B=2 C=30 D=40 | ");
-    Rows nothing{DictionaryRef()};
+    Rows nothing(nullptr);
     nothing.print("A", "%d", 1);
     EXPECT_FALSE(nothing.list("L"));
 }
@@ -107,12 +107,12 @@ TEST(RowsTest, AListInARowIsFilledAgain)
 {
     const auto dictionary = Dictionary::make({{"L", "no list yet"}});
     for (const int number : {1, 2}) {
-        Rows rows(dictionary);
+        Rows rows(dictionary.get());
         fill(*rows.list("L"), {{{"A", number}}});
     }
     EXPECT_EQ(described(*(*dictionary)["L"].array()), "A=2 | ");
     const ArrayRef kept = (*dictionary)["L"].array();
-    fill(*Rows(dictionary).list("L"), {{{"A", 3}}});
+    fill(*Rows(dictionary.get()).list("L"), {{{"A", 3}}});
     EXPECT_EQ(described(*kept), "A=2 | ");
 }
 

@@ -34,7 +34,7 @@ TEST(LateTextTest, IsWhatPrintfMakes)
 
 TEST(LateTextTest, NobodyCanTellItInAValue)
 {
-    const Value value(LateText(PrintfFormat<int>("%d"), 7));
+    const Value value(LateText("%d", 7));
     const Value copy = value;
     EXPECT_EQ(value.kind(), Value::Kind::string);
     EXPECT_FALSE(value.isNull());
