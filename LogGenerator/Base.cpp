@@ -26,7 +26,7 @@ void Base::updateSectionRef(const Value& container)
 {
     _dictionary = container.dictionary();
     _array = container.array();
-    systemLog(Priority::warning, "%s", getSectionName().c_str());
+    systemLogText(Priority::warning, getSectionName());
 }
 
 void Base::clearElementsInArray(Array& array)

@@ -1,19 +1,23 @@
 #include "CodeDictionary.h"
 
+#include <algorithm>
+
 namespace orvex {
 
 void CodeDictionary::subscribe(LogCode code, Base& section)
 {
-    const auto [entry, isNew] = _subscribers.try_emplace(code);
-    if (isNew)
+    const auto place = static_cast<std::size_t>(std::ranges::find(_codes, code) - _codes.begin());
+    if (place == _codes.size()) {
         _codes.push_back(code);
-    entry->second.push_back(&section);
+        _subscribers.emplace_back();
+    }
+    _subscribers[place].push_back(&section);
 }
 
 const CodeDictionary::Subscribers* CodeDictionary::subscribers(LogCode code) const
 {
-    const auto found = _subscribers.find(code);
-    return found == _subscribers.end() ? nullptr : &found->second;
+    const auto place = static_cast<std::size_t>(std::ranges::find(_codes, code) - _codes.begin());
+    return place == _codes.size() ? nullptr : &_subscribers[place];
 }
 
 std::vector<std::string> CodeDictionary::keys() const

@@ -36,7 +36,7 @@ class PacketSection : public Base, protected PacketTaker<Readers>... {
 public:
     void updateWithData([[maybe_unused]] Packet packet, LogCode logCode) final
     {
-        systemLog(_entryLine.priority, "%s", _entryLine.word);
+        systemLogText(_entryLine.priority, _entryLine.word);
         const bool isTaken = (offer<Readers>(packet, logCode) || ...);
         if (!isTaken && _otherCodes == OtherCodes::areReported)
             reportUnknown(logCode);

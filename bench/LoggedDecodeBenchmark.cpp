@@ -58,12 +58,12 @@ private:
     QueuedSystemLog _queue{[this](const QueuedSystemLog::Lines& lines) { writeAll(lines); }};
 };
 
-void decodeInto(SystemLog& log, benchmark::State& state, const Technology& technology)
+void decodeInto(
+    SystemLog& log, benchmark::State& state, const Technology& technology, const std::vector<Bytes>& messages)
 {
     SystemLog::install(&log);
     {
         const auto generator = makeGenerator(technology.identifier);
-        const auto& messages = recordedStream(technology);
         Dictionary session;
         for (auto _ : state) {
             for (const Bytes& message : messages)
@@ -78,15 +78,21 @@ void decodeInto(SystemLog& log, benchmark::State& state, const Technology& techn
 void decodeIntoFile(benchmark::State& state, const Technology& technology)
 {
     FileSystemLog log(kNowhere);
-    decodeInto(log, state, technology);
+    decodeInto(log, state, technology, recordedStream(technology));
 }
 
 // The queue drops lines when its thread cannot keep pace.
 void decodeIntoQueue(benchmark::State& state, const Technology& technology)
 {
     CountedQueue log;
-    decodeInto(log, state, technology);
+    decodeInto(log, state, technology, recordedStream(technology));
     state.counters["kept %"] = log.keptPercent();
+}
+
+void decodeBasebandIntoFile(benchmark::State& state, const Technology& technology)
+{
+    FileSystemLog log(kNowhere);
+    decodeInto(log, state, technology, basebandStream(technology));
 }
 
 } // namespace
@@ -96,6 +102,8 @@ void registerLoggedDecoding()
     for (const Technology& technology : kTechnologies) {
         const std::string name = technology.name;
         benchmark::RegisterBenchmark(("decode+file/" + name).c_str(), decodeIntoFile, technology)
+            ->Unit(benchmark::kMillisecond);
+        benchmark::RegisterBenchmark(("baseband+file/" + name).c_str(), decodeBasebandIntoFile, technology)
             ->Unit(benchmark::kMillisecond);
         benchmark::RegisterBenchmark(("decode+queue/" + name).c_str(), decodeIntoQueue, technology)
             ->Unit(benchmark::kMillisecond);

@@ -26,16 +26,16 @@ constexpr std::size_t kParts = 4;
 
 std::string theDirectory; // where captures are written
 
-// A capture of so many MiB: the recorded stream of LTE, again and again. It goes with the object.
+// A capture of so many MiB: a stream again and again. It goes with the object.
 class LargeCapture {
 public:
-    explicit LargeCapture(std::size_t miB)
+    explicit LargeCapture(std::size_t miB, const std::vector<Bytes>& stream = recordedStream("lte"))
         : _path(theDirectory + "/bench-" + std::to_string(miB) + ".pcap")
     {
         PcapWriter file(_path);
         std::size_t bytes = 0;
         while (bytes < miB << 20) {
-            for (const Bytes& message : recordedStream("lte")) {
+            for (const Bytes& message : stream) {
                 file.write(message, std::chrono::microseconds(++_messageCount));
                 bytes += message.size() + kPcapRecordHeader;
             }
@@ -71,9 +71,8 @@ Run decode(Arguments options)
     return {end.isGood ? seconds : 0, static_cast<double>(end.peakKiB) / 1024};
 }
 
-void decodeCapture(benchmark::State& state, std::size_t miB)
+void decodeCapture(benchmark::State& state, const LargeCapture& capture)
 {
-    const LargeCapture capture(miB);
     for (auto _ : state) {
         const Run run = decode({capture.path()});
         if (run.seconds == 0)
@@ -82,6 +81,16 @@ void decodeCapture(benchmark::State& state, std::size_t miB)
         state.counters["messages/s"] = static_cast<double>(capture.messageCount()) / run.seconds;
         state.counters["peak MiB"] = run.peakMiB;
     }
+}
+
+void decodeStream(benchmark::State& state, std::size_t miB)
+{
+    decodeCapture(state, LargeCapture(miB));
+}
+
+void decodeBaseband(benchmark::State& state)
+{
+    decodeCapture(state, LargeCapture(kPartMiB, basebandStream(kTechnologies[0])));
 }
 
 // The same captures with one worker and with one for each core.
@@ -111,11 +120,16 @@ void registerOffline(const std::string& directory, std::size_t captureMiB)
 {
     theDirectory = directory;
     for (const auto& [name, miB] : {std::pair("offline/small", kPartMiB), {"offline/large", captureMiB}})
-        benchmark::RegisterBenchmark(name, decodeCapture, miB)
+        benchmark::RegisterBenchmark(name, decodeStream, miB)
             ->Unit(benchmark::kSecond)
             ->UseManualTime()
             ->Iterations(1)
             ->Repetitions(1);
+    benchmark::RegisterBenchmark("offline/baseband", decodeBaseband)
+        ->Unit(benchmark::kSecond)
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Repetitions(1);
     benchmark::RegisterBenchmark("offline/jobs", decodeSeveral)
         ->Unit(benchmark::kSecond)
         ->UseManualTime()

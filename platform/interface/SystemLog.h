@@ -48,4 +48,11 @@ void systemLog(
 }
 #pragma GCC diagnostic pop
 
+// The same with a line as it stands.
+inline void systemLogText(Priority priority, std::string_view line)
+{
+    if (SystemLog::isRead(priority))
+        SystemLog::installed()->write(priority, line);
+}
+
 } // namespace orvex
