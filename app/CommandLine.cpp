@@ -26,8 +26,7 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     const QCommandLineOption dark(QStringLiteral("dark"));
     const QCommandLineOption untilPainted(QStringLiteral("until-painted"));
     QCommandLineParser parser;
-    parser.addOptions(
-        {help, version, console, resources, open, printStatus, light, dark, untilPainted});
+    parser.addOptions({help, version, console, resources, open, printStatus, light, dark, untilPainted});
 
     // parse() rather than process(), which would end the program in its own way.
     if (!parser.parse(arguments))
