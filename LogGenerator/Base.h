@@ -36,7 +36,7 @@ public:
     // Binds the section to its container.
     void updateSectionRef(const Value& container);
 
-    // Published arrays change only through these two, which take the array lock.
+    // Published arrays change only through these two and fillList() below, which take the array lock.
     static void clearElementsInArray(Array& array);
     static void replaceArray(Array& array, const Array& with);
 
@@ -66,7 +66,7 @@ protected:
     template <typename Records, typename Printer>
     void refillSection(const Records& records, Printer print) const
     {
-        fillSection([&](RowList& list) { printAll(list, records, print); });
+        refill(array(), records, print);
     }
     // Both with a list that is a row, say.
     template <typename Filler>
@@ -79,19 +79,16 @@ protected:
     template <typename Records, typename Printer>
     static void refill(Array* list, const Records& records, Printer print)
     {
-        fillList(list, [&](RowList& rows) { printAll(rows, records, print); });
+        fillList(list, [&](RowList& rows) {
+            for (const auto& record : records)
+                print(rows.next(), record);
+        });
     }
 
     // "Received an unknown log message: %d"
     static void reportUnknown(LogCode logCode);
 
 private:
-    template <typename Records, typename Printer>
-    static void printAll(RowList& list, const Records& records, Printer print)
-    {
-        for (const auto& record : records)
-            print(list.next(), record);
-    }
     void updateLogCodeDict(CodeDictionary& codeDict);
 
     std::string _sectionName;
