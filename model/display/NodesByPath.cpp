@@ -1,7 +1,5 @@
 #include "NodesByPath.h"
 
-#include <ranges>
-
 namespace orvex {
 
 namespace {
@@ -24,7 +22,8 @@ OrvexModelNodeRef lastAt(const OrvexModelNodeRef& node, std::string_view rest, b
     const auto* children = node->childNodes();
     if (!children)
         return nullptr;
-    for (const OrvexModelNodeRef& child : std::views::reverse(*children)) {
+    for (auto last = children->rbegin(); last != children->rend(); ++last) {
+        const OrvexModelNodeRef& child = *last;
         std::string_view restOfChild = rest;
         bool isChildAtRoot = isAtRoot;
         if (const std::string_view name = withoutSlashesAround(child->displayName()); !name.empty()) {
