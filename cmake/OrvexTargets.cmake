@@ -26,6 +26,17 @@ function(orvex_count_coverage)
     endif()
 endfunction()
 
+# What nearly every file reads is read once for the target. Only where ORVEX_PRECOMPILE asks for it: whether a file
+# includes what it uses, the builds without say.
+set(ORVEX_COMMON_HEADERS
+    <algorithm> <array> <chrono> <cmath> <cstdint> <filesystem> <functional> <memory> <optional> <span> <string>
+    <string_view> <unordered_map> <utility> <variant> <vector>)
+function(orvex_precompile target)
+    if(ORVEX_PRECOMPILE)
+        target_precompile_headers(${target} PRIVATE ${ORVEX_COMMON_HEADERS} ${ARGN})
+    endif()
+endfunction()
+
 # orvex_add_floor(TARGET BASE <folder> HEADERS ... SOURCES ... LINKS ...)
 # BASE is the one folder the target exports. Every header is also compiled alone by the target
 # all_verify_interface_header_sets.
