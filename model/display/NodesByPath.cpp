@@ -22,8 +22,8 @@ OrvexModelNodeRef lastAt(const OrvexModelNodeRef& node, std::string_view rest, b
     const auto* children = node->childNodes();
     if (!children)
         return nullptr;
-    for (auto last = children->rbegin(); last != children->rend(); ++last) {
-        const OrvexModelNodeRef& child = *last;
+    for (std::size_t i = children->size(); i > 0; --i) {
+        const OrvexModelNodeRef& child = (*children)[i - 1];
         std::string_view restOfChild = rest;
         bool isChildAtRoot = isAtRoot;
         if (const std::string_view name = withoutSlashesAround(child->displayName()); !name.empty()) {
