@@ -45,6 +45,8 @@ public:
     // The same, and where it is.
     Value& slot(std::string_view key, std::size_t& position);
     void set(std::string_view key, Value value) { slot(key) = std::move(value); }
+    // Room for so many entries, made at once.
+    void reserve(std::size_t count) { _entries.reserve(count); }
     void remove(std::string_view key);
     // Removes all entries from the position on.
     void removeFrom(std::size_t position);

@@ -51,15 +51,19 @@ TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
         {xmlList("<integer>-9223372036854775809</integer>"), "the content of <integer>"},
         {xmlList("<real>1,5</real>"), "the content of <real>"},
         {xmlList("<date>today</date>"), "the content of <date>"},
+        {xmlList("<date>2026-02-30T00:00:00Z</date>"), "the content of <date>"},
         {xmlList("<data>A*</data>"), "the content of <data>"},
         {xmlList("<true>no</true>"), "the content of <true>"},
         {xmlList("<dict><key>a&#0;b</key><true/></dict>"), "malformed"},
         {xmlList("<dict><key>a&#x00;</key><true/></dict>"), "malformed"},
         {xmlList("<string>&bomb;</string>"), "malformed"},
+        {xmlList("<string>&#xD800;</string>"), "malformed"},
+        {xmlList("<string>&#x110000;</string>"), "malformed"},
+        {xmlList("<string>&amp</string>"), "malformed"},
         {xmlList(std::string("<string>\0</string>", 18)), "a zero byte"},
         {"<!DOCTYPE plist [<!ENTITY a \"&b;\">]><plist><true/></plist>", "with declarations"},
-        // Where parsers do not agree on what is skipped, a count would miss what hides there.
-        {xmlList("<array><?a \" ?></array><?b \" ?></array>"), "a malformed processing instruction"},
+        // Quotes matter in a tag, not in an instruction.
+        {xmlList("<array><?a \" ?></array><?b \" ?></array>"), "closes nothing"},
         {xmlList("<array a=\">\"></array>"), "a malformed tag"},
         {xmlList("<?><array/><?a?>"), "a malformed processing instruction"},
     };
@@ -89,6 +93,7 @@ TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
         const char* reason;
     } cases[] = {
         {"header alone", bytesOf("bplist00"), "shorter"},
+        {"another version", bytesOf("bplist15" + std::string(40, '\0')), "unknown version"},
         {"cycle", binaryList({{0xA1, 0}}), "nested deeper"},
         {"dictionary cycle", binaryList({{0xD1, 1, 0}, {0x51, 'a'}}), "nested deeper"},
         {"shared arrays multiply", binaryList(laughs), "more than 2000000 values"},

@@ -32,12 +32,14 @@ TEST(PropertyList, ReadsEachKindOfXMLValue)
     } cases[] = {
         {"<string>a&lt;b&amp;c &#228;</string>", "a<b&c \u00e4"},
         {"<string>a<!-- <array> -->b<![CDATA[<c>]]></string>", "ab<c>"},
+        {"<string> &quot;&#x1F600;&apos;&#65;&gt; </string>", " \"\U0001F600'A> "},
         {"<string/>", ""},
         {"<integer> 0xFF </integer>", 255},
         {"<integer>-9223372036854775808</integer>", kLowest},
         {"<integer>9223372036854775807</integer>", kHighest},
         {"<integer>18446744073709551615</integer>", 18446744073709551615.0},
         {"<real>6.02e23</real>", 6.02e23},
+        {"<real>-1e400</real>", -std::numeric_limits<double>::infinity()},
         {"<true/>", true},
         {"<false></false>", false},
         {"<date>1969-12-31T23:59:58Z</date>", Date{-2}},
@@ -46,6 +48,8 @@ TEST(PropertyList, ReadsEachKindOfXMLValue)
         {"<array><integer>1</integer><array><true/></array></array>", Array::make({1, Array::make({true})})},
         {"<dict><key>b</key><integer>1</integer><key></key><dict/></dict>",
             Dictionary::make({{"b", 1}, {"", Dictionary::make()}})},
+        {"<dict><key>b</key><false/><key>a&amp;<!-- c --></key><true/><key>b</key><true/></dict>",
+            Dictionary::make({{"b", true}, {"a&", true}})},
         {"<!-- <array> --><array\n></array ><?note <array> ?>", Array::make()},
     };
     for (const auto& test : cases) {
@@ -68,6 +72,7 @@ TEST(PropertyList, ReadsEachKindOfBinaryValue)
     } cases[] = {
         {"ascii", {{0x52, 'h', 'i'}}, "hi"},
         {"utf-16", {{0x62, 0x00, 0xE4, 0x20, 0xAC}}, "\u00e4\u20ac"},
+        {"utf-16 beyond", {{0x63, 0xD8, 0x3D, 0xDE, 0x00, 0xDE, 0x00}}, "\U0001F600\uFFFD"},
         {"long text", {{0x5F, 0x11, 0x00, 0x02, 'h', 'i'}}, "hi"},
         {"one byte is never negative", {{0x10, 0xFF}}, 255},
         {"two bytes", {{0x11, 0x12, 0x34}}, 0x1234},

@@ -1,0 +1,257 @@
+#include "BinaryPropertyListReader.h"
+
+#include "PropertyListCount.h"
+#include "PropertyListNode.h"
+
+#include "Array.h"
+#include "Dictionary.h"
+
+#include <QString>
+#include <QtEndian>
+
+#include <algorithm>
+#include <bit>
+#include <string>
+#include <string_view>
+#include <utility>
+
+namespace orvex {
+
+namespace {
+using Fault = PropertyListFault;
+
+constexpr std::string_view kHeader = "bplist00";
+constexpr std::size_t kTrailerSize = 32;
+constexpr std::uint8_t kSizeFollows = 0xF; // in the low half of a marker: an integer object with the size
+
+enum Kind : std::uint8_t {
+    kSimple = 0x0,
+    kInteger = 0x1,
+    kReal = 0x2,
+    kDate = 0x3,
+    kData = 0x4,
+    kASCII = 0x5,
+    kUTF16 = 0x6,
+    kUID = 0x8,
+    kArray = 0xA,
+    kSet = 0xC,
+    kDictionary = 0xD,
+};
+
+class Reader {
+public:
+    Reader(std::span<const std::uint8_t> list, const PropertyListLimits& limits)
+        : _list(list)
+        , _count(limits)
+    {
+        if (list.size() < kHeader.size() + kTrailerSize)
+            throw Fault("shorter than its header and trailer");
+        if (!std::equal(kHeader.begin(), kHeader.end(), list.begin()))
+            throw Fault("of an unknown version");
+        const std::size_t trailer = list.size() - kTrailerSize;
+        _offsetSize = list[trailer + 6];
+        _referenceSize = list[trailer + 7];
+        _objectCount = number(trailer + 8, 8);
+        _root = number(trailer + 16, 8);
+        _offsetTable = number(trailer + 24, 8);
+        if (_offsetSize < 1 || _offsetSize > 8 || _referenceSize < 1 || _referenceSize > 8)
+            throw Fault("a bad size of offsets or references");
+        if (_offsetTable < kHeader.size() || _offsetTable > trailer
+            || _objectCount > (trailer - _offsetTable) / _offsetSize)
+            throw Fault("the offset table lies outside");
+    }
+
+    Value run() { return valueOf(_root, 0); }
+
+private:
+    struct Object {
+        std::uint8_t kind = 0;
+        std::uint64_t size = 0; // elements, characters or bytes; for numbers the power of two of the bytes
+        std::size_t content = 0;
+    };
+
+    // Recursive: the depth, which is the number of containers around the object, has its limit.
+    Value valueOf(std::uint64_t reference, std::size_t depth)
+    {
+        _count.addNode();
+        const Object object = objectAt(reference);
+        switch (object.kind) {
+        case kSimple: return flagOf(object);
+        case kInteger: return integerOf(object);
+        case kReal: return realOf(object);
+        case kDate: return Date{eightBytesOf(object) + kPropertyListEpoch};
+        case kData: return dataOf(object);
+        case kASCII:
+        case kUTF16: return textOf(object);
+        case kUID:
+            require(object.size < 8);
+            requireBytes(object.content, 1, object.size + 1);
+            return {};
+        case kArray:
+        case kSet: return arrayOf(object, depth);
+        case kDictionary: return dictionaryOf(object, depth);
+        default: throw Fault("an object of unknown kind");
+        }
+    }
+
+    ArrayRef arrayOf(const Object& object, std::size_t depth)
+    {
+        _count.enterContainer(depth);
+        requireBytes(object.content, object.size, _referenceSize);
+        auto array = Array::make();
+        for (std::uint64_t i = 0; i < object.size; ++i)
+            array->append(valueOf(referenceAt(object, i), depth + 1));
+        return array;
+    }
+
+    DictionaryRef dictionaryOf(const Object& object, std::size_t depth)
+    {
+        _count.enterContainer(depth);
+        requireBytes(object.content, object.size, 2 * _referenceSize);
+        auto dictionary = Dictionary::make();
+        for (std::uint64_t i = 0; i < object.size; ++i) {
+            _count.addNode();
+            const Object key = objectAt(referenceAt(object, i));
+            if (key.kind != kASCII && key.kind != kUTF16)
+                throw Fault("a key that is no text");
+            dictionary->set(textOf(key), valueOf(referenceAt(object, object.size + i), depth + 1));
+        }
+        return dictionary;
+    }
+
+    static bool flagOf(const Object& object)
+    {
+        constexpr std::uint64_t kFalse = 8;
+        constexpr std::uint64_t kTrue = 9;
+        require(object.size == kFalse || object.size == kTrue);
+        return object.size == kTrue;
+    }
+
+    Value integerOf(const Object& object) const
+    {
+        constexpr std::uint64_t kWide = 4;
+        require(object.size <= kWide);
+        const std::size_t bytes = std::size_t{1} << object.size;
+        requireBytes(object.content, 1, bytes);
+        if (object.size < kWide)
+            return static_cast<std::int64_t>(number(object.content, bytes));
+        require(number(object.content, 8) == 0);
+        const std::uint64_t magnitude = number(object.content + 8, 8);
+        if (std::in_range<std::int64_t>(magnitude))
+            return magnitude;
+        return static_cast<double>(magnitude);
+    }
+
+    double realOf(const Object& object) const
+    {
+        if (object.size == 3)
+            return eightBytesOf(object);
+        require(object.size == 2);
+        requireBytes(object.content, 1, 4);
+        return std::bit_cast<float>(static_cast<std::uint32_t>(number(object.content, 4)));
+    }
+
+    double eightBytesOf(const Object& object) const
+    {
+        require(object.size == 3);
+        requireBytes(object.content, 1, 8);
+        return std::bit_cast<double>(number(object.content, 8));
+    }
+
+    BytesRef dataOf(const Object& object)
+    {
+        const auto bytes = bytesOf(object, 1);
+        return std::make_shared<Bytes>(bytes.begin(), bytes.end());
+    }
+
+    // A text has no zero in the other form either, and none where it is shown.
+    std::string textOf(const Object& object)
+    {
+        const bool isWide = object.kind == kUTF16;
+        const auto bytes = bytesOf(object, isWide ? 2 : 1);
+        std::string text(bytes.begin(), bytes.end());
+        if (isWide) {
+            QString characters(static_cast<qsizetype>(object.size), Qt::Uninitialized);
+            qFromBigEndian<char16_t>(bytes.data(), characters.size(), characters.data());
+            // By way of whole characters: what is half of one becomes U+FFFD.
+            text = QString::fromStdU32String(characters.toStdU32String()).toStdString();
+        }
+        if (text.find('\0') != std::string::npos)
+            throw Fault("a zero character in a text");
+        return text;
+    }
+
+    std::span<const std::uint8_t> bytesOf(const Object& object, std::size_t bytesEach)
+    {
+        requireBytes(object.content, object.size, bytesEach);
+        const std::size_t bytes = object.size * bytesEach;
+        _count.addBytes(bytes);
+        return _list.subspan(object.content, bytes);
+    }
+
+    // The caller has made sure that it is there.
+    std::uint64_t referenceAt(const Object& container, std::uint64_t index) const
+    {
+        return number(container.content + index * _referenceSize, _referenceSize);
+    }
+
+    Object objectAt(std::uint64_t reference) const
+    {
+        if (reference >= _objectCount)
+            throw Fault("a reference to an object that is not there");
+        const std::uint64_t offset = number(_offsetTable + reference * _offsetSize, _offsetSize);
+        if (offset < kHeader.size() || offset >= _offsetTable)
+            throw Fault("an object outside of the list");
+        const std::uint8_t marker = _list[offset];
+        Object object{static_cast<std::uint8_t>(marker >> 4), marker & 0xFU, offset + 1};
+        const bool mayBeLong = object.kind >= kData && object.kind != kUID;
+        if (mayBeLong && object.size == kSizeFollows) {
+            requireBytes(object.content, 1, 1);
+            const std::uint8_t sizeMarker = _list[object.content];
+            const std::size_t sizeBytes = std::size_t{1} << (sizeMarker & 0xFU);
+            require(sizeMarker >> 4 == kInteger && sizeBytes <= 8);
+            requireBytes(object.content + 1, 1, sizeBytes);
+            object.size = number(object.content + 1, sizeBytes);
+            object.content += 1 + sizeBytes;
+        }
+        return object;
+    }
+
+    static void require(bool isGood)
+    {
+        if (!isGood)
+            throw Fault("a malformed object");
+    }
+
+    // Objects end before the offset table.
+    void requireBytes(std::size_t content, std::uint64_t count, std::size_t bytesEach) const
+    {
+        if (content > _offsetTable || count > (_offsetTable - content) / bytesEach)
+            throw Fault("an object outside of the list");
+    }
+
+    // The caller has made sure that the bytes are there.
+    std::uint64_t number(std::size_t position, std::size_t bytes) const
+    {
+        std::uint64_t result = 0;
+        for (const std::uint8_t byte : _list.subspan(position, bytes))
+            result = result << 8 | byte;
+        return result;
+    }
+
+    std::span<const std::uint8_t> _list;
+    PropertyListCount _count;
+    std::size_t _offsetSize = 0;
+    std::size_t _referenceSize = 0;
+    std::uint64_t _objectCount = 0;
+    std::uint64_t _root = 0;
+    std::uint64_t _offsetTable = 0;
+};
+} // namespace
+
+Value readBinaryPropertyList(std::span<const std::uint8_t> list, const PropertyListLimits& limits)
+{
+    return Reader(list, limits).run();
+}
+
+} // namespace orvex
