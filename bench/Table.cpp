@@ -2,6 +2,8 @@
 
 #include "TextFormat.h"
 
+#include <QString>
+
 #include <algorithm>
 #include <cmath>
 
@@ -138,7 +140,7 @@ std::string digits(double value)
 {
     const int decimals =
         value <= 0 ? 0 : std::clamp(2 - static_cast<int>(std::floor(std::log10(value))), 0, 3);
-    return text("%.*f", decimals, value);
+    return QString::number(value, 'f', decimals).toStdString();
 }
 
 std::string textOf(double value, Unit unit)

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "PrintfFormat.h"
+#include "TextFormat.h"
 
 #include <string_view>
 
@@ -31,28 +31,25 @@ private:
     static inline SystemLog* _installed = nullptr;
 };
 
-// Writes one line to the sink that reads it.
-[[gnu::format(printf, 2, 3)]] void writeLogLine(Priority priority, const char* format, ...);
-
-// Writes one line, made by a printf format, to the installed sink. A line that nobody would read is not made:
-// sections tell of every packet.
-#pragma GCC diagnostic push
-#pragma GCC diagnostic ignored "-Wformat-nonliteral" // PrintfFormat has seen to it
-#pragma GCC diagnostic ignored "-Wformat-security"
-template <typename... Arguments>
-void systemLog(
-    Priority priority, PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
-{
-    if (SystemLog::isRead(priority))
-        writeLogLine(priority, format.text(), arguments...);
-}
-#pragma GCC diagnostic pop
-
-// The same with a line as it stands.
+// Writes a line as it stands to the installed sink.
 inline void systemLogText(Priority priority, std::string_view line)
 {
     if (SystemLog::isRead(priority))
         SystemLog::installed()->write(priority, line);
+}
+
+// Writes one line, made by a printf format, to the installed sink. A line that nobody would read is not made:
+// sections tell of every packet.
+template <typename... Arguments>
+void systemLog(
+    Priority priority, PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
+{
+    if (!SystemLog::isRead(priority))
+        return;
+    static thread_local std::string line; // keeps its storage
+    line.clear();
+    appendText(line, format, arguments...);
+    SystemLog::installed()->write(priority, line);
 }
 
 } // namespace orvex

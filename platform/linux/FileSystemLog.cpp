@@ -7,6 +7,10 @@
 
 namespace orvex {
 
+namespace {
+constexpr std::size_t kMostPending = std::size_t{64} << 10;
+}
+
 FileSystemLog::FileSystemLog(const std::string& path)
     : _path(path)
     , _file(std::fopen(path.c_str(), "we"))
@@ -15,20 +19,35 @@ FileSystemLog::FileSystemLog(const std::string& path)
         fail();
 }
 
+FileSystemLog::~FileSystemLog()
+{
+    if (_file)
+        writePending();
+}
+
 void FileSystemLog::write(Priority priority, std::string_view line)
 {
     if (!_file)
         return;
-    _line.clear();
-    appendLogLine(_line, priority, line);
-    if (std::fwrite(_line.data(), 1, _line.size(), _file.get()) != _line.size())
-        fail();
+    appendLogLine(_pending, priority, line);
+    if (_pending.size() >= kMostPending)
+        writePending();
 }
 
 void FileSystemLog::flush()
 {
-    if (_file && std::fflush(_file.get()) != 0)
+    if (!_file)
+        return;
+    writePending();
+    if (std::fflush(_file.get()) != 0)
         fail();
+}
+
+void FileSystemLog::writePending()
+{
+    if (std::fwrite(_pending.data(), 1, _pending.size(), _file.get()) != _pending.size())
+        fail();
+    _pending.clear();
 }
 
 void FileSystemLog::fail()

@@ -14,6 +14,9 @@ class FileSystemLog final : public SystemLog {
 public:
     // Replaces a file that is there.
     explicit FileSystemLog(const std::string& path);
+    ~FileSystemLog() override;
+    FileSystemLog(const FileSystemLog&) = delete;
+    FileSystemLog& operator=(const FileSystemLog&) = delete;
 
     void write(Priority priority, std::string_view line) override;
     void flush() override;
@@ -29,12 +32,13 @@ private:
         } // NOLINT(cppcoreguidelines-owning-memory)
     };
 
+    void writePending();
     void fail();
 
     std::string _path;
     std::unique_ptr<std::FILE, Close> _file;
     std::string _error;
-    std::string _line; // keeps its storage
+    std::string _pending; // lines to be written; keeps its storage
 };
 
 } // namespace orvex

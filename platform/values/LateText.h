@@ -66,16 +66,14 @@ private:
     {
         return late.printWith<Arguments...>(std::index_sequence_for<Arguments...>());
     }
-    // The compiler has seen format and arguments fit when the text was given.
-#pragma GCC diagnostic push
-#pragma GCC diagnostic ignored "-Wformat-nonliteral"
-#pragma GCC diagnostic ignored "-Wformat-security"
     template <typename... Arguments, std::size_t... index>
     std::string printWith(std::index_sequence<index...>) const
     {
-        return orvex::text(_format, argument<Arguments>(index)...);
+        const PrintfValue values[] = {PrintfValue(argument<Arguments>(index))..., PrintfValue(0)};
+        std::string result;
+        appendPrinted(result, _format, values);
+        return result;
     }
-#pragma GCC diagnostic pop
 
     const char* _format;
     std::string (*_print)(const LateText&);

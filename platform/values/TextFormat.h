@@ -1,15 +1,74 @@
 #pragma once
 
-#include <cstdarg>
+#include "PrintfFormat.h"
+
+#include <concepts>
+#include <cstdint>
 #include <string>
 
 namespace orvex {
 
-// A text made by a printf format. Texts of any length come out whole.
-[[gnu::format(printf, 1, 2)]] std::string text(const char* format, ...);
+// An argument of a printf format, whatever its type.
+class PrintfValue {
+public:
+    // A type as PrintfArgument gives it.
+    template <typename T>
+    explicit PrintfValue(T argument)
+    {
+        if constexpr (std::integral<T>) {
+            _kind = sizeof(T) == sizeof(std::int64_t) ? Kind::longNumber : Kind::number;
+            _content.bits = static_cast<std::uint64_t>(argument);
+        } else if constexpr (std::floating_point<T>) {
+            _kind = Kind::real;
+            _content.real = argument;
+        } else if constexpr (std::same_as<T, const char*>) {
+            _kind = Kind::text;
+            _content.text = argument;
+        } else {
+            _kind = Kind::pointer;
+            _content.pointer = argument;
+        }
+    }
 
-// The same into a string that already has its storage.
-[[gnu::format(printf, 2, 0)]] void formatInto(
-    std::string& result, const char* format, std::va_list arguments);
+    // Appends what printf makes of it; the conversion is all from '%' to the letter.
+    void appendTo(std::string& text, std::string_view conversion) const;
+
+private:
+    enum class Kind : std::uint8_t { number, longNumber, real, text, pointer };
+
+    bool appendPlainly(std::string& text, std::string_view conversion) const;
+    std::int64_t withSign() const;
+    std::uint64_t withoutSign() const;
+
+    Kind _kind;
+    union {
+        std::uint64_t bits;
+        double real;
+        const char* text;
+        const void* pointer;
+    } _content;
+};
+
+// Appends what printf makes of a format and the arguments it asks for.
+void appendPrinted(std::string& text, const char* format, const PrintfValue* arguments);
+
+// The same with arguments that the compiler has seen fit.
+template <typename... Arguments>
+void appendText(
+    std::string& text, PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
+{
+    const PrintfValue values[] = {
+        PrintfValue(static_cast<PrintfArgument<Arguments>>(arguments))..., PrintfValue(0)};
+    appendPrinted(text, format.text(), values);
+}
+
+// A text made by a printf format. Texts of any length come out whole.
+template <typename... Arguments>
+std::string text(PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
+{
+    std::string result;
+    appendText(result, format, arguments...);
+    return result;
+}
 
 } // namespace orvex

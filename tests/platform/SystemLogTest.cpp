@@ -20,12 +20,11 @@ extern "C" [[gnu::format(printf, 2, 3)]] void syslog(int priority, const char* f
 
 void syslog(int priority, const char* format, ...)
 {
-    std::string line;
     std::va_list arguments;
     va_start(arguments, format);
-    orvex::formatInto(line, format, arguments);
+    std::fprintf(stderr, "syslog %d ", priority);
+    std::vfprintf(stderr, format, arguments);
     va_end(arguments);
-    std::fprintf(stderr, "syslog %d %s", priority, line.c_str());
 }
 
 namespace orvex {

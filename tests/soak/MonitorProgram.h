@@ -13,7 +13,7 @@ namespace orvex::soak {
 // What the window's status line said from a moment on.
 struct Status {
     qint64 at = 0; // ms since the start of the monitor
-    long long decoded = 0;
+    long decoded = 0;
     QString text;
     QDateTime saidAt;
 

@@ -48,7 +48,7 @@ void MonitorWatch::beginStep()
     _decodedBefore = _monitor.status().decoded;
 }
 
-void MonitorWatch::awaitUpdate(long long sentBefore)
+void MonitorWatch::awaitUpdate(long sentBefore)
 {
     const auto longest = kRetry + kQuery + kRefresh + _slack;
     const auto isAwaited = [&] { return _monitor.status().isUpdate() && decodedInStep() > sentBefore; };
@@ -90,10 +90,10 @@ void MonitorWatch::watchSilence(Milliseconds time)
     expectUpdate(_monitor.status());
 }
 
-void MonitorWatch::awaitDecoded(long long messages)
+void MonitorWatch::awaitDecoded(long messages)
 {
     expect(_monitor.waitUntil([&] { return decodedInStep() >= messages; }, kLongestBacklog + _slack),
-        text("%lld messages decoded", messages), shown());
+        text("%ld messages decoded", messages), shown());
     expectUpdate(_monitor.status());
 }
 
@@ -148,7 +148,7 @@ std::string MonitorWatch::shown() const
     std::string result;
     for (std::size_t i = _firstStatus; i < _monitor.statuses().size(); ++i) {
         const Status& status = _monitor.statuses()[i];
-        result += text("\n      %.1f s ago, %lld messages into the step: %s",
+        result += text("\n      %.1f s ago, %ld messages into the step: %s",
             inSeconds(Milliseconds(_monitor.now() - status.at)), status.decoded - _decodedBefore,
             status.text.toStdString().c_str());
     }

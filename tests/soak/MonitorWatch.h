@@ -20,17 +20,17 @@ public:
     // After the start there is no service.
     void awaitLaunch();
     void beginStep();
-    long long decodedInStep() const { return _monitor.status().decoded - _decodedBefore; }
+    long decodedInStep() const { return _monitor.status().decoded - _decodedBefore; }
 
     // A service has come. Waits until an update shows more messages of this step than those that a service
     // before it has sent. Without such a one nothing else is shown before.
-    void awaitUpdate(long long sentBefore);
+    void awaitUpdate(long sentBefore);
     // The service streams for so long: updates alone, as often as they should come.
     void watchStream(Milliseconds time);
     // The service says nothing for so long: one update is still due, nothing more.
     void watchSilence(Milliseconds time);
     // Waits until an update shows so many messages of this step.
-    void awaitDecoded(long long messages);
+    void awaitDecoded(long messages);
     void expectDecoded(Range sent) const;
 
     // Before a service goes.
@@ -50,7 +50,7 @@ private:
     MonitorProgram& _monitor;
     Milliseconds _slack;
     std::size_t _firstStatus = 0; // of this step
-    long long _decodedBefore = 0;
+    long _decodedBefore = 0;
 };
 
 } // namespace orvex::soak

@@ -32,7 +32,7 @@ double median(std::span<const ProcessFigures> samples, double ProcessFigures::*f
 }
 } // namespace
 
-ProcessFigures ProcessFigures::of(long long process)
+ProcessFigures ProcessFigures::of(long process)
 {
     const std::filesystem::path folder = "/proc/" + std::to_string(process);
     ProcessFigures result;

@@ -11,7 +11,7 @@ struct ProcessFigures {
     double megabytes = 0; // resident
     double threads = 0;
 
-    static ProcessFigures of(long long process);
+    static ProcessFigures of(long process);
     std::string text() const;
 };
 

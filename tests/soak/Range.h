@@ -6,10 +6,10 @@ namespace orvex::soak {
 
 // A number of messages, as far as it can be known; both bounds included.
 struct Range {
-    long long least = 0;
-    long long most = 0;
+    long least = 0;
+    long most = 0;
 
-    bool contains(long long number) const { return number >= least && number <= most; }
+    bool contains(long number) const { return number >= least && number <= most; }
     std::string text() const
     {
         return least == most ? std::to_string(least) : std::to_string(least) + " to " + std::to_string(most);

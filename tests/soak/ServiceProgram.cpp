@@ -12,20 +12,20 @@
 namespace orvex::soak {
 
 namespace {
-constexpr long long kFrameHeader = 16; // bytes; the least that a message takes on its way
+constexpr long kFrameHeader = 16; // bytes; the least that a message takes on its way
 
 // The number in the line of koratd that the pattern matches.
-std::optional<long long> numberIn(const test::Program& korat, const char* pattern)
+std::optional<long> numberIn(const test::Program& korat, const char* pattern)
 {
     const QRegularExpression line(pattern, QRegularExpression::MultilineOption);
     const auto match = line.match(QString::fromStdString(korat.errors()));
     return match.hasMatch() ? std::optional(match.captured(1).toLongLong()) : std::nullopt;
 }
 
-long long messagesIn(const std::string& capture)
+long messagesIn(const std::string& capture)
 {
     const auto reader = CaptureReader::open(capture);
-    long long count = 0;
+    long count = 0;
     while (reader->next() == CaptureReader::Status::message)
         ++count;
     return count;
@@ -77,7 +77,7 @@ Range ServiceProgram::kill()
 {
     _program.kill();
     const auto mostAllowed = static_cast<double>(_life.elapsed()) * _scene.rate.value_or(0) / 1000 + 1;
-    return {messagesIn(_recording), static_cast<long long>(mostAllowed)};
+    return {messagesIn(_recording), static_cast<long>(mostAllowed)};
 }
 
 Range ServiceProgram::sent() const
@@ -86,8 +86,8 @@ Range ServiceProgram::sent() const
     expect(sent.has_value(), "koratd says how many messages it has sent", _program.errors());
     // What the monitor had not taken yet may be lost when koratd ends: that is nobody's fault.
     const auto pending = numberIn(_program, "^koratd: the client has not taken the last (\\d+) bytes$");
-    const long long lost = pending ? *pending / kFrameHeader + 1 : 0;
-    return {std::max(*sent - lost, 0LL), *sent};
+    const long lost = pending ? *pending / kFrameHeader + 1 : 0;
+    return {std::max(*sent - lost, 0L), *sent};
 }
 
 } // namespace orvex::soak

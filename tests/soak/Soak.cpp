@@ -49,20 +49,20 @@ void Soak::take(const Steps::Kind& kind)
     ++_taken[kind.name];
     _sent += _steps.sent();
     _figures.push_back(ProcessFigures::of(_monitor.id()));
-    std::printf("%4.1f s  %s: sent %s, decoded %lld; %s\n",
-        static_cast<double>(_monitor.now() - start) / 1000, _steps.played().c_str(),
-        _steps.sent().text().c_str(), _watch.decodedInStep(), _figures.back().text().c_str());
+    std::printf("%4.1f s  %s: sent %s, decoded %ld; %s\n", static_cast<double>(_monitor.now() - start) / 1000,
+        _steps.played().c_str(), _steps.sent().text().c_str(), _watch.decodedInStep(),
+        _figures.back().text().c_str());
     std::fflush(stdout);
 }
 
 void Soak::finish()
 {
-    const long long decoded = _monitor.status().decoded;
+    const long decoded = _monitor.status().decoded;
     _monitor.terminate();
     std::printf("%zu steps:", _figures.size());
     for (const auto& [name, count] : _taken)
         std::printf(" %d %s;", count, name.c_str());
-    std::printf("\nsent %s messages, decoded %lld\n", _sent.text().c_str(), decoded);
+    std::printf("\nsent %s messages, decoded %ld\n", _sent.text().c_str(), decoded);
     _figures.erase(_figures.begin(), _figures.begin() + kWarmUp);
     std::printf("after the first step: %s\n", summaryOf(_figures).c_str());
     std::fflush(stdout);

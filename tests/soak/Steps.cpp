@@ -228,7 +228,7 @@ std::unique_ptr<ServiceProgram> Steps::serve(const Scene& scene)
     return std::make_unique<ServiceProgram>(_folder, scene);
 }
 
-std::unique_ptr<ServiceProgram> Steps::stream(const Scene& scene, long long sentBefore)
+std::unique_ptr<ServiceProgram> Steps::stream(const Scene& scene, long sentBefore)
 {
     auto service = serve(scene);
     _watch.awaitUpdate(sentBefore);

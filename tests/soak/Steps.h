@@ -57,7 +57,7 @@ private:
     Scene anyScene();
     std::unique_ptr<ServiceProgram> serve(const Scene& scene);
     // Serves until the monitor shows messages, after those that were sent in this step before.
-    std::unique_ptr<ServiceProgram> stream(const Scene& scene, long long sentBefore = 0);
+    std::unique_ptr<ServiceProgram> stream(const Scene& scene, long sentBefore = 0);
     void endInOrder(ServiceProgram& service);
     void unansweredQuery(const char* fault, const char* error);
     void noSession(const Scene& scene, const char* error);

@@ -51,8 +51,8 @@ bool KoratService::start()
     auto local = _platform.ports.createLocalPort(telephony::kServicePortName,
         [this](std::int32_t messageId, ByteView data) { return receive(messageId, data); });
     if (!local.port || local.alreadyExisted) {
-        report(local.alreadyExisted ? "another service is running already" : "the port %s cannot be created",
-            telephony::kServicePortName);
+        reportText(local.alreadyExisted ? "another service is running already"
+                                        : text("the port %s cannot be created", telephony::kServicePortName));
         return false;
     }
     _port = std::move(local.port);
@@ -83,7 +83,7 @@ void KoratService::stop()
 void KoratService::reportSent() const
 {
     const std::uint64_t sent = _sentBefore + (_channel ? _channel->sent() : 0);
-    report("sent %llu messages", static_cast<unsigned long long>(sent));
+    report("sent %zu messages", sent);
     if (const std::size_t pending = _channel ? _channel->pendingBytes() : 0; pending > 0)
         report("the client has not taken the last %zu bytes", pending);
 }
@@ -126,8 +126,7 @@ void KoratService::closeChannel()
 {
     if (!_channel)
         return;
-    report("%s has left; sent %llu messages to it", _channel->clientPortName().c_str(),
-        static_cast<unsigned long long>(_channel->sent()));
+    report("%s has left; sent %zu messages to it", _channel->clientPortName().c_str(), _channel->sent());
     _sentBefore += _channel->sent();
     _channel.reset();
 }
