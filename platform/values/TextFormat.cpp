@@ -72,7 +72,7 @@ bool PrintfValue::appendPlainly(std::string& text, std::string_view conversion) 
     case Kind::text:
         if (conversion != "%s")
             return false;
-        text += _content.text;
+        text += _content.text ? _content.text : "(null)";
         return true;
     case Kind::pointer: break;
     }
