@@ -2,6 +2,7 @@
 
 #include "PropertyListCount.h"
 #include "PropertyListNode.h"
+#include "UTF8.h"
 
 #include "Array.h"
 #include "Dictionary.h"
@@ -169,15 +170,20 @@ private:
     {
         const bool isWide = object.kind == kUTF16;
         const auto bytes = bytesOf(object, isWide ? 2 : 1);
-        std::string text(bytes.begin(), bytes.end());
-        if (isWide) {
-            QString characters(static_cast<qsizetype>(object.size), Qt::Uninitialized);
-            qFromBigEndian<char16_t>(bytes.data(), characters.size(), characters.data());
-            // By way of whole characters: what is half of one becomes U+FFFD.
-            text = QString::fromStdU32String(characters.toStdU32String()).toStdString();
-        }
+        std::string text = isWide ? textOfUTF16(bytes) : std::string(bytes.begin(), bytes.end());
         if (text.find('\0') != std::string::npos)
             throw Fault("a zero character in a text");
+        return text;
+    }
+
+    // What is half of a character becomes U+FFFD.
+    static std::string textOfUTF16(std::span<const std::uint8_t> bytes)
+    {
+        QString characters(static_cast<qsizetype>(bytes.size() / 2), Qt::Uninitialized);
+        qFromBigEndian<char16_t>(bytes.data(), characters.size(), characters.data());
+        std::string text;
+        for (const char32_t character : characters.toStdU32String())
+            appendUTF8(text, character);
         return text;
     }
 

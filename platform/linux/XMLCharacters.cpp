@@ -1,8 +1,9 @@
 #include "XMLCharacters.h"
 
 #include "PropertyListCount.h"
+#include "UTF8.h"
 
-#include <QString>
+#include <QChar>
 
 #include <charconv>
 #include <cstdint>
@@ -40,7 +41,7 @@ void appendXMLReference(std::string& text, std::string_view reference)
     const char32_t character = characterOf(reference);
     if (character == 0)
         throw PropertyListFault("a malformed reference to a character");
-    text += QString::fromUcs4(&character, 1).toStdString();
+    appendUTF8(text, character);
 }
 
 } // namespace orvex

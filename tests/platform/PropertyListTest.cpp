@@ -32,7 +32,7 @@ TEST(PropertyList, ReadsEachKindOfXMLValue)
     } cases[] = {
         {"<string>a&lt;b&amp;c &#228;</string>", "a<b&c \u00e4"},
         {"<string>a<!-- <array> -->b<![CDATA[<c>]]></string>", "ab<c>"},
-        {"<string> &quot;&#x1F600;&apos;&#65;&gt; </string>", " \"\U0001F600'A> "},
+        {"<string> &quot;&#xFEFF;&#x1F600;&apos;&#65;&#228;&gt; </string>", " \"\uFEFF\U0001F600'A\u00e4> "},
         {"<string/>", ""},
         {"<integer> 0xFF </integer>", 255},
         {"<integer>-9223372036854775808</integer>", kLowest},
@@ -72,7 +72,7 @@ TEST(PropertyList, ReadsEachKindOfBinaryValue)
     } cases[] = {
         {"ascii", {{0x52, 'h', 'i'}}, "hi"},
         {"utf-16", {{0x62, 0x00, 0xE4, 0x20, 0xAC}}, "\u00e4\u20ac"},
-        {"utf-16 beyond", {{0x63, 0xD8, 0x3D, 0xDE, 0x00, 0xDE, 0x00}}, "\U0001F600\uFFFD"},
+        {"utf-16 beyond", {{0x64, 0xFE, 0xFF, 0xD8, 0x3D, 0xDE, 0x00, 0xDE, 0x00}}, "\uFEFF\U0001F600\uFFFD"},
         {"long text", {{0x5F, 0x11, 0x00, 0x02, 'h', 'i'}}, "hi"},
         {"one byte is never negative", {{0x10, 0xFF}}, 255},
         {"two bytes", {{0x11, 0x12, 0x34}}, 0x1234},
