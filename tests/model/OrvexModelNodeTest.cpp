@@ -87,16 +87,5 @@ TEST(OrvexModelNode, PathDictionaryKeepsTheLaterOfTwoNodes)
     EXPECT_FALSE(NodesByPath()["/"]);
 }
 
-TEST(OrvexModelNode, NodeOutlivesItsTree)
-{
-    OrvexModelNodeRef leaf;
-    {
-        NodesByPath nodes;
-        const auto root = OrvexModelNode::makeTreeFromObject(nested("kept"), nodes);
-        leaf = root->childNodes()->front();
-    }
-    EXPECT_EQ(*leaf->value(), "kept");
-}
-
 } // namespace
 } // namespace orvex::test

@@ -29,11 +29,8 @@ private:
     std::function<void()> _callback;
 };
 
-// The telephony service and its message ports in one, with a switch for everything that can go wrong. As it
-// comes, it answers with `technology` and takes every command.
-class FakeTelephony final : public MessagePorts, public TelephonyService {
-public:
-    // What goes wrong.
+// Everything that can go wrong with the telephony service. As it comes, nothing does.
+struct TelephonyFaults {
     bool localPortFails = false;
     bool localPortExists = false;
     bool serviceIsAbsent = false;
@@ -42,13 +39,16 @@ public:
     bool remotePortFails = false;
     RemotePort::Status requestStatus = RemotePort::Status::success;
     RemotePort::Status commandStatus = RemotePort::Status::success;
-    std::optional<Bytes> rawReply; // in place of the well-formed one; empty for no reply at all
+    std::optional<std::string> rawReply = {}; // in place of the well-formed one; empty for no reply at all
     Value technology = telephony::kTechnologyMRL_LTE;
+};
 
+// The telephony service and its message ports in one. It answers with `technology` and takes every command.
+class FakeTelephony final : public MessagePorts, public TelephonyService, public TelephonyFaults {
+public:
     // What was seen.
     int localPortsCreated = 0;
-    std::vector<Value> requests;
-    std::vector<Value> commands;
+    std::vector<Value> sent; // the query, then the command
     std::shared_ptr<FakePort<LocalPort>> localPort;
     std::shared_ptr<FakePort<RemotePort>> remotePort;
 
@@ -111,7 +111,7 @@ private:
         {
             _owner.messageIds.push_back(messageId);
             _owner.timeouts.push_back(timeout);
-            _owner.commands.push_back(propertyListFromData(data).value.value_or(Value()));
+            _owner.sent.push_back(propertyListFromData(data).value.value_or(Value()));
             return _owner.commandStatus;
         }
         SendResult request(std::int32_t messageId, ByteView data, std::chrono::milliseconds sendTimeout,
@@ -119,11 +119,13 @@ private:
         {
             _owner.messageIds.push_back(messageId);
             _owner.timeouts.insert(_owner.timeouts.end(), {sendTimeout, receiveTimeout});
-            _owner.requests.push_back(propertyListFromData(data).value.value_or(Value()));
+            _owner.sent.push_back(propertyListFromData(data).value.value_or(Value()));
             if (_owner.requestStatus != Status::success)
                 return {_owner.requestStatus, std::nullopt};
+            if (_owner.rawReply == "")
+                return {Status::success, std::nullopt};
             if (_owner.rawReply)
-                return {Status::success, _owner.rawReply->empty() ? std::nullopt : _owner.rawReply};
+                return {Status::success, Bytes(_owner.rawReply->begin(), _owner.rawReply->end())};
             return {
                 Status::success, propertyListXML(Dictionary::make({{"GetTechnology", _owner.technology}}))};
         }

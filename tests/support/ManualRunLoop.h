@@ -14,12 +14,12 @@ public:
     void post(Task task) override { _posted.push_back(std::move(task)); }
     void postAfter(std::chrono::nanoseconds delay, Task task) override
     {
-        _delayed.push_back({_now + delay, std::move(task)});
+        _waiting.push_back({nullptr, _now + delay, {}, std::move(task)});
     }
     std::unique_ptr<Timer> startTimer(std::chrono::nanoseconds period, Task task) override
     {
         auto timer = std::make_unique<ManualTimer>(*this);
-        _timers.push_back({timer.get(), _now + period, period, std::move(task)});
+        _waiting.push_back({timer.get(), _now + period, period, std::move(task)});
         return timer;
     }
 
@@ -37,14 +37,27 @@ public:
     void advance(std::chrono::nanoseconds duration)
     {
         const auto end = _now + duration;
-        runPosted();
-        while (runNextDueBy(end))
+        for (;;) {
             runPosted();
+            const auto next = std::ranges::min_element(_waiting, {}, &Waiting::due);
+            if (next == _waiting.end() || next->due > end)
+                break;
+            _now = next->due;
+            const Task task = next->task; // which may destroy its timer
+            if (next->timer)
+                next->due += next->period;
+            else
+                _waiting.erase(next);
+            task();
+        }
         _now = end;
     }
 
-    std::size_t delayedCount() const { return _delayed.size(); }
-    std::size_t timerCount() const { return _timers.size(); }
+    std::size_t timerCount() const { return _waiting.size() - delayedCount(); }
+    std::size_t delayedCount() const
+    {
+        return static_cast<std::size_t>(std::ranges::count(_waiting, nullptr, &Waiting::timer));
+    }
 
 private:
     struct ManualTimer final : Timer {
@@ -54,48 +67,23 @@ private:
         }
         ~ManualTimer() override
         {
-            std::erase_if(_loop._timers, [this](const Running& running) { return running.timer == this; });
+            std::erase_if(_loop._waiting, [this](auto& each) { return each.timer == this; });
         }
         ManualTimer(const ManualTimer&) = delete;
         ManualTimer& operator=(const ManualTimer&) = delete;
 
         ManualRunLoop& _loop;
     };
-    struct Delayed {
-        std::chrono::nanoseconds due;
-        Task task;
-    };
-    struct Running {
-        const Timer* timer;
+    struct Waiting {
+        const Timer* timer; // null for what comes once
         std::chrono::nanoseconds due;
         std::chrono::nanoseconds period;
         Task task;
     };
 
-    bool runNextDueBy(std::chrono::nanoseconds end)
-    {
-        const auto delayed = std::ranges::min_element(_delayed, {}, &Delayed::due);
-        const auto running = std::ranges::min_element(_timers, {}, &Running::due);
-        const bool hasDelayed = delayed != _delayed.end() && delayed->due <= end;
-        const bool hasRunning = running != _timers.end() && running->due <= end;
-        if (hasDelayed && (!hasRunning || delayed->due <= running->due)) {
-            const Task task = std::move(delayed->task);
-            _now = delayed->due;
-            _delayed.erase(delayed);
-            task();
-        } else if (hasRunning) {
-            _now = running->due;
-            running->due += running->period;
-            const Task task = running->task; // the task may destroy its timer
-            task();
-        }
-        return hasDelayed || hasRunning;
-    }
-
     std::chrono::nanoseconds _now{0};
     std::deque<Task> _posted;
-    std::vector<Delayed> _delayed;
-    std::vector<Running> _timers;
+    std::vector<Waiting> _waiting;
 };
 
 } // namespace orvex::test
