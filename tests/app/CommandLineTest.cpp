@@ -14,23 +14,15 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         Action action;
         Mode theme = Mode::system;
         std::optional<std::string> resources = {};
-        bool printsStatus = false;
-        bool endsWhenPainted = false;
     } cases[] = {
         {{}, Action::window},
-        {{"--console"}, Action::console},
-        {{"--help"}, Action::help},
         {{"-h"}, Action::help},
         {{"--version", "--console"}, Action::version},
         {{"--resources", "/a b", "--dark"}, Action::window, Mode::dark, "/a b"},
-        {{"--resources=x", "--light"}, Action::window, Mode::light, "x"},
-        {{"--until-painted"}, Action::window, Mode::system, {}, false, true},
-        {{"--resources"}, Action::wrongUsage},
-        {{"--print-status"}, Action::window, Mode::system, {}, true},
+        {{"--light"}, Action::window, Mode::light},
         {{"--print-status", "--console"}, Action::wrongUsage},
         {{"--print-status", "--open", "a"}, Action::wrongUsage},
         {{"--no-such"}, Action::wrongUsage},
-        {{"--console=yes"}, Action::wrongUsage},
         {{"file"}, Action::wrongUsage},
         {{"--light", "--dark"}, Action::wrongUsage},
     };
@@ -40,8 +32,6 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         EXPECT_EQ(result.action, test.action);
         EXPECT_EQ(result.theme, test.theme);
         EXPECT_EQ(result.resources, test.resources);
-        EXPECT_EQ(result.printsStatus, test.printsStatus);
-        EXPECT_EQ(result.endsWhenPainted, test.endsWhenPainted);
         EXPECT_EQ(result.error.empty(), test.action != Action::wrongUsage);
     }
 }

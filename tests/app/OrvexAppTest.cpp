@@ -2,8 +2,8 @@
 
 #include "PaneFixture.h"
 #include "SessionFixture.h"
+#include "StatusPrinter.h"
 
-#include "FirstPaint.h"
 #include "FixedPaths.h"
 
 #include <filesystem>
@@ -53,19 +53,6 @@ TEST_F(OrvexAppTest, LaunchesBeforeItStartsTheSession)
     EXPECT_EQ(status(), "Connecting...") << "connected, and nothing has arrived";
 }
 
-TEST_F(OrvexAppTest, TellsOnceThatItsWindowWasPainted)
-{
-    int times = 0;
-    const FirstPaint firstPaint([&times] { ++times; });
-    QCoreApplication::processEvents();
-    EXPECT_EQ(times, 0) << "there is no window";
-    app->applicationDidFinishLaunching();
-    EXPECT_TRUE(QTest::qWaitFor([&times] { return times > 0; }));
-    app->window()->repaint();
-    QCoreApplication::processEvents();
-    EXPECT_EQ(times, 1);
-}
-
 TEST_F(OrvexAppTest, SaysWhenItWasUpdatedAndLeavesAScreenWhoseRowIsGone)
 {
     launchAndShow(2);
@@ -104,6 +91,35 @@ TEST_F(OrvexAppTest, SaysThatItConnectsFromTheNextRefreshOrNavigationAfterALoss)
     EXPECT_EQ(status(), "Updated 2023-11-15 at 00:13:20"); // of the last data
 }
 
+TEST_F(OrvexAppTest, StatusPrinterPrintsTheLineOnScreenWhenItChanges)
+{
+    RecordingOutput output;
+    const StatusPrinter printer(*app, output);
+    const auto printed = [&output] {
+        QCoreApplication::processEvents(); // all that is to be drawn is drawn
+        return output.take();
+    };
+    launch();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(printed(), "0 Connecting...\n");
+    deliverNeighbors(1);
+    deliverNeighbors(2);
+    EXPECT_EQ(printed(), "");
+    refresh();
+    EXPECT_EQ(printed(), "2 Updated 2023-11-15 at 00:13:20\n");
+    deliverNeighbors(3);
+    refresh(); // at the same time
+    EXPECT_EQ(printed(), "");
+
+    loseService();
+    refresh(); // nothing is drawn without a message
+    EXPECT_EQ(printed(), "");
+    tapRow(pane(0).tableList(), 1);
+    EXPECT_EQ(printed(), "3 Connecting...\n");
+    app->applicationWillTerminate();
+    EXPECT_EQ(printed(), "");
+}
+
 TEST_F(OrvexAppTest, OffersTheSaveButtonOnInternalBuildsAlone)
 {
     const std::filesystem::path marker = paths::internalBuildMarker();
@@ -131,8 +147,15 @@ TEST_F(OrvexAppTest, OffersTheSaveButtonOnInternalBuildsAlone)
 
 TEST_F(OrvexAppTest, TerminatesOnceAndLeavesNothingRunning)
 {
+    app->applicationDidFinishLaunching();
+    app->applicationWillTerminate(); // before the session has started
+    runLoop.runPosted();
+    EXPECT_EQ(telephony.localPortsCreated, 0);
+
+    app = OrvexApp::create(platform());
     launch();
     deliverNeighbors(1); // an update is under way
+    preferences.done.clear();
     app->applicationWillTerminate();
     app->applicationWillTerminate();
     EXPECT_EQ(preferences.done, kHomeScreenWrite);
@@ -140,20 +163,11 @@ TEST_F(OrvexAppTest, TerminatesOnceAndLeavesNothingRunning)
     EXPECT_FALSE(telephony.localPort->valid);
     EXPECT_EQ(runLoop.timerCount(), 0U);
     refresh();
-}
-
-TEST_F(OrvexAppTest, TerminatesBeforeTheSessionStartedAndWhileARetryWaits)
-{
-    app->applicationDidFinishLaunching();
-    app->applicationWillTerminate();
-    runLoop.runPosted();
-    EXPECT_EQ(telephony.localPortsCreated, 0);
 
     telephony.serviceIsAbsent = true;
     app = OrvexApp::create(platform());
     launch();
     ASSERT_EQ(runLoop.delayedCount(), 1U);
-    app->applicationWillTerminate();
     app.reset();
     telephony.serviceIsAbsent = false;
     runLoop.advance(std::chrono::seconds(5));

@@ -12,32 +12,27 @@ namespace {
 
 TEST(OrvexCellLayout, PlacesALeafByTheTextSizes)
 {
+    const QSizeF key(100, 17);
+    const QSizeF value(80, 20);
     const struct {
         const char* name;
-        QRectF bounds;
-        QSizeF key, value;
-        QRectF keyFrame, valueFrame, view;
+        double width;
+        double valueLeft;
         double contentWidth;
     } cases[] = {
-        {"fits: value flush right", {0, 0, 365, 44}, {100, 18}, {80, 20}, {10, 13, 100, 18},
-            {285, 12, 80, 20}, {0, 0, 365, 50}, 365},
-        {"exactly as wide: after the gap, nothing to scroll", {0, 0, 240, 44}, {100, 18}, {80, 18},
-            {10, 13, 100, 18}, {160, 13, 80, 18}, {0, 0, 240, 50}, 240},
-        {"one point too wide", {0, 0, 239, 44}, {100, 18}, {80, 18}, {10, 13, 100, 18}, {160, 13, 80, 18},
-            {0, 0, 239, 50}, 419},
-        {"exactly as wide, not at the origin", {4, 0, 240, 44}, {100, 18}, {80, 18}, {14, 13, 100, 18},
-            {164, 13, 80, 18}, {4, 0, 240, 50}, 240},
-        {"bounds not at the origin", {4, 6, 300, 44}, {30, 17}, {400, 18}, {14, 13.5, 30, 17},
-            {94, 13, 400, 18}, {4, 6, 300, 50}, 730},
+        {"fits: value flush right", 365, 285, 365},
+        {"exactly as wide: after the gap, nothing to scroll", 240, 164, 240},
+        {"one point too wide", 239, 164, 419},
     };
-    for (const auto& test : cases) {
-        SCOPED_TRACE(test.name);
-        const LeafCellLayout layout = leafCellLayout(test.bounds, test.key, test.value);
-        EXPECT_EQ(layout.key, test.keyFrame);
-        EXPECT_EQ(layout.value, test.valueFrame);
-        EXPECT_EQ(layout.view, test.view);
-        EXPECT_EQ(layout.contentSize, QSizeF(test.contentWidth, 50));
-        EXPECT_EQ(branchCellKeyFrame(test.bounds, test.key), test.keyFrame);
+    for (const auto& [name, width, valueLeft, contentWidth] : cases) {
+        SCOPED_TRACE(name);
+        const QRectF bounds(4, 6, width, 44);
+        const LeafCellLayout layout = leafCellLayout(bounds, key, value);
+        EXPECT_EQ(layout.key, QRectF(14, 13.5, 100, 17));
+        EXPECT_EQ(layout.value, QRectF(valueLeft, 12, 80, 20));
+        EXPECT_EQ(layout.view, QRectF(4, 6, width, 50));
+        EXPECT_EQ(layout.contentSize, QSizeF(contentWidth, 50));
+        EXPECT_EQ(branchCellKeyFrame(bounds, key), layout.key);
     }
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "AppPlatform.h"
+#include "ConsoleOutput.h"
 
 #include "FakeTelephony.h"
 #include "FixedClock.h"
@@ -30,6 +31,19 @@ public:
     }
 
     std::vector<std::string> done;
+};
+
+class RecordingOutput final : public ConsoleOutput {
+public:
+    void write(std::string_view text) override { _written += text; }
+    std::optional<TerminalSize> terminalSize() const override { return size; }
+    // What was written since the last call.
+    std::string take() { return std::exchange(_written, {}); }
+
+    std::optional<TerminalSize> size;
+
+private:
+    std::string _written;
 };
 
 inline const std::vector<std::string> kHomeScreenWrite = {
