@@ -53,13 +53,12 @@ public:
         return reply && reply->dictionary() ? (*reply->dictionary())["GetTechnology"] : Value();
     }
 
-    void send(const DictionaryRef& command)
+    // Without lists of codes everything is asked for.
+    void send(const DictionaryRef& command = Dictionary::make({{"SetState", "Streaming"}}))
     {
         EXPECT_EQ(_channel->send(0, *propertyListXML(command), std::chrono::seconds(1)),
             RemotePort::Status::success);
     }
-
-    bool isServed() const { return _channel && _channel->isValid(); }
 
     // How many messages of each type and code there were: 0xB179, 0xFF0001...
     std::map<unsigned, std::size_t> codes() const

@@ -1,55 +1,134 @@
-// The whole road with real programs: koratd, and the monitor in a terminal.
+// The whole road with real programs: koratd, the monitor, and captures of what went between them.
 
+#include "KoratClient.h"
 #include "KoratProgram.h"
 
+#include "CaptureReader.h"
+
 #include <gmock/gmock.h>
+
+#include <algorithm>
 
 namespace orvex::test {
 namespace {
 
-using testing::HasSubstr;
-using testing::Not;
+using namespace std::chrono_literals;
 
-class ConsoleProgram : public Program {
-public:
-    explicit ConsoleProgram(const ProgramFolder& folder)
-        : Program(folder, ORVEX_PATH, {"--console"})
-    {
-    }
+struct Captured {
+    std::chrono::microseconds time; // since the first message
+    Bytes message;
+
+    bool operator==(const Captured&) const = default;
 };
 
-TEST(LiveSession, EndsWhenItsWindowWasPaintedIfItIsTo)
+std::vector<Captured> messagesIn(const std::string& path)
 {
-    const ProgramFolder folder;
+    std::vector<Captured> result;
+    const auto reader = CaptureReader::open(path);
+    std::optional<std::chrono::microseconds> start;
+    while (reader->next() == CaptureReader::Status::message) {
+        start = start.value_or(reader->time());
+        result.push_back(
+            {reader->time() - *start, Bytes(reader->message().begin(), reader->message().end())});
+    }
+    return result;
+}
+
+class LiveSession : public testing::Test {
+protected:
+    QString path(const char* name) const { return QString::fromStdString(folder.path(name)); }
+    std::size_t countIn(const char* name) const { return messagesIn(folder.path(name)).size(); }
+
+    // The tree that the monitor shows last, in a session with koratd that records so many messages.
+    std::string lastTreeOfMonitor(const QStringList& arguments, const char* record, std::size_t count) const
+    {
+        const KoratProgram korat(folder, arguments + QStringList{"--record", path(record)});
+        Program monitor(folder, ORVEX_PATH, {"--console"});
+        EXPECT_TRUE(waitUntil([&] { return countIn(record) == count; }, 30s)) << countIn(record);
+        turnFor(2500ms); // a refresh comes every two seconds
+        EXPECT_EQ(monitor.terminate(), 0);
+        const std::string output = monitor.output();
+        const auto status = output.rfind("Updated ");
+        return status == std::string::npos ? output : output.substr(output.find('\n', status) + 1);
+    }
+
+    const ProgramFolder folder{};
+};
+
+TEST_F(LiveSession, RecordedReplayedAndRecordedAgainItIsTheSame)
+{
+    constexpr std::size_t kCount = 2000;
+    for (const char* technology : {"MRL_LTE", "MRL_GSM", "MRL_UTRAN2", "MRL_CDMA", "IFX"}) {
+        SCOPED_TRACE(technology);
+        const auto record = [&](const char* name, QStringList arguments) {
+            arguments << "--technology" << technology << "--rate"
+                      << "20000"
+                      << "--record" << path(name);
+            KoratProgram korat(folder, arguments);
+            KoratClient client(folder.ports());
+            EXPECT_EQ(client.open(), 0);
+            EXPECT_EQ(client.technology(), Value(technology));
+            client.send();
+            EXPECT_TRUE(waitUntil([&] { return client.messages.size() >= kCount; }, 20s));
+            EXPECT_EQ(korat.terminateAndCount(), kCount);
+            return client.messages;
+        };
+        const auto received = record("first", {"--count", QString::number(kCount)});
+        const auto receivedAgain = record("second", {"--replay", path("first")});
+        EXPECT_TRUE(received == receivedAgain);
+
+        const auto first = messagesIn(folder.path("first"));
+        ASSERT_EQ(first.size(), kCount);
+        EXPECT_TRUE(std::ranges::equal(first, received, {}, &Captured::message));
+        EXPECT_TRUE(first == messagesIn(folder.path("second")));
+        // Messages stand at the scenario's times, however fast they went.
+        EXPECT_GT(first.back().time, 20s);
+    }
+}
+
+TEST_F(LiveSession, MonitorAndDecoderShowTheSameOfIt)
+{
+    constexpr std::size_t kCount = 3000;
+    for (const char* technology : {"MRL_LTE", "MRL_CDMA"}) {
+        SCOPED_TRACE(technology);
+        const QStringList arguments = {"--technology", technology, "--rate", "10000"};
+        const std::string live =
+            lastTreeOfMonitor(arguments + QStringList{"--count", QString::number(kCount)}, "live", kCount);
+        const std::string replayed =
+            lastTreeOfMonitor(arguments + QStringList{"--replay", path("live")}, "replayed", kCount);
+        Program decoder(folder, ORVEX_DECODE, {"--technology", technology, path("live")});
+        EXPECT_EQ(decoder.waitForEnd(), 0) << decoder.errors();
+        EXPECT_GT(live.size(), 500U);
+        EXPECT_EQ(live, decoder.output());
+        EXPECT_EQ(replayed, decoder.output());
+    }
+}
+
+TEST_F(LiveSession, FullDiskEndsTheRecordingOnly)
+{
+    // A limit of the file's size stands for the disk.
+    Program korat(folder, "/bin/sh",
+        {"-c", R"(trap '' XFSZ; ulimit -f 16; exec "$0" "$@")", KORATD_PATH, "--rate", "2000", "--record",
+            path("capture")});
+    KoratClient client(folder.ports());
+    ASSERT_TRUE(waitUntil([&] { return client.open() == 0; }));
+    client.send();
+    ASSERT_TRUE(korat.waitForError("File too large; recording ends here"));
+    const std::size_t before = client.messages.size();
+    EXPECT_TRUE(waitUntil([&] { return client.messages.size() > before + 1000; }));
+    EXPECT_EQ(korat.terminate(), 0);
+    EXPECT_EQ(QString::fromStdString(korat.errors()).count("recording ends"), 1) << korat.errors();
+    EXPECT_GT(countIn("capture"), 10U);
+}
+
+TEST_F(LiveSession, EndsWhenItsWindowWasPaintedIfItIsTo)
+{
     Program monitor(folder, ORVEX_PATH, {"--until-painted"});
     EXPECT_EQ(monitor.waitForEnd(), 0) << monitor.errors();
     EXPECT_EQ(monitor.output(), "painted\n");
 }
 
-TEST(LiveSession, ComesBackAfterTheServiceWasKilled)
-{
-    const ProgramFolder folder;
-    auto korat = std::make_unique<KoratProgram>(folder);
-    ConsoleProgram monitor(folder);
-    ASSERT_TRUE(monitor.waitForOutput("Updated 2"));
-    EXPECT_THAT(monitor.errors(), Not(HasSubstr("INVALIDATED")));
-
-    korat->kill();
-    QElapsedTimer elapsed;
-    elapsed.start();
-    ASSERT_TRUE(monitor.waitForError(" ***** INVALIDATED "));
-    EXPECT_LE(elapsed.restart(), 4500); // the next tick
-    ASSERT_TRUE(monitor.waitForError("Could not create KoratServerConnection"));
-    EXPECT_LE(elapsed.elapsed(), 3000); // at once, not after the five seconds of a failed start
-    EXPECT_TRUE(monitor.waitForOutput("Connecting...", 2));
-
-    const auto before = static_cast<int>(QString::fromStdString(monitor.output()).count("Updated 2"));
-    korat = std::make_unique<KoratProgram>(folder);
-    EXPECT_TRUE(monitor.waitForOutput("Updated 2", before + 2));
-    EXPECT_THAT(monitor.errors(), Not(HasSubstr("already exists")));
-}
-
-TEST(LiveSession, AFaultIsLoggedAndLeavesTheMonitorConnecting)
+TEST_F(LiveSession, AFaultIsLoggedAndLeavesTheMonitorConnecting)
 {
     const std::pair<const char*, const char*> cases[] = {
         {"refuse-channel=35", "_KoratServerConnectionNetworkMonitorCreateLogChannel returns error: 35!"},
@@ -59,11 +138,10 @@ TEST(LiveSession, AFaultIsLoggedAndLeavesTheMonitorConnecting)
         {"unknown-technology", "No log generator technology works"},
     };
     for (const auto& [fault, line] : cases) {
-        const ProgramFolder folder;
         const KoratProgram korat(folder, {"--fault", fault});
-        ConsoleProgram monitor(folder);
+        Program monitor(folder, ORVEX_PATH, {"--console"});
         EXPECT_TRUE(monitor.waitForError(line)) << fault;
-        EXPECT_THAT(monitor.output(), Not(HasSubstr("Updated")));
+        EXPECT_THAT(monitor.output(), testing::Not(testing::HasSubstr("Updated")));
         EXPECT_EQ(monitor.terminate(), 0) << monitor.errors();
     }
 }

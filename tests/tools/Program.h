@@ -67,14 +67,10 @@ public:
     bool isRunning() const { return _process.state() == QProcess::Running; }
     qint64 id() const { return _process.processId(); }
 
-    // Wait until the text was written so many times.
-    bool waitForOutput(const char* text, int times = 1, std::chrono::milliseconds longest = kLongest)
+    // Waits until the text was written.
+    bool waitForError(const char* text)
     {
-        return waitUntil([&] { return _output.count(text) >= times; }, longest);
-    }
-    bool waitForError(const char* text, int times = 1, std::chrono::milliseconds longest = kLongest)
-    {
-        return waitUntil([&] { return _errors.count(text) >= times; }, longest);
+        return waitUntil([&] { return _errors.contains(text); }, kLongest);
     }
     std::jthread freezeFor(std::chrono::milliseconds time) { return test::freezeFor(id(), time); }
 

@@ -39,7 +39,7 @@ protected:
     const std::string& path = file.path;
 };
 
-TEST_F(ReplaySourceTest, PaceIsThatOfTheCaptureWhereItHasOne)
+TEST_F(ReplaySourceTest, PaceIsThatOfTheCaptureWhereItHasOneAndRoundsFollowAfterASecond)
 {
     using Times = std::vector<Microseconds>;
     const struct {
@@ -54,21 +54,16 @@ TEST_F(ReplaySourceTest, PaceIsThatOfTheCaptureWhereItHasOne)
     };
     for (const auto& [name, captured, due] : cases) {
         writePcap(std::vector<Bytes>(captured.size(), kPacket), captured);
-        ReplaySource source(path, false);
-        EXPECT_EQ(duesOf(source), due) << name;
-        EXPECT_FALSE(source.restart()) << name;
+        EXPECT_FALSE(ReplaySource(path, false).restart()) << name;
+        ReplaySource looped(path, true);
+        auto expected = due;
+        for (int round = 0; round < 3; ++round) {
+            EXPECT_EQ(duesOf(looped), expected) << name;
+            ASSERT_TRUE(looped.restart());
+            for (Microseconds& time : expected)
+                time += due.back() + 1s;
+        }
     }
-}
-
-TEST_F(ReplaySourceTest, RoundsOfALoopFollowAfterASecond)
-{
-    writePcap({kPacket, kPacket}, {0s, 2s});
-    ReplaySource source(path, true);
-    EXPECT_THAT(duesOf(source), ElementsAre(0s, 2s));
-    ASSERT_TRUE(source.restart());
-    EXPECT_THAT(duesOf(source), ElementsAre(3s, 5s));
-    ASSERT_TRUE(source.restart());
-    EXPECT_THAT(duesOf(source), ElementsAre(6s, 8s));
 }
 
 TEST_F(ReplaySourceTest, MessagesAreWantedByTheCodesInTheirHeaders)
@@ -83,10 +78,7 @@ TEST_F(ReplaySourceTest, MessagesAreWantedByTheCodesInTheirHeaders)
         {"behind a prefix", {0x81, 255, 1, 9, 9, 0x79, 0xB1, 8, 9, 10, 11, 12, 13}, 0xB179},
         {"extra packet behind a prefix", {0x81, 1, 255, 9, 9, 2, 0, 8, 9, 10, 11, 12, 13}, 0xFF0002},
         {"shorter than a header", Bytes(kPacket.begin(), kPacket.end() - 1), std::nullopt},
-        {"another log type", {2, 12, 0, 0xC1, 0xB0, 0, 0, 0, 0, 0, 0, 0, 0}, std::nullopt},
-        {"property list", {'<', 'p', 'l', 'i', 's', 't', '>', '<', 'd', 'i', 'c', 't', '/', '>'},
-            std::nullopt},
-        {"nothing", {}, std::nullopt},
+        {"another log type", Bytes(20, 2), std::nullopt},
     };
     for (const auto& [name, message, code] : cases) {
         writePcap({message}, {0s});
@@ -109,9 +101,6 @@ TEST_F(ReplaySourceTest, CaptureThatBreaksIsPlayedUpToThereAndSaysSoOnce)
     ASSERT_TRUE(source.restart());
     testing::internal::CaptureStderr();
     EXPECT_THAT(duesOf(source), ElementsAre(1s));
-    std::filesystem::remove(path);
-    ASSERT_TRUE(source.restart());
-    EXPECT_FALSE(source.nextIfAny());
     EXPECT_EQ(testing::internal::GetCapturedStderr(), "");
 }
 

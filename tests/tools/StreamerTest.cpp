@@ -1,9 +1,12 @@
 #include "service/Streamer.h"
 
+#include "replay/ReplaySource.h"
 #include "scenarios/ScenarioTable.h"
 
 #include "FakeTelephony.h"
 #include "ManualRunLoop.h"
+#include "PcapWriter.h"
+#include "TemporaryFile.h"
 
 #include "Array.h"
 
@@ -39,12 +42,13 @@ struct SlowClient final : test::FakePort<RemotePort> {
     std::vector<Bytes> received;
 };
 
+std::unique_ptr<MessageSource> lteTown()
+{
+    return findScenario("MRL_LTE", "")->make({});
+}
+
 class StreamerTest : public testing::Test {
 protected:
-    void stream(const DictionaryRef& command, const Streamer::Pace& pace)
-    {
-        stream(command, pace, findScenario("MRL_LTE", "")->make({}));
-    }
     void stream(
         const DictionaryRef& command, const Streamer::Pace& pace, std::unique_ptr<MessageSource> source)
     {
@@ -61,10 +65,6 @@ protected:
         }
         return condition();
     }
-    void tick(int times)
-    {
-        tickUntil([] { return false; }, times);
-    }
 
     test::ManualRunLoop runLoop;
     std::shared_ptr<SlowClient> client = std::make_shared<SlowClient>();
@@ -72,44 +72,15 @@ protected:
     std::unique_ptr<Streamer> streamer;
 };
 
-// A few messages of code 1, again and again, or not.
-class Rounds final : public MessageSource {
-public:
-    Rounds(std::size_t length, bool isLooped)
-        : _length(length)
-        , _isLooped(isLooped)
-    {
-    }
-
-    std::optional<Item> nextIfAny() override
-    {
-        if (_place == _length)
-            return std::nullopt;
-        ++_place;
-        return Item{{}, {1, Bytes(20, static_cast<std::uint8_t>(_place))}};
-    }
-    bool restart() override
-    {
-        _place = 0;
-        return _isLooped;
-    }
-    std::vector<LogCode> codes() const override { return {}; }
-
-private:
-    std::size_t _length;
-    bool _isLooped;
-    std::size_t _place = 0;
-};
-
 TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
 {
     constexpr std::size_t kBacklog = std::size_t{4} << 20;
     constexpr std::size_t kLargestMessage = 1 << 16;
     client->refusals = 3;
-    stream(Dictionary::make(), {1e6, std::nullopt});
+    stream(Dictionary::make(), {1e6, std::nullopt}, lteTown());
     ASSERT_TRUE(tickUntil([&] { return client->pending > kBacklog; }));
     const std::size_t sent = client->received.size();
-    tick(5);
+    tickUntil([] { return false; }, 5);
     EXPECT_EQ(client->received.size(), sent);
     EXPECT_LE(client->pending, kBacklog + kLargestMessage);
 
@@ -117,14 +88,14 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
     ASSERT_TRUE(tickUntil([&] { return client->received.size() > sent + 100; }));
     EXPECT_EQ(streamer->sent(), client->received.size());
     EXPECT_EQ(told, client->received);
-    const auto scenario = findScenario("MRL_LTE", "")->make({});
+    const auto scenario = lteTown();
     for (const Bytes& message : client->received)
-        ASSERT_EQ(message, scenario->next().message.bytes);
+        ASSERT_EQ(message, scenario->nextIfAny()->message.bytes);
 }
 
 TEST_F(StreamerTest, CountsOnlyMessagesThatTheClientWants)
 {
-    stream(Dictionary::make({{"SetMarlinLogCodes", Array::make({0xB0C1})}}), {2000, 30});
+    stream(Dictionary::make({{"SetMarlinLogCodes", Array::make({0xB0C1})}}), {2000, 30}, lteTown());
     ASSERT_TRUE(tickUntil([&] { return runLoop.timerCount() == 0; })); // it rests
     EXPECT_EQ(client->received.size(), 30U);
     for (const Bytes& message : client->received)
@@ -133,32 +104,35 @@ TEST_F(StreamerTest, CountsOnlyMessagesThatTheClientWants)
 
 TEST_F(StreamerTest, RestsAfterTheEndAndLoopsOnlyWhatIsWanted)
 {
-    const auto wanted = Dictionary::make({{"SetMarlinLogCodes", Array::make({1})}});
-    const auto unwanted = Dictionary::make({{"SetMarlinLogCodes", Array::make({2})}});
+    const test::TemporaryFile file;
     const struct {
         const char* name;
-        DictionaryRef command;
+        int wantedCode;
         std::size_t length;
         std::size_t atLeast;
         bool isLooped;
         bool rests;
     } cases[] = {
-        {"one round", wanted, 3, 3, false, true},
-        {"endless", wanted, 3, 30, true, false},
-        {"endless, nothing in it", wanted, 0, 0, true, true},
-        {"endless, nothing wanted in it", unwanted, 3, 0, true, true},
+        {"one round", 1, 3, 3, false, true},
+        {"endless", 1, 3, 30, true, false},
+        {"endless, nothing in it", 1, 0, 0, true, true},
+        {"endless, nothing wanted in it", 2, 3, 0, true, true},
     };
-    for (const auto& [name, command, length, atLeast, isLooped, rests] : cases) {
+    for (const auto& [name, wantedCode, length, atLeast, isLooped, rests] : cases) {
         client->received.clear();
-        stream(command, {2000, std::nullopt}, std::make_unique<Rounds>(length, isLooped));
-        tick(30);
-        EXPECT_EQ(runLoop.timerCount(), rests ? 0U : 1U) << name;
-        ASSERT_GE(client->received.size(), atLeast) << name;
-        for (std::size_t i = 0; i < client->received.size(); ++i)
-            EXPECT_EQ(client->received[i].at(0), i % length + 1) << name;
-        if (rests) {
-            EXPECT_EQ(client->received.size(), atLeast) << name;
+        {
+            PcapWriter capture(file.path);
+            for (std::uint8_t i = 0; i < length; ++i)
+                capture.write(Bytes{1, 12, 0, 1, 0, 0, 0, 0, 0, 0, 0, 0, i}, {});
         }
+        stream(Dictionary::make({{"SetMarlinLogCodes", Array::make({wantedCode})}}), {2000, std::nullopt},
+            std::make_unique<ReplaySource>(file.path, isLooped));
+        tickUntil([] { return false; }, 30);
+        EXPECT_EQ(runLoop.timerCount(), rests ? 0U : 1U) << name;
+        EXPECT_GE(client->received.size(), atLeast) << name;
+        EXPECT_TRUE(!rests || client->received.size() == atLeast) << name;
+        for (std::size_t i = 0; i < client->received.size(); ++i)
+            EXPECT_EQ(client->received[i].at(12), i % length) << name;
     }
 }
 

@@ -40,14 +40,12 @@ TEST(CaptureReader, GivesWhatIsWholeAndSaysWhatIsNot)
         return bytes += end;
     };
     const char* none = "; neither a pcap nor a DLF file";
-    const char* skipped = " bytes that make no record were skipped";
     const struct {
         const char* name;
         Bytes bytes;
         std::string content;
     } cases[] = {
         {"microseconds", two(PcapFile()).bytes(), "654321 us: 5 7"},
-        {"big-endian", two(PcapFile(147, true)).bytes(), "654321 us: 5 7"},
         {"nanoseconds", two(PcapFile(147, false, 0xA1B23C4D)).bytes(), "654 us: 5 7"},
         {"big-endian, nanoseconds", two(PcapFile(147, true, 0xA1B23C4D)).bytes(), "654 us: 5 7"},
         {"of nothing", PcapFile().bytes(), ""},
@@ -56,13 +54,9 @@ TEST(CaptureReader, GivesWhatIsWholeAndSaysWhatIsNot)
         {"partial packet", PcapFile().add(five).add(seven, 6).add(five).bytes(),
             "654321 us: 5 5; 1 packets hold only the beginning of their message and were left out"},
         {"DLF", dlf({}), "1 us: 21 31"},
-        {"DLF, cut", dlf(Bytes{20, 0, 0xC1, 0xB0}), std::string("1 us: 21 31; 4") + skipped},
-        {"DLF, lengths of zero", dlf(Bytes(40)), std::string("1 us: 21 31; 40") + skipped},
-        {"DLF, a length beyond the end", dlf({0xFF, 0x7F, 0xC1, 0xB0}),
-            std::string("1 us: 21 31; 4") + skipped},
+        {"DLF, cut", dlf({20, 0, 0xC1, 0xB0}), "1 us: 21 31; 4 bytes that make no record were skipped"},
         {"another file", Bytes(100, 'x'), none},
         {"zero bytes", {}, none},
-        {"zeros", Bytes(1000), none},
     };
     const TemporaryFile file;
     for (const auto& [name, bytes, content] : cases)

@@ -39,27 +39,23 @@ TEST(RawMessages, AreCutWhereTheirLengthsSay)
 
 TEST(RawMessages, EndWhereALengthLeadsNowhere)
 {
-    const struct {
-        const char* name;
-        Bytes front; // type and length, and a prefix
-    } cases[] = {
-        {"zero", {1, 0, 0}},
-        {"shorter than a header", {1, 11, 0}},
-        {"a byte beyond the end", {1, 30, 0}},
-        {"far beyond the end", {1, 255, 255}},
-        {"shorter than a header behind a prefix", {0x81, 0, 1, 11, 0}},
-        {"beyond the end behind a prefix", {0x81, 0, 1, 28, 0}},
+    const Bytes fronts[] = {
+        {1, 0, 0},           // no length
+        {1, 11, 0},          // shorter than a header
+        {1, 30, 0},          // a byte beyond the end
+        {0x81, 0, 1, 11, 0}, // the same two behind a prefix
+        {0x81, 0, 1, 28, 0},
     };
-    for (const auto& [name, front] : cases) {
-        Bytes wrong = front;
+    for (Bytes wrong : fronts) {
+        SCOPED_TRACE(testing::PrintToString(wrong));
         wrong.resize(30);
         Bytes all = message({1}, 20);
         all += wrong;
         RawMessages raw(all);
-        EXPECT_TRUE(raw.next()) << name;
-        EXPECT_FALSE(raw.next()) << name;
-        EXPECT_FALSE(raw.next()) << name;
-        EXPECT_EQ(raw.rest(), 30U) << name;
+        EXPECT_TRUE(raw.next());
+        EXPECT_FALSE(raw.next());
+        EXPECT_FALSE(raw.next());
+        EXPECT_EQ(raw.rest(), 30U);
     }
 }
 

@@ -25,8 +25,12 @@ public:
         return {status, program.output(), program.errors()};
     }
 
-    std::string file(const char* name, const Bytes& bytes) const { return writeFile(path(name), bytes); }
     std::string path(const char* name) const { return _folder.path(name); }
+    QString name(const char* file) const { return QString::fromStdString(path(file)); }
+    QString write(const char* file, const Bytes& bytes) const
+    {
+        return QString::fromStdString(writeFile(path(file), bytes));
+    }
 
     static std::string contentsOf(const std::string& path)
     {

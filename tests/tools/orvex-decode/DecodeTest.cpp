@@ -29,43 +29,34 @@ public:
                   << "MRL_LTE"
                   << "--resources" << ORVEX_RESOURCES;
         for (std::size_t i = 0; i < captures.size(); ++i)
-            arguments << QString::fromStdString(
-                file(text("%d.pcap", static_cast<int>(i)).c_str(), captures[i]));
+            arguments << write(text("%zu.pcap", i).c_str(), captures[i]);
         return decode(arguments);
     }
 };
 
 TEST_F(DecodeTest, PrintsTheTreeOfWhatTheCapturesHold)
 {
-    const Result result =
-        decodeCaptures({PcapFile().add(antennas(1)).bytes(), PcapFile().add(antennas(3)).bytes()});
-    EXPECT_EQ(result.status, 0);
-    EXPECT_EQ(result.errors, "");
-    EXPECT_THAT(result.output, HasSubstr("Orvex\n  Serving Cell Info\n"));
-    EXPECT_THAT(result.output, HasSubstr("    Num Tx Antennas: 3\n"));
-}
+    const std::vector<Bytes> captures = {
+        PcapFile().add(antennas(1)).bytes(), PcapFile().add(antennas(4)).bytes()};
+    const Result tree = decodeCaptures(captures);
+    EXPECT_EQ(tree.status, 0);
+    EXPECT_EQ(tree.errors, "");
+    EXPECT_THAT(tree.output, HasSubstr("Orvex\n  Serving Cell Info\n"));
+    EXPECT_THAT(tree.output, HasSubstr("    Num Tx Antennas: 4\n"));
 
-TEST_F(DecodeTest, PrintsTheTreeAsJSON)
-{
-    const Result result = decodeCaptures({PcapFile().add(antennas(4)).bytes()}, {"--format", "json"});
-    const auto root = Json::parse(result.output);
+    const auto root = Json::parse(decodeCaptures(captures, {"--format", "json"}).output);
     EXPECT_EQ(root["name"], "Orvex");
     EXPECT_EQ(root["path"], "/");
     ASSERT_EQ(root["children"].size(), 11U);
-    const auto& serving = root["children"][0];
-    EXPECT_EQ(serving["path"], "/Serving Cell Info");
     const char* expected =
         R"({"name":"Num Tx Antennas","path":"/Serving Cell Info/Num Tx Antennas","value":"4"})";
-    EXPECT_EQ(serving["children"].back().dump(), expected);
+    EXPECT_EQ(root["children"][0]["children"].back().dump(), expected);
     EXPECT_EQ(root["children"][3]["children"], Json::array());
-}
 
-TEST_F(DecodeTest, SessionInWhichNothingArrivedHasNoDisplayYet)
-{
-    EXPECT_EQ(decodeCaptures({PcapFile().bytes()}).output, "Orvex: (unknown)\n");
-    const Result json = decodeCaptures({PcapFile().bytes()}, {"--format", "json"});
-    EXPECT_EQ(json.status, 0);
-    EXPECT_EQ(Json::parse(json.output), (Json{{"name", "Orvex"}, {"path", "/"}, {"value", "(unknown)"}}));
+    const std::vector<Bytes> nothing = {PcapFile().bytes()}; // so there is no display yet
+    EXPECT_EQ(decodeCaptures(nothing).output, "Orvex: (unknown)\n");
+    EXPECT_EQ(Json::parse(decodeCaptures(nothing, {"--format", "json"}).output),
+        (Json{{"name", "Orvex"}, {"path", "/"}, {"value", "(unknown)"}}));
 }
 
 TEST_F(DecodeTest, SaysInOneLineWhatCouldNotBeRead)
@@ -77,7 +68,6 @@ TEST_F(DecodeTest, SaysInOneLineWhatCouldNotBeRead)
         bool isShown;
         const char* why;
     } cases[] = {
-        {"no capture", Bytes(100, 'x'), 1, false, "0.pcap: neither a pcap nor a DLF file\n"},
         {"cut in the first packet", PcapFile().add(antennas(4)).cut(1).bytes(), 1, false,
             "0.pcap: truncated"},
         {"cut later", PcapFile().add(antennas(4)).add(antennas(9)).cut(1).bytes(), 1, true,
@@ -100,7 +90,7 @@ TEST_F(DecodeTest, SaysInOneLineWhatCouldNotBeRead)
 TEST_F(DecodeTest, WritesDocumentAndLogIntoFiles)
 {
     const Result result = decodeCaptures({PcapFile().add(antennas(4)).add(Bytes(13, 2)).bytes()},
-        {"--output", QString::fromStdString(path("tree")), "--log", QString::fromStdString(path("log"))});
+        {"--output", name("tree"), "--log", name("log")});
     EXPECT_EQ(result.status, 0) << result.errors;
     EXPECT_EQ(result.output, "") << "lines of the console stay out of the document";
     EXPECT_THAT(contentsOf(path("tree")), HasSubstr("Num Tx Antennas: 4\n"));
@@ -114,26 +104,22 @@ TEST_F(DecodeTest, WritesDocumentAndLogIntoFiles)
 
 TEST_F(DecodeTest, AsksForTheDisplayAsOftenAsItIsTold)
 {
+    const Bytes five = PcapFile().add({1}).add({1}).add({1}).add({1}).add({1}).bytes();
     // Without a template every request says so once, and every message does.
-    const auto failures = [this](const QStringList& arguments) {
-        QStringList all = arguments;
-        all << "--log" << QString::fromStdString(path("log")) << "--technology"
-            << "MRL_LTE"
-            << "--resources" << QString::fromStdString(path(""))
-            << QString::fromStdString(
-                   file("five.pcap", PcapFile().add({1}).add({1}).add({1}).add({1}).add({1}).bytes()));
-        EXPECT_EQ(decode(all).output, "Orvex: (unknown)\n");
+    const auto failures = [&](const char* messages) {
+        decode({"--log", name("log"), "--technology", "MRL_LTE", "--resources", name(""), "--refresh-every",
+            messages, write("five.pcap", five)});
         return QString::fromStdString(contentsOf(path("log"))).count("Cannot load template");
     };
-    EXPECT_EQ(failures({}), 5 + 1);
-    EXPECT_EQ(failures({"--refresh-every", "2"}), 5 + 2 + 1);
-    EXPECT_EQ(failures({"--refresh-every", "1"}), 5U + 5 + 1);
+    EXPECT_EQ(failures("6"), 5 + 1);
+    EXPECT_EQ(failures("2"), 5 + 2 + 1);
+    EXPECT_EQ(failures("1"), 5 + 5 + 1);
 }
 
 TEST_F(DecodeTest, FatalMessageEndsItWithTheReason)
 {
-    const Result result = decodeCaptures(
-        {PcapFile().add(packet(0xFF0000, {'x'})).bytes()}, {"--log", QString::fromStdString(path("log"))});
+    const Result result =
+        decodeCaptures({PcapFile().add(packet(0xFF0000, {'x'})).bytes()}, {"--log", name("log")});
     EXPECT_EQ(result.status, -1) << "ended by its exception";
     EXPECT_THAT(contentsOf(path("log")), HasSubstr("<3>SIM File dictionary data could not be constructed\n"));
     EXPECT_THAT(contentsOf(path("log")), HasSubstr("UnknownDataException"));
@@ -141,19 +127,25 @@ TEST_F(DecodeTest, FatalMessageEndsItWithTheReason)
 
 TEST_F(DecodeTest, WrongUsageIsAnsweredWithTheRightOne)
 {
-    const std::vector<QStringList> cases = {{}, {"x.pcap"}, {"--technology", "MRL_LTE"},
-        {"--technology", "GSM", "x.pcap"}, {"--technology", "MRL_LTE", "--format", "xml", "x.pcap"},
-        {"--technology", "MRL_LTE", "--refresh-every", "0", "x.pcap"}, {"--nonsense"},
-        {"--technology", "MRL_LTE", "x.orvex", "x.pcap"}, {"--snapshot", "y.orvex", "x.orvex"},
-        {"--technology", "MRL_LTE", "--dlf", "y", "x.pcap"}, {"--dlf", "y", "x.orvex", "z.orvex"},
-        {"--technology", "MRL_LTE", "--description", "y", "x.pcap"},
-        {"--technology", "MRL_LTE", "--jobs", "0", "x.pcap"},
-        {"--technology", "MRL_LTE", "--jobs", "2", "x.orvex"},
-        {"--technology", "MRL_LTE", "--jobs", "2", "--snapshot", "y", "x.pcap"},
-        {"--technology", "GSM", "x.orvex"}};
-    for (const QStringList& arguments : cases) {
-        const Result result = decode(arguments);
-        EXPECT_EQ(result.status, 2) << arguments.join(' ').toStdString();
+    const char* const cases[] = {
+        "",
+        "x.pcap",
+        "--technology GSM x.pcap",
+        "--technology MRL_LTE --format xml x.pcap",
+        "--technology MRL_LTE --refresh-every 0 x.pcap",
+        "--nonsense",
+        "--technology MRL_LTE x.orvex x.pcap",
+        "--snapshot y.orvex x.orvex",
+        "--technology MRL_LTE --dlf y x.pcap",
+        "--dlf y x.orvex z.orvex",
+        "--technology MRL_LTE --description y x.pcap",
+        "--technology MRL_LTE --jobs 0 x.pcap",
+        "--technology MRL_LTE --jobs 2 x.orvex",
+        "--technology MRL_LTE --jobs 2 --snapshot y x.pcap",
+    };
+    for (const QString arguments : cases) {
+        const Result result = decode(arguments.split(' ', Qt::SkipEmptyParts));
+        EXPECT_EQ(result.status, 2) << arguments.toStdString();
         EXPECT_EQ(result.output, "");
         EXPECT_THAT(result.errors, HasSubstr("Usage: orvex-decode"));
     }

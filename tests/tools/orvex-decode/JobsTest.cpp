@@ -27,8 +27,7 @@ protected:
             const auto scenario = korat::findScenario("MRL_LTE", "")->make({messages, {}});
             for (std::size_t i = 0; i < messages; ++i)
                 capture.add(scenario->next().message.bytes);
-            captures << QString::fromStdString(
-                file((std::to_string(messages) + ".pcap").c_str(), capture.bytes()));
+            captures << write(std::to_string(messages).c_str(), capture.bytes());
         }
     }
 
@@ -37,12 +36,10 @@ protected:
         return decode(
             QStringList{"--technology", "MRL_LTE", "--resources", ORVEX_RESOURCES} + options + which);
     }
-    static QString withoutAddresses(const std::string& log)
+    QString logWithoutAddresses() const
     {
-        static const QRegularExpression kAddress("0x[0-9a-f]+");
-        return QString::fromStdString(log).remove(kAddress);
+        return QString::fromStdString(contentsOf(path("log"))).remove(QRegularExpression("0x[0-9a-f]+"));
     }
-    QStringList withLog(const char* name) const { return {"--log", QString::fromStdString(path(name))}; }
 
     QStringList captures;
 };
@@ -50,20 +47,19 @@ protected:
 TEST_F(JobsTest, WritesWhatEachCaptureAloneGives)
 {
     std::string trees;
-    std::string log;
+    QString log;
     Json displays = Json::array();
     for (const QString& capture : captures) {
-        trees += decodeAll({capture}, withLog("one.log")).output;
-        log += contentsOf(path("one.log"));
+        trees += decodeAll({capture}, {"--log", name("log")}).output;
+        log += logWithoutAddresses();
         displays.push_back({{"capture", capture.toStdString()},
             {"display", Json::parse(decodeAll({capture}, {"--format", "json"}).output)}});
     }
     for (const char* jobs : {"1", "3", "50"}) {
-        const Result result = decodeAll(captures, QStringList{"--jobs", jobs} + withLog("all.log"));
+        const Result result = decodeAll(captures, {"--jobs", jobs, "--log", name("log")});
         EXPECT_EQ(result.status, 0) << result.errors;
-        EXPECT_EQ(result.errors, "");
         EXPECT_EQ(result.output, trees) << jobs;
-        EXPECT_TRUE(withoutAddresses(contentsOf(path("all.log"))) == withoutAddresses(log)) << jobs;
+        EXPECT_TRUE(logWithoutAddresses() == log) << jobs;
         const Result json = decodeAll(captures, {"--jobs", jobs, "--format", "json"});
         EXPECT_EQ(Json::parse(json.output), (Json{{"captures", displays}})) << jobs;
     }
@@ -71,26 +67,20 @@ TEST_F(JobsTest, WritesWhatEachCaptureAloneGives)
 
 TEST_F(JobsTest, OneThatFailsLeavesTheOthersAlone)
 {
-    const std::string missing = path("missing.pcap");
-    const std::string fatal =
-        file("fatal.pcap", PcapFile().add(packet(0xFF0000, {'x'})).bytes()); // ends its process by design
-    const QStringList whole = {captures[1], captures[2]};
-    const QStringList all = {
-        captures[1], QString::fromStdString(missing), QString::fromStdString(fatal), captures[2]};
-    const Result expected = decodeAll(whole, {"--jobs", "2"});
+    const QString missing = name("missing.pcap");
+    const QString fatal =
+        write("fatal.pcap", PcapFile().add(packet(0xFF0000, {'x'})).bytes()); // ends its process by design
+    const Result expected = decodeAll({captures[1], captures[2]}, {"--jobs", "2"});
     ASSERT_EQ(expected.status, 0);
-
-    const Result result = decodeAll(all, QStringList{"--jobs", "2"} + withLog("log"));
+    const Result result =
+        decodeAll({captures[1], missing, fatal, captures[2]}, {"--jobs", "2", "--log", name("log")});
     EXPECT_EQ(result.status, 1);
     EXPECT_EQ(result.output, expected.output);
     EXPECT_EQ(result.errors,
-        "orvex-decode: " + missing + ": No such file or directory\n" + "orvex-decode: " + fatal
-            + ": decoding ended by signal 6 (Aborted)\n");
+        "orvex-decode: " + path("missing.pcap") + ": No such file or directory\norvex-decode: "
+            + path("fatal.pcap") + ": decoding ended by signal 6 (Aborted)\n");
     EXPECT_THAT(contentsOf(path("log")), HasSubstr("UnknownDataException"));
-
-    const Result none = decodeAll({QString::fromStdString(missing)}, {"--jobs", "2", "--format", "json"});
-    EXPECT_EQ(none.status, 1);
-    EXPECT_EQ(none.output, "");
+    EXPECT_EQ(decodeAll({missing}, {"--jobs", "2", "--format", "json"}).output, "");
 }
 
 } // namespace
