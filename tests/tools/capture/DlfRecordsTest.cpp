@@ -15,16 +15,7 @@ using namespace std::chrono_literals;
 
 constexpr int kNoType = -1;
 
-struct Found {
-    int logType;
-    Bytes bytes;
-
-    bool operator==(const Found&) const = default;
-    friend void PrintTo(const Found& found, std::ostream* out)
-    {
-        *out << "type " << found.logType << ", " << found.bytes.size() << " bytes";
-    }
-};
+using Found = std::pair<int, Bytes>; // the log type and the record
 
 // Without spare capacity, in which reads beyond the end would go unseen.
 Bytes joined(const std::vector<Bytes>& parts)
