@@ -2,7 +2,6 @@
 
 #include "Array.h"
 #include "Console.h"
-#include "Dictionary.h"
 #include "FileResources.h"
 #include "FixedClock.h"
 #include "LogGenerator.h"
@@ -19,13 +18,6 @@ public:
         installConsole([](std::string_view) {}); // some sections write a line for every packet
         _generator = LogGenerator::generatorFromTechnology(technology, {_resources, _clock, std::nullopt});
     }
-    ~Decoding()
-    {
-        _generator.reset();
-        installConsole({});
-    }
-    Decoding(const Decoding&) = delete;
-    Decoding& operator=(const Decoding&) = delete;
 
     void feed(const Bytes& message) { _generator->updateState(*_state, message); }
 

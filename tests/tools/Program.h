@@ -49,10 +49,6 @@ class Program {
 public:
     Program(const ProgramFolder& folder, const char* path, const QStringList& arguments)
     {
-        QObject::connect(&_process, &QProcess::readyReadStandardOutput, &_process,
-            [this] { _output += _process.readAllStandardOutput(); });
-        QObject::connect(&_process, &QProcess::readyReadStandardError, &_process,
-            [this] { _errors += _process.readAllStandardError(); });
         _process.setProcessEnvironment(folder.environment());
         _process.start(QString::fromLocal8Bit(path), arguments);
         _process.waitForStarted();
@@ -61,16 +57,16 @@ public:
     Program(const Program&) = delete;
     Program& operator=(const Program&) = delete;
 
-    std::string output() const { return _output.toStdString(); }
+    std::string output() const { return (_output += _process.readAllStandardOutput()).toStdString(); }
     // Standard error: log lines, for the monitor.
-    std::string errors() const { return _errors.toStdString(); }
+    std::string errors() const { return (_errors += _process.readAllStandardError()).toStdString(); }
     bool isRunning() const { return _process.state() == QProcess::Running; }
     qint64 id() const { return _process.processId(); }
 
     // Waits until the text was written.
     bool waitForError(const char* text)
     {
-        return waitUntil([&] { return _errors.contains(text); }, kLongest);
+        return waitUntil([&] { return errors().find(text) != std::string::npos; }, kLongest);
     }
     std::jthread freezeFor(std::chrono::milliseconds time) { return test::freezeFor(id(), time); }
 
@@ -89,17 +85,15 @@ public:
     {
         if (!waitUntil([this] { return _process.state() == QProcess::NotRunning; }, kLongest))
             return -1;
-        _output += _process.readAllStandardOutput();
-        _errors += _process.readAllStandardError();
         return _process.exitStatus() == QProcess::NormalExit ? _process.exitCode() : -1;
     }
 
 private:
     static constexpr std::chrono::milliseconds kLongest{30'000};
 
-    QProcess _process;
-    QByteArray _output;
-    QByteArray _errors;
+    mutable QProcess _process; // is read when somebody asks
+    mutable QByteArray _output;
+    mutable QByteArray _errors;
 };
 
 } // namespace orvex::test

@@ -116,15 +116,6 @@ TEST_F(DecodeTest, AsksForTheDisplayAsOftenAsItIsTold)
     EXPECT_EQ(failures("1"), 5 + 5 + 1);
 }
 
-TEST_F(DecodeTest, FatalMessageEndsItWithTheReason)
-{
-    const Result result =
-        decodeCaptures({PcapFile().add(packet(0xFF0000, {'x'})).bytes()}, {"--log", name("log")});
-    EXPECT_EQ(result.status, -1) << "ended by its exception";
-    EXPECT_THAT(contentsOf(path("log")), HasSubstr("<3>SIM File dictionary data could not be constructed\n"));
-    EXPECT_THAT(contentsOf(path("log")), HasSubstr("UnknownDataException"));
-}
-
 TEST_F(DecodeTest, WrongUsageIsAnsweredWithTheRightOne)
 {
     const char* const cases[] = {
