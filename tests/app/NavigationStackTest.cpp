@@ -42,6 +42,7 @@ TEST_F(NavigationStackTest, TheBackButtonBearsTheTitleOfTheScreenBelow)
     for (const int nowhere : {5, 4, -1})
         stack.popTo(nowhere, true);
     EXPECT_EQ(stack.navigationBar().title(), "D");
+    EXPECT_TRUE(stack.topScreen().isVisible());
     stack.popTo(2, true);
     EXPECT_EQ(stack.count(), 3);
     EXPECT_EQ(stack.navigationBar().title(), "B");

@@ -84,6 +84,21 @@ TEST(DlfRecords, AreFoundInEachForm)
     }
 }
 
+TEST(DlfRecords, CutFileGivesWhatIsWhole)
+{
+    const Bytes whole = joined({versionReport(), dlfRecord(20, 0), {1}, dlfRecord(21, 1), {0x81, 0x22, 1},
+        dlfRecord(22, 2), {1}, dlfRecord(23, 3), dlfRecord(24, 4), {0x81, 0x22, 1}, dlfRecord(25, 5)});
+    std::size_t skipped = 0;
+    const auto all = recordsOf(whole, skipped);
+    ASSERT_EQ(all.size(), 7U);
+    for (std::size_t length = whole.size(); length-- > 0;) {
+        const auto some =
+            recordsOf(Bytes(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(length)), skipped);
+        ASSERT_LT(some.size(), all.size()) << length;
+        EXPECT_TRUE(std::ranges::equal(some, std::span(all).first(some.size()))) << length;
+    }
+}
+
 TEST(DlfRecords, AreFoundAgainBehindALengthThatLies)
 {
     for (const std::uint8_t lie : Bytes{0, 1, 11, 255}) { // the last one leads beyond the end

@@ -48,5 +48,12 @@ TEST(PcapWriter, MessageLongerThanReadersTakeSpoilsNothing)
     EXPECT_THAT(reader->omissions(), testing::HasSubstr("1 packets"));
 }
 
+TEST(PcapWriter, SaysWhatCannotBeWritten)
+{
+    PcapWriter full("/dev/full");
+    full.write(Bytes(10'000), 1s); // more than is kept back in memory
+    EXPECT_EQ(full.error(), "/dev/full: No space left on device");
+}
+
 } // namespace
 } // namespace orvex
