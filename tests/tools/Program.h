@@ -64,11 +64,11 @@ public:
     qint64 id() const { return _process.processId(); }
 
     // Waits until the text was written.
-    bool waitForError(const char* text)
+    bool waitForError(const char* text) const
     {
         return waitUntil([&] { return errors().find(text) != std::string::npos; }, kLongest);
     }
-    std::jthread freezeFor(std::chrono::milliseconds time) { return test::freezeFor(id(), time); }
+    std::jthread freezeFor(std::chrono::milliseconds time) const { return test::freezeFor(id(), time); }
 
     void kill()
     {
