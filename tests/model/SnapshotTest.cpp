@@ -63,7 +63,7 @@ TEST_F(SnapshotTest, SaysWhyAFileIsNone)
     };
     const std::string path = directory + "/file.orvex";
     for (const auto& [content, reason] : cases) {
-        std::ofstream(path) << "<plist version=\"1.0\">" << content << "</plist>";
+        std::ofstream(path) << R"(<plist version="1.0">)" << content << "</plist>";
         const auto [read, error] = readSnapshot(path);
         EXPECT_FALSE(read) << content;
         EXPECT_EQ(error, path + ": not a snapshot: " + reason);

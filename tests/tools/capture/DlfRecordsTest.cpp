@@ -34,8 +34,8 @@ std::vector<Found> recordsOf(const Bytes& dlf, std::size_t& skipped)
     DlfRecords records(dlf);
     std::vector<Found> result;
     while (const auto record = records.next())
-        result.push_back({record->logType ? *record->logType : kNoType,
-            Bytes(record->bytes.begin(), record->bytes.end())});
+        result.emplace_back(
+            record->logType ? *record->logType : kNoType, Bytes(record->bytes.begin(), record->bytes.end()));
     skipped = records.skippedBytes();
     return result;
 }
