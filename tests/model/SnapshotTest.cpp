@@ -5,8 +5,10 @@
 
 #include <gtest/gtest.h>
 
+#include <csignal>
 #include <filesystem>
 #include <fstream>
+#include <sys/wait.h>
 #include <unistd.h>
 
 namespace orvex::test {
@@ -80,6 +82,33 @@ TEST_F(SnapshotTest, TellsWhenItCouldNotBeWritten)
     EXPECT_FALSE(std::filesystem::exists(directory + "/null.orvex"));
     EXPECT_FALSE(writeSnapshot(someSnapshot(), directory + "/gone/x.orvex"));
     EXPECT_FALSE(writeSnapshot(someSnapshot(), "/dev/full"));
+}
+
+TEST_F(SnapshotTest, AWriterKilledInTheMiddleLeavesAFileThatTheReaderCopesWith)
+{
+    Snapshot large = someSnapshot();
+    for (int i = 0; i < 20; ++i)
+        large.data->append(Dictionary::make({{"DLF", std::make_shared<Bytes>(50'000)}}));
+    const std::string path = directory + "/killed.orvex";
+    for (int i = 0; i < 20; ++i) {
+        const pid_t child = ::fork();
+        if (child == 0) {
+            for (;;)
+                writeSnapshot(large, path);
+        }
+        ::usleep(static_cast<useconds_t>(5'000 + i * 1'700));
+        ::kill(child, SIGKILL);
+        ::waitpid(child, nullptr, 0);
+        const auto [read, error] = readSnapshot(path);
+        if (read) {
+            EXPECT_TRUE(*read->data == *large.data);
+        } else {
+            EXPECT_TRUE(error.starts_with(path + ": ")) << error;
+            EXPECT_EQ(error.find('\n'), std::string::npos);
+        }
+    }
+    EXPECT_TRUE(writeSnapshot(large, path)) << "the next one takes its place";
+    EXPECT_TRUE(readSnapshot(path).snapshot);
 }
 
 TEST(NumberedRows, NoRowHidesAnother)
