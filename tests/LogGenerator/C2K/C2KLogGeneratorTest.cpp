@@ -29,14 +29,12 @@ TEST(C2KDecoders, RefuseShortPackets)
 {
     C2KFixture fixture;
     for (const auto& [code, minimumLength, complaint] : kLengths) {
-        for (const std::size_t length : {kPacketHeaderLength, minimumLength - 1}) {
-            fixture.clear();
-            fixture.feed(packet(code, Bytes(length - kPacketHeaderLength)));
-            EXPECT_TRUE(fixture.display->isEmpty());
-            EXPECT_EQ(fixture.linesNow(),
-                text("<3>Log code 0x%x is %zu bytes long but %s bytes.", static_cast<unsigned>(code), length,
-                    complaint));
-        }
+        fixture.clear();
+        fixture.feed(packet(code, Bytes(minimumLength - 1 - kPacketHeaderLength)));
+        EXPECT_TRUE(fixture.display->isEmpty());
+        EXPECT_EQ(fixture.linesNow(),
+            text("<3>Log code 0x%x is %zu bytes long but %s bytes.", static_cast<unsigned>(code),
+                minimumLength - 1, complaint));
         fixture.feed(packet(code, Bytes(minimumLength - kPacketHeaderLength)));
         EXPECT_EQ(fixture.linesNow().find("bytes long"), std::string::npos) << minimumLength;
     }
@@ -63,8 +61,8 @@ public:
     // The display's section of that name.
     std::string identityShown() const
     {
-        const auto rows = (*state["Display"].dictionary())["Identity"].dictionary();
-        return rows ? shown(*rows) : "";
+        const auto sections = state["Display"].dictionary();
+        return sections && sections->contains("Identity") ? shown(*(*sections)["Identity"].dictionary()) : "";
     }
 };
 
@@ -97,22 +95,14 @@ TEST_F(C2KLogGeneratorTest, ShowsAValueInEveryRowThatNamesItsKey)
 
 TEST(Publisher, EndsAtADamagedEntry)
 {
-    const auto first = Dictionary::make();
-    const auto second = Dictionary::make();
+    const auto row = Dictionary::make();
+    const Value whole = Dictionary::make({{"key", "row"}, {"dict", row}});
     for (const Value& damaged : {Value("x"), Value(Dictionary::make({{"key", "row"}})),
-             Value(Dictionary::make({{"key", 1}, {"dict", second}}))}) {
-        const auto entry = [](const DictionaryRef& dict) {
-            return Dictionary::make({{"key", "row"}, {"dict", dict}});
-        };
-        const auto lookup =
-            Dictionary::make({{"k", Array::make({entry(first), damaged, entry(second)})}, {"text", "x"}});
-        const Publisher publisher(lookup);
-        publisher.publish("k", "value");
-        publisher.publish("text", "value");
-        publisher.publish("absent", "value");
-        EXPECT_EQ(*first, Dictionary({{"row", "value"}}));
-        EXPECT_TRUE(second->isEmpty());
+             Value(Dictionary::make({{"key", 1}, {"dict", row}}))}) {
+        Publisher(Dictionary::make({{"k", Array::make({damaged, whole})}})).publish("k", "value");
+        EXPECT_TRUE(row->isEmpty());
     }
+    Publisher(Dictionary::make({{"k", "x"}})).publish("k", "value");
     Publisher(nullptr).publish("k", "value");
 }
 
@@ -132,28 +122,19 @@ TEST_F(C2KLogGeneratorTest, FramesAndKeepsWhatReachesADecoder)
         {"FF" + body, untouched, "", {"<3>Invalid log type: ff. Dropping."}},
         {"01 00 00 84 11 00*200", untouched, ""}, // another code
         {"01 00 00 83 11 00*7", untouched, ""},
-        {"01 00 00 83 11 00*8", untouched, "01 00 00 83 11 00*8",
-            {"<3>Log code 0x1183 is 13 bytes long but should be 50 bytes."}},
         {"81 00 01 00 00 83 11 00*6", untouched, "01 00 00 83 11 00*6",
             {"<3>Log code 0x1183 is 11 bytes long but should be 50 bytes."}},
     };
     for (const auto& [message, shownIdentity, kept, lines] : cases) {
-        const Bytes bytes = PacketText(message).bytes();
         const auto generator = makeGenerator();
         state.remove("Display");
         generator->generateLogUsingState(state);
         RecordingLog log;
-        generator->updateState(state, bytes);
+        generator->updateState(state, PacketText(message).bytes());
         EXPECT_EQ(log.take(), lines) << message;
         EXPECT_EQ(identityShown(), shownIdentity) << message;
-        generator->updateState(state, bytes);
         generator->generateLogUsingState(state);
-        Bytes twice = PacketText(kept).bytes();
-        const Bytes once = twice;
-        twice.insert(twice.end(), once.begin(), once.end());
-        EXPECT_EQ(keptMessages(), twice) << message;
-        const auto history = state["History"].array();
-        EXPECT_EQ(*(*(*history)[history->size() - 1].dictionary())["DisplayState"].data(), twice) << message;
+        EXPECT_EQ(keptMessages(), PacketText(kept).bytes()) << message;
         generator->generateLogUsingState(state);
         EXPECT_TRUE(keptMessages().empty()) << message;
     }
@@ -169,9 +150,7 @@ TEST_F(C2KLogGeneratorTest, MissingTemplateIsTriedAgainAtEveryCall)
     EXPECT_TRUE(state.isEmpty());
     EXPECT_TRUE(generator->generateLogUsingState(state).isNull());
     EXPECT_EQ(log.take(), Lines(2, "<3>Cannot load C2K template for display"));
-    EXPECT_EQ(*state["DisplayState"].data(), identity(7));
-    Dictionary laidOut{{"Template", skeleton}};
-    EXPECT_NE(C2KLogGenerator::getDisplayFromState(laidOut, resources), nullptr) << "that of the state";
+    EXPECT_EQ(keptMessages(), identity(7));
     resources.templates["C2KTemplate"] = skeleton;
     generator->updateState(state, identity(8));
     EXPECT_EQ(identityShown(), "SID=258, Revision=8");
@@ -179,24 +158,23 @@ TEST_F(C2KLogGeneratorTest, MissingTemplateIsTriedAgainAtEveryCall)
 
 TEST_F(C2KLogGeneratorTest, TechnologiesTakeTurnsOnOneState)
 {
+    const std::string list = "<plist version=\"1.0\"><dict><key>A</key><string>x</string></dict></plist>";
     // Each follows each, and itself with the third in between.
-    for (const char turn : std::string_view("CICOIOCOICI")) {
+    for (const char turn : std::string_view("CCICOIOCOICI")) {
         SCOPED_TRACE(turn);
-        const std::string list = "<plist version=\"1.0\"><dict><key>A</key><string>x</string></dict></plist>";
+        const auto before = state["Display"];
         if (turn == 'C') {
+            const bool isNext = identityShown().starts_with("SID");
             makeGenerator()->updateState(state, identity(7));
             EXPECT_EQ(identityShown(), "SID=258, Revision=7");
-            const auto shared = state["Display"].dictionary();
-            makeGenerator()->updateState(state, identity(8));
-            EXPECT_EQ(identityShown(), "SID=258, Revision=8");
-            EXPECT_EQ(state["Display"].dictionary(), shared);
+            EXPECT_EQ(before.dictionary() == state["Display"].dictionary(), isNext) << "shared";
         } else if (turn == 'O') {
             MRLLogGenerator2(environment(), "Other", std::make_unique<ClassIndex>())
                 .updateState(state, identity(7));
-            EXPECT_EQ(state["Display"], resources.templates["Other"]);
+            EXPECT_EQ(display(), "Section=text");
         } else {
             GSMLogGenerator(environment()).updateState(state, Bytes(list.begin(), list.end()));
-            EXPECT_EQ(state["Display"], Value(Dictionary::make({{"A", "x"}})));
+            EXPECT_EQ(display(), "A=x");
         }
     }
 }

