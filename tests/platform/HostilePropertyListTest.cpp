@@ -20,20 +20,14 @@ std::string repeated(std::string_view text, std::size_t count)
     return result;
 }
 
-std::string nestedXML(std::size_t depth)
-{
-    return xmlList(repeated("<array>", depth) + repeated("</array>", depth));
-}
-
 TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
 {
     const struct {
         std::string xml;
         const char* reason;
     } cases[] = {
-        {nestedXML(257), "nested deeper than 256"},
-        {nestedXML(1'000'000), "nested deeper than 256"},
-        {xmlList(repeated("<dict><key>k</key>", 300)), "nested deeper"},
+        {xmlList(repeated("<array>", 257)), "nested deeper than 256"},
+        {xmlList(repeated("<dict><key>k</key>", 257)), "nested deeper than 256"},
         {xmlList("<array>" + repeated("<true/>", 2'000'000) + "</array>"), "more than 2000000 values"},
         {std::string((std::size_t{64} << 20) + 1, ' '), "longer than"},
         {"", "no data"},
@@ -50,11 +44,9 @@ TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
         {xmlList("<integer>18446744073709551616</integer>"), "the content of <integer>"},
         {xmlList("<integer>-9223372036854775809</integer>"), "the content of <integer>"},
         {xmlList("<real>1,5</real>"), "the content of <real>"},
-        {xmlList("<date>today</date>"), "the content of <date>"},
         {xmlList("<date>2026-02-30T00:00:00Z</date>"), "the content of <date>"},
         {xmlList("<data>A*</data>"), "the content of <data>"},
         {xmlList("<true>no</true>"), "the content of <true>"},
-        {xmlList("<dict><key>a&#0;b</key><true/></dict>"), "malformed"},
         {xmlList("<dict><key>a&#x00;</key><true/></dict>"), "malformed"},
         {xmlList("<string>&bomb;</string>"), "malformed"},
         {xmlList("<string>&#xD800;</string>"), "malformed"},
@@ -72,14 +64,13 @@ TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
         EXPECT_FALSE(result.value) << test.xml.substr(0, 200);
         EXPECT_THAT(result.error, HasSubstr(test.reason)) << test.xml.substr(0, 200);
     }
-    EXPECT_TRUE(propertyListFromData(bytesOf(nestedXML(256))).value);
 }
 
 TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
 {
     std::vector<Bytes> laughs;
     for (std::uint8_t next = 1; next < 40; ++next)
-        laughs.push_back({0xA4, next, next, next, next});
+        laughs.push_back({0xA2, next, next});
     laughs.push_back({0x09});
     // 255 x 255 references to one text of 4096 bytes.
     std::vector<Bytes> shared{{0xAF, 0x10, 0xFF}, {0xAF, 0x10, 0xFF}, {0x5F, 0x11, 0x10, 0x00}};
@@ -92,10 +83,8 @@ TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
         Bytes list;
         const char* reason;
     } cases[] = {
-        {"header alone", bytesOf("bplist00"), "shorter"},
         {"another version", bytesOf("bplist15" + std::string(40, '\0')), "unknown version"},
         {"cycle", binaryList({{0xA1, 0}}), "nested deeper"},
-        {"dictionary cycle", binaryList({{0xD1, 1, 0}, {0x51, 'a'}}), "nested deeper"},
         {"shared arrays multiply", binaryList(laughs), "more than 2000000 values"},
         {"shared text multiplies", binaryList(shared), "shared texts"},
         {"root not there", binaryList({}), "not there"},
@@ -110,9 +99,7 @@ TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
         {"key is a number", binaryList({{0xD1, 1, 1}, {0x10, 1}}), "a key that is no text"},
         {"zero in a key", binaryList({{0xD1, 1, 1}, {0x52, 'a', 0}}), "zero character"},
         {"zero in a long key", binaryList({{0xD1, 1, 1}, {0x62, 0, 'a', 0, 0}}), "zero character"},
-        {"null", binaryList({{0xA1, 1}, {0x00}}), "malformed object"},
         {"unknown kind", binaryList({{0x70}}), "unknown kind"},
-        {"integer cut off", binaryList({{0x13, 0, 0}}), "outside of the list"},
         {"integer of 128 bits", binaryList({{0x14, 1, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}}),
             "malformed"},
     };
@@ -125,43 +112,27 @@ TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
 
 TEST(HostilePropertyList, LimitsAreExact)
 {
-    const Bytes lists[] = {bytesOf(nestedXML(3)), binaryList({{0xA1, 1}, {0xA1, 2}, {0xA0}})};
-    for (const Bytes& list : lists) {
-        PropertyListLimits limits;
-        limits.maximumDepth = limits.maximumNodes = 3;
-        EXPECT_EQ(propertyListFromData(list, limits).error, "");
-        limits.maximumDepth = 2;
-        EXPECT_THAT(propertyListFromData(list, limits).error, HasSubstr("nested deeper than 2"));
-        limits.maximumDepth = 3;
-        limits.maximumNodes = 2;
-        EXPECT_THAT(propertyListFromData(list, limits).error, HasSubstr("more than 2 values"));
+    for (const Bytes& list : {bytesOf(xmlList("<array><array><array/></array></array>")),
+             binaryList({{0xA1, 1}, {0xA1, 2}, {0xA0}})}) {
+        EXPECT_EQ(propertyListFromData(list, {.maximumDepth = 3, .maximumNodes = 3}).error, "");
+        EXPECT_THAT(propertyListFromData(list, {.maximumDepth = 2}).error, HasSubstr("nested deeper than 2"));
+        EXPECT_THAT(propertyListFromData(list, {.maximumNodes = 2}).error, HasSubstr("more than 2 values"));
     }
-}
-
-// A list with every kind of value, in both forms.
-std::vector<Bytes> goodLists()
-{
-    const std::string xml =
-        "<?xml version=\"1.0\"?><!DOCTYPE plist PUBLIC \"-//A\" \"b\"><plist version=\"1.0\">"
-        "<dict><key>a &amp;</key><array><integer>-5</integer><real>1.5</real><true/>"
-        "<data>AAEC</data></array><key>b</key><date>2026-11-16T05:54:31Z</date><!-- c -->"
-        "<key>d</key><string>x<![CDATA[<y>]]>z</string><key>e</key><dict/></dict></plist>";
-    return {bytesOf(xml),
-        binaryList({{0xD3, 1, 2, 3, 4, 5, 6}, {0x51, 'a'}, {0x63, 0, 'b', 0xD8, 0x3D, 0xDE, 0x00},
-            {0x51, 'c'}, {0xA3, 7, 8, 9}, {0x09}, {0x5F, 0x10, 2, 'h', 'i'},
-            {0x13, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFE}, {0x33, 0x41, 0, 0, 0, 0, 0, 0, 0},
-            {0x43, 1, 2, 3}})};
 }
 
 TEST(HostilePropertyList, EveryTruncationIsAnError)
 {
-    for (const Bytes& list : goodLists()) {
+    // Every kind of value, in both forms.
+    const Bytes xml =
+        bytesOf("<?xml version=\"1.0\"?><!DOCTYPE plist PUBLIC \"-//A\" \"b\"><plist version=\"1.0\">"
+                "<dict><key>a &amp;</key><array><integer>-5</integer><real>1.5</real><true/>"
+                "<data>AAEC</data></array><key>\u00e4</key><date>2026-11-16T05:54:31Z</date><!-- c -->"
+                "<key>d</key><string>x<![CDATA[<y>]]>z</string><key>e</key><dict/></dict></plist>");
+    for (const Bytes& list : {xml, propertyListBinary(propertyListFromData(xml).value.value()).value()}) {
         ASSERT_EQ(propertyListFromData(list).error, "");
         for (std::size_t length = 0; length < list.size(); ++length) {
             const Bytes cut(list.begin(), list.begin() + static_cast<std::ptrdiff_t>(length));
-            const auto result = propertyListFromData(cut);
-            EXPECT_FALSE(result.value) << length;
-            EXPECT_NE(result.error, "") << length;
+            EXPECT_FALSE(propertyListFromData(cut).value) << length;
         }
     }
 }

@@ -10,6 +10,7 @@
 namespace orvex {
 namespace {
 
+using namespace std::string_literals;
 using test::setEnvironment;
 using testing::AllOf;
 using testing::Each;
@@ -23,24 +24,22 @@ TEST_F(PortDirectoryTest, IsMadeForTheOwnerAloneAndRefusedWhenOthersCouldWriteTh
     ASSERT_TRUE(PortDirectory(directory()).isUsable());
     EXPECT_EQ(std::filesystem::status(directory()).permissions(), std::filesystem::perms::owner_all);
     EXPECT_TRUE(PortDirectory(directory()).isUsable()) << "the second time it is there";
-    const struct {
-        const char* reason;
-        const char* command; // that makes the directory
-    } cases[] = {
+    const std::pair<const char*, std::string> cases[] = {
+        // why, and what makes the directory
         {"open to other users", "mkdir -m 770 "},
         {"open to other users", "mkdir -m 701 "},
         {"symbolic link", "ln -s /tmp "},
         {"no directory", "touch "},
         {"another user", "install -d -m 700 -o 65534 "},
     };
-    for (const auto& test : cases) {
-        const auto shell = "rm -rf " + directory() + " && " + test.command + directory();
+    for (const auto& [reason, command] : cases) {
+        const auto shell = "rm -rf " + directory() + " && " + command + directory();
         // Only root can give a directory away.
         if (std::system(shell.c_str()) != 0 && geteuid() != 0) // NOLINT(cert-env33-c,concurrency-mt-unsafe)
             continue;
-        EXPECT_FALSE(ports.createLocalPort("a", collector()).port) << test.command;
-        EXPECT_FALSE(ports.createRemotePort("a")) << test.command;
-        EXPECT_THAT(log.take(), AllOf(SizeIs(2), Each(HasSubstr(test.reason)))) << test.command;
+        EXPECT_FALSE(ports.createLocalPort("a", collector()).port) << command;
+        EXPECT_FALSE(ports.createRemotePort("a")) << command;
+        EXPECT_THAT(log.take(), AllOf(SizeIs(2), Each(HasSubstr(reason)))) << command;
     }
     EXPECT_FALSE(SocketMessagePorts(directory() + "/no/where").createRemotePort("a"));
     EXPECT_THAT(log.take(), testing::ElementsAre(HasSubstr("No such file")));
@@ -48,8 +47,7 @@ TEST_F(PortDirectoryTest, IsMadeForTheOwnerAloneAndRefusedWhenOthersCouldWriteTh
 
 TEST_F(PortDirectoryTest, NamesThatLeadElsewhereAreRefused)
 {
-    for (const std::string& name : {std::string(), std::string("."), std::string(".."), std::string("a/b"),
-             std::string("/tmp/x"), std::string("a\0b", 3), std::string(108, 'x')}) {
+    for (const std::string& name : {""s, "."s, ".."s, "a/b"s, "a\0b"s, std::string(108, 'x')}) {
         EXPECT_FALSE(ports.createLocalPort(name, collector()).port) << name;
         EXPECT_FALSE(ports.createRemotePort(name)) << name;
         EXPECT_THAT(log.take(), SizeIs(2)) << name;
@@ -58,20 +56,13 @@ TEST_F(PortDirectoryTest, NamesThatLeadElsewhereAreRefused)
 
 TEST_F(PortDirectoryTest, EnvironmentNamesThePlace)
 {
-    const struct {
-        const char* chosen;
-        const char* runtime;
-        std::string path;
-    } cases[] = {
-        {"/chosen", "/run/user/7", "/chosen"},
-        {"", "/run/user/7", "/run/user/7/orvex"},
-        {nullptr, nullptr, "/tmp/orvex-" + std::to_string(geteuid())},
-    };
-    for (const auto& test : cases) {
-        setEnvironment("ORVEX_PORT_DIR", test.chosen);
-        setEnvironment("XDG_RUNTIME_DIR", test.runtime);
-        EXPECT_EQ(PortDirectory().path(), test.path);
-    }
+    setEnvironment("ORVEX_PORT_DIR", "/chosen");
+    setEnvironment("XDG_RUNTIME_DIR", "/run/user/7");
+    EXPECT_EQ(PortDirectory().path(), "/chosen");
+    setEnvironment("ORVEX_PORT_DIR", "");
+    EXPECT_EQ(PortDirectory().path(), "/run/user/7/orvex");
+    setEnvironment("XDG_RUNTIME_DIR", nullptr);
+    EXPECT_EQ(PortDirectory().path(), "/tmp/orvex-" + std::to_string(geteuid()));
 }
 
 } // namespace

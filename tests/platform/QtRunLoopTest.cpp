@@ -20,43 +20,25 @@ TEST(QtRunLoop, RunsPostedTasksLaterAndInOrder)
     loop.post([&] {
         order += 'a';
         loop.post([&] { order += 'd'; });
+        waitUntil([&] { return order.size() == 4; }); // also by an event loop inside a task
+        order += 'e';
     });
     loop.post([&] { order += 'b'; });
     std::thread([&] { loop.post([&] { order += 'c'; }); }).join();
     EXPECT_EQ(order, "");
-    EXPECT_TRUE(waitUntil([&] { return order.size() == 4; }));
-    EXPECT_EQ(order, "abcd");
+    EXPECT_TRUE(waitUntil([&] { return order.size() == 5; }));
+    EXPECT_EQ(order, "abcde");
 }
 
-TEST(QtRunLoop, TaskThatAlwaysPostsItselfLeavesTimersTheirTurn)
+TEST(QtRunLoop, DelaysAreNeverShortNorHeldUpByATaskThatAlwaysPostsItself)
 {
     QtRunLoop loop;
-    bool fired = false;
-    loop.postAfter(20ms, [&] { fired = true; });
     int turns = 0;
     std::function<void()> again = [&] {
         ASSERT_LT(++turns, 1'000'000) << "the timer never had its turn";
         loop.post(again);
     };
     loop.post(again);
-    EXPECT_TRUE(waitUntil([&] { return fired; }));
-}
-
-TEST(QtRunLoop, PostsAreServedByAnEventLoopInsideATask)
-{
-    QtRunLoop loop;
-    bool inner = false;
-    bool outer = false;
-    loop.post([&] {
-        loop.post([&] { inner = true; });
-        outer = waitUntil([&] { return inner; }, 1s);
-    });
-    EXPECT_TRUE(waitUntil([&] { return outer; }));
-}
-
-TEST(QtRunLoop, DelaysAreNeverShort)
-{
-    QtRunLoop loop;
     for (const auto delay : {0ns, 1'000'001ns, 30'500'000ns}) {
         const auto start = std::chrono::steady_clock::now();
         std::chrono::nanoseconds elapsed(-1);

@@ -2,39 +2,36 @@
 
 #include "PortFrame.h"
 
+#include <gtest/gtest.h>
+
 #include <QCoreApplication>
 
 #include <cerrno>
 #include <string>
 
-#include <poll.h>
 #include <sys/socket.h>
 #include <sys/un.h>
 #include <unistd.h>
 
 namespace orvex::test {
 
-// A socket that speaks to message ports byte by byte, with no help of the code under test.
+// A socket that speaks to a message port byte by byte, with no help of the code under test.
 class RawPeer {
 public:
-    RawPeer()
+    explicit RawPeer(const std::string& path)
         : _socket(::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0))
-    {
-    }
-    ~RawPeer() { leave(); }
-    RawPeer(const RawPeer&) = delete;
-    RawPeer& operator=(const RawPeer&) = delete;
-
-    bool connectTo(const std::string& path) const
     {
         sockaddr_un address{};
         address.sun_family = AF_UNIX;
         path.copy(address.sun_path, sizeof address.sun_path - 1);
-        return ::connect(_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0;
+        EXPECT_EQ(::connect(_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address), 0) << path;
     }
+    ~RawPeer() { ::close(_socket); }
+    RawPeer(const RawPeer&) = delete;
+    RawPeer& operator=(const RawPeer&) = delete;
 
     // Turns the event loop, and so the port at the other end, while the socket is full.
-    bool write(ByteView bytes) const
+    void write(ByteView bytes) const
     {
         while (!bytes.empty()) {
             const auto count = ::send(_socket, bytes.data(), bytes.size(), MSG_NOSIGNAL | MSG_DONTWAIT);
@@ -42,13 +39,16 @@ public:
                 QCoreApplication::processEvents();
                 continue;
             }
-            if (count <= 0)
-                return false;
+            ASSERT_GT(count, 0);
             bytes = bytes.subspan(static_cast<std::size_t>(count));
         }
-        return true;
     }
-    bool write(const Frame& frame) const { return write(encodedFrame(frame)); }
+    void write(const Frame& frame) const { write(encodedFrame(frame)); }
+    // A one-way message.
+    void say(std::int32_t messageId, std::string_view word) const
+    {
+        write({messageId, FrameKind::oneWay, 0, Bytes(word.begin(), word.end())});
+    }
 
     // What is there to be read at this moment.
     Bytes read() const
@@ -65,13 +65,6 @@ public:
         std::uint8_t byte = 0;
         const auto count = ::recv(_socket, &byte, 1, MSG_DONTWAIT | MSG_PEEK);
         return count == 0 || (count < 0 && errno != EAGAIN);
-    }
-
-    void leave()
-    {
-        if (_socket >= 0)
-            ::close(_socket);
-        _socket = -1;
     }
 
 private:

@@ -22,9 +22,8 @@ TEST_F(SocketMessagePortsTest, PartOfAMessageIsWaitedForWithoutHoldingUpOthers)
         collector()(messageId, data);
         return Bytes{0xFF};
     });
-    RawPeer slow;
-    RawPeer other;
-    ASSERT_TRUE(slow.connectTo(pathOf("a")) && other.connectTo(pathOf("a")));
+    const RawPeer slow(pathOf("a"));
+    const RawPeer other(pathOf("a"));
     const Bytes bytes = {
         3, 0, 0, 0, 0xFE, 0xFF, 0xFF, 0xFF, 1, 0, 0, 0, 4, 3, 2, 0x81, 'a', 'b', 'c', // request -2
         6, 0, 0, 0, 1, 0, 0, 0, 2, 0, 0, 0, 9, 0, 0, 0, 'n', 'o', 'b', 'o', 'd', 'y', // a reply to nothing
@@ -32,14 +31,13 @@ TEST_F(SocketMessagePortsTest, PartOfAMessageIsWaitedForWithoutHoldingUpOthers)
     };
     std::string expected;
     for (std::size_t i = 0; i < bytes.size(); ++i) {
-        ASSERT_TRUE(other.write({2, FrameKind::oneWay, 0, bytesOf("quick")}));
-        expected += "2:quick ";
-        ASSERT_TRUE(waitUntil([&] { return received == expected; })) << received;
-        ASSERT_TRUE(slow.write(ByteView(&bytes[i], 1)));
+        slow.write(ByteView(&bytes[i], 1));
         expected += i == 18 ? "-2:abc " : "";
         ASSERT_TRUE(waitUntil([&] { return received == expected; })) << received;
+        other.say(2, "quick");
+        expected += i == bytes.size() - 1 ? "16909060: 2:quick " : "2:quick ";
+        ASSERT_TRUE(waitUntil([&] { return received == expected; })) << received;
     }
-    EXPECT_TRUE(waitUntil([&] { return received == expected + "16909060: "; })) << received;
     EXPECT_EQ(slow.read(), (Bytes{1, 0, 0, 0, 0xFE, 0xFF, 0xFF, 0xFF, 2, 0, 0, 0, 4, 3, 2, 0x81, 0xFF}));
 }
 
@@ -56,13 +54,13 @@ TEST_F(SocketMessagePortsTest, RequestsGetTheirOwnReplies)
         return reply;
     });
     const auto remote = ports.createRemotePort("a");
-    const auto late = remote->request(1, bytesOf("late"), 1s, 50ms);
-    EXPECT_EQ(late.status, Status::success);
-    EXPECT_FALSE(late.reply);
+    EXPECT_FALSE(remote->request(1, bytesOf("late"), 1s, 50ms).reply);
     // Slow as well, so that the late reply comes first and alone.
     EXPECT_EQ(remote->request(1, bytesOf("after late"), 1s, 5s).reply, bytesOf("after late!"));
     EXPECT_EQ(remote->send(0, bytesOf("one-way"), 1s), Status::success);
-    EXPECT_FALSE(remote->request(2, bytesOf("none"), 1s, 50ms).reply);
+    const auto none = remote->request(2, bytesOf("none"), 1s, 50ms);
+    EXPECT_EQ(none.status, Status::success);
+    EXPECT_FALSE(none.reply);
 
     const std::string large(kLargestPayload - 1, 'x');
     EXPECT_TRUE(remote->request(0, bytesOf(large), 5s, 20s).reply == bytesOf(large + '!'));
@@ -78,12 +76,8 @@ TEST_F(SocketMessagePortsTest, NameIsServedOnce)
 {
     EXPECT_FALSE(ports.createRemotePort("a"));
     auto first = ports.createLocalPort("a", collector()).port;
-    const auto second = ports.createLocalPort("a", [](auto, auto) {
-        ADD_FAILURE() << "the second port got a message";
-        return std::nullopt;
-    });
+    const auto second = ports.createLocalPort("a", {});
     EXPECT_TRUE(second.alreadyExisted);
-    ASSERT_TRUE(second.port);
     EXPECT_FALSE(second.port->isValid());
     second.port->invalidate();
     ASSERT_EQ(ports.createRemotePort("a")->send(7, bytesOf("x"), 1s), Status::success);
@@ -175,47 +169,35 @@ TEST_F(SocketMessagePortsTest, SendingWaitsForAPeerThatDoesNotReadAndLosesNothin
 
 TEST_F(SocketMessagePortsTest, WhatWaitsIsDeliveredWithoutTheEventLoop)
 {
-    const auto local = ports.createLocalPort("a", collector());
-    RawPeer gone;
-    RawPeer present;
-    ASSERT_TRUE(gone.connectTo(pathOf("a")) && present.connectTo(pathOf("a")));
-    ASSERT_TRUE(present.write({0, FrameKind::oneWay, 0, bytesOf("first")}));
-    ASSERT_TRUE(waitUntil([&] { return received == "0:first "; })); // both are known to the port
-    received.clear();
+    std::shared_ptr<LocalPort> port;
+    port = ports
+               .createLocalPort("a",
+                   [&](std::int32_t messageId, ByteView data) {
+                       collector()(messageId, data);
+                       if (messageId == 0)
+                           port->invalidate();
+                       return std::nullopt;
+                   })
+               .port;
+    std::optional<RawPeer> gone(pathOf("a"));
+    const RawPeer present(pathOf("a"));
+    turnFor(50ms); // both are known to the port
 
     std::string expected;
     for (int i = 1; i <= 150; ++i) { // more than a turn of the event loop takes
-        ASSERT_TRUE(gone.write({i, FrameKind::oneWay, 0, bytesOf("x")}));
+        gone->say(i, "x");
         expected += std::to_string(i) + ":x ";
     }
-    gone.leave();
-    ASSERT_TRUE(present.write({7, FrameKind::oneWay, 0, bytesOf("y")}));
-    ASSERT_TRUE(present.write(ByteView(Bytes{1, 0, 0}))); // the beginning of another
-    local.port->deliverWaiting();
-    EXPECT_EQ(received, expected + "7:y ");
-    local.port->deliverWaiting();
-    local.port->invalidate();
-    EXPECT_EQ(received, expected + "7:y ");
-}
-
-TEST_F(SocketMessagePortsTest, AReceiverMayCloseThePortThatDeliversWhatWaits)
-{
-    std::shared_ptr<LocalPort> port;
-    const auto local = ports.createLocalPort("a", [&](std::int32_t messageId, ByteView data) {
-        collector()(messageId, data);
-        if (messageId == 2)
-            port->invalidate();
-        return std::nullopt;
-    });
-    port = local.port;
-    RawPeer first;
-    RawPeer second;
-    ASSERT_TRUE(first.connectTo(pathOf("a")) && second.connectTo(pathOf("a")));
-    turnFor(50ms);
-    ASSERT_TRUE(first.write({1, FrameKind::oneWay, 0, {}}) && first.write({2, FrameKind::oneWay, 0, {}})
-        && first.write({3, FrameKind::oneWay, 0, {}}) && second.write({4, FrameKind::oneWay, 0, {}}));
+    gone.reset();
+    present.say(7, "y");
+    present.write(ByteView(Bytes{1, 0, 0})); // the beginning of another
     port->deliverWaiting();
-    EXPECT_EQ(received, "1: 2: ");
+    EXPECT_EQ(received, expected + "7:y ");
+    present.write(
+        ByteView(Bytes{0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 'e'})); // a receiver may close its port
+    present.say(8, "z");
+    port->deliverWaiting();
+    EXPECT_EQ(received, expected + "7:y 0:e ");
     EXPECT_FALSE(port->isValid());
 }
 

@@ -52,32 +52,20 @@ TEST_F(SystemFilesTest, ResourcesAreReadEachTimeAndFaultsToldInOneLine)
     write("array.plist", test::xmlList("<array/>"));
     write("cut.plist", "<plist><dict>");
     write("c.txt", "");
-    std::filesystem::create_directory(path("folder.plist"));
     const FileResources resources(path(""));
-    EXPECT_THAT(
-        resources.propertyListPaths(), ElementsAre("array.plist", "cut.plist", "folder.plist", "good.plist"));
-    EXPECT_TRUE(*resources.dictionaryNamed("good") == Dictionary());
+    EXPECT_THAT(resources.propertyListPaths(), ElementsAre("array.plist", "cut.plist", "good.plist"));
+    EXPECT_EQ(*resources.dictionaryNamed("good"), Dictionary());
     write("good.plist", test::xmlList("<dict><key>k</key><integer>2</integer></dict>"));
-    EXPECT_TRUE(*resources.dictionaryNamed("good") == Dictionary({{"k", 2}}));
+    EXPECT_EQ(*resources.dictionaryNamed("good"), Dictionary({{"k", 2}}));
     EXPECT_THAT(log.take(), IsEmpty());
 
-    const struct {
-        const char* name;
-        const char* reason;
-    } cases[] = {
-        {"missing", "No such file"},
-        {"array", "no dictionary but: array"},
-        {"cut", "<dict> is not closed"},
-        {"folder", "directory"},
-    };
-    for (const auto& test : cases) {
-        EXPECT_FALSE(resources.dictionaryNamed(test.name));
-        EXPECT_THAT(log.take(),
-            ElementsAre(testing::AllOf(
-                HasSubstr("<3>"), HasSubstr(std::string(test.name) + ".plist"), HasSubstr(test.reason))));
-    }
+    for (const char* name : {"missing", "array", "cut"})
+        EXPECT_FALSE(resources.dictionaryNamed(name));
     EXPECT_THAT(FileResources(path("nowhere")).propertyListPaths(), IsEmpty());
-    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("No such file")));
+    EXPECT_THAT(log.take(),
+        ElementsAre(testing::MatchesRegex("<3>.*missing.plist.*No such file.*"),
+            testing::MatchesRegex("<3>.*array.plist.*no dictionary but: array.*"),
+            testing::MatchesRegex("<3>.*cut.plist.*<dict> is not closed.*"), HasSubstr("No such file")));
 }
 
 // Runs itself once more from elsewhere, as an installed program would.
@@ -100,27 +88,18 @@ TEST_F(SystemFilesTest, ResourcesOfTheSourceTreeServeProgramsOfTheBuildTreeAlone
 
 TEST_F(SystemFilesTest, PathsStandUnderTheirPrefixes)
 {
-    setEnvironment("HOME", "/home/u");
-    const struct {
-        const char* root;
-        const char* state;
-        const char* config;
-        const char* paths;
-    } cases[] = {
-        {"/r", "/s", "/c",
-            "/r/usr/lib/orvex/internal/Carrier Settings.bundle /r/s/orvex/diagnostic-reports /r/c"},
-        {nullptr, "relative", nullptr,
-            "/usr/lib/orvex/internal/Carrier Settings.bundle "
-            "/home/u/.local/state/orvex/diagnostic-reports /home/u/.config"},
+    const auto all = [](const char* root, const char* state, const char* config) {
+        setEnvironment("HOME", "/home/u");
+        setEnvironment("ORVEX_ROOT", root);
+        setEnvironment("XDG_STATE_HOME", state);
+        setEnvironment("XDG_CONFIG_HOME", config);
+        return paths::internalBuildMarker() + ' ' + paths::diagnosticReports() + ' ' + paths::preferences();
     };
-    for (const auto& test : cases) {
-        setEnvironment("ORVEX_ROOT", test.root);
-        setEnvironment("XDG_STATE_HOME", test.state);
-        setEnvironment("XDG_CONFIG_HOME", test.config);
-        EXPECT_EQ(
-            paths::internalBuildMarker() + ' ' + paths::diagnosticReports() + ' ' + paths::preferences(),
-            test.paths);
-    }
+    EXPECT_EQ(all("/r", "/s", "/c"),
+        "/r/usr/lib/orvex/internal/Carrier Settings.bundle /r/s/orvex/diagnostic-reports /r/c");
+    EXPECT_EQ(all(nullptr, "relative", nullptr),
+        "/usr/lib/orvex/internal/Carrier Settings.bundle /home/u/.local/state/orvex/diagnostic-reports "
+        "/home/u/.config");
 }
 
 TEST_F(SystemFilesTest, PreferencesAreKeptInOneFilePerDomain)
@@ -136,8 +115,6 @@ TEST_F(SystemFilesTest, PreferencesAreKeptInOneFilePerDomain)
     preferences.synchronize("org.orvex.Other");
     EXPECT_EQ(contentOf("org.orvex.Home.ini"), "[General]\nHXShowGSMRSSI=false\nkept=7\ntext=a b\n");
     EXPECT_EQ(contentOf("org.orvex.Other.ini"), "[General]\nnumber=-5\n");
-    EXPECT_THAT(log.take(), IsEmpty());
-
     preferences.setValue("org.orvex.Home", "list", Array::make());
     preferences.setValue("../elsewhere", "x", 1);
     EXPECT_THAT(log.take(), ElementsAre(HasSubstr("kind array"), HasSubstr("cannot be the name")));

@@ -4,7 +4,7 @@
 #include "QueuedSystemLog.h"
 
 #include "Environment.h"
-#include "TextFormat.h"
+#include "TemporaryFile.h"
 
 #include <gmock/gmock.h>
 
@@ -60,7 +60,6 @@ TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
     std::promise<void> stuck;
     std::promise<void> go;
     std::vector<std::string> written;
-    constexpr std::size_t kWritten = 20'000;
     {
         QueuedSystemLog log([&](const QueuedSystemLog::Lines& lines) {
             if (written.empty()) {
@@ -73,15 +72,14 @@ TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
         // The writer is stuck with the first line; of the others those are kept that fit the queue.
         log.write(Priority::notice, "0");
         stuck.get_future().wait();
-        for (std::size_t i = 1; i < kWritten; ++i)
+        for (std::size_t i = 1; i < QueuedSystemLog::kMostLines + 8; ++i)
             log.write(Priority::notice, std::to_string(i));
         go.set_value();
         log.flush();
-        constexpr std::size_t kKept = 1 + QueuedSystemLog::kMostLines;
-        ASSERT_EQ(written.size(), kKept + 1);
-        for (std::size_t i = 0; i < kKept; ++i)
+        ASSERT_EQ(written.size(), QueuedSystemLog::kMostLines + 2);
+        for (std::size_t i = 0; i < written.size() - 1; ++i)
             ASSERT_EQ(written[i], std::to_string(i));
-        EXPECT_EQ(written.back(), std::to_string(kWritten - kKept) + " log lines were dropped");
+        EXPECT_EQ(written.back(), "7 log lines were dropped");
         log.write(Priority::notice, "at the end");
     }
     EXPECT_EQ(written.back(), "at the end") << "the destructor writes what is queued";
@@ -89,10 +87,10 @@ TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
 
 TEST(FileSystemLog, KeepsEveryLineAndTellsOfAFullDisk)
 {
-    const std::string path = testing::TempDir() + "orvex-file-log-" + std::to_string(getpid());
+    const test::TemporaryFile temporary;
     std::string expected = "<3>ends by itself\n";
     {
-        FileSystemLog log(path);
+        FileSystemLog log(temporary.path);
         log.write(Priority::error, "ends by itself\n");
         for (int i = 0; i < 10'000; ++i) {
             log.write(Priority::dlfFailure, std::to_string(i));
@@ -101,37 +99,30 @@ TEST(FileSystemLog, KeepsEveryLineAndTellsOfAFullDisk)
         log.flush();
         EXPECT_EQ(log.error(), "");
     }
-    std::ifstream file(path);
+    std::ifstream file(temporary.path);
     EXPECT_EQ(std::string(std::istreambuf_iterator<char>(file), {}), expected);
-    unlink(path.c_str());
 
-    const char* const faults[][2] = {
-        {"/dev/full", "No space left on device"}, {"/nowhere/at/all", "No such file or directory"}};
-    for (const auto& [bad, reason] : faults) {
-        FileSystemLog log(bad);
-        log.write(Priority::error, "x");
-        log.flush();
-        EXPECT_EQ(log.error(), text("%s: %s", bad, reason));
-    }
+    FileSystemLog full("/dev/full");
+    full.write(Priority::error, "x");
+    full.flush();
+    EXPECT_EQ(full.error(), "/dev/full: No space left on device");
+    EXPECT_EQ(FileSystemLog("/nowhere/at/all").error(), "/nowhere/at/all: No such file or directory");
 }
 
 TEST(FatalErrorsDeathTest, LastLineSaysWhatWasThrown)
 {
-    const struct {
-        std::function<void()> fail;
-        const char* line;
-    } cases[] = {
+    const std::pair<void (*)(), const char*> cases[] = {
         {[] { throw std::out_of_range("index 7 of 3"); },
             "<3>Fatal: uncaught exception of type std::out_of_range: index 7 of 3\n"},
         {[] { throw 7; }, "<3>Fatal: uncaught exception of type int\n"},
         {[] { std::terminate(); }, "<3>Fatal: terminated without an exception\n"},
     };
-    for (const auto& test : cases) {
-        const auto fail = [&](SystemLog&) noexcept {
+    for (const auto& [fault, line] : cases) {
+        const auto fail = [&fault](SystemLog&) noexcept {
             installFatalErrorHandler();
-            test.fail();
+            fault();
         };
-        EXPECT_EXIT(writeTo("stderr", fail), testing::KilledBySignal(SIGABRT), test.line);
+        EXPECT_EXIT(writeTo("stderr", fail), testing::KilledBySignal(SIGABRT), line);
     }
 }
 
