@@ -1,11 +1,11 @@
 // How fast recorded streams are decoded while nobody reads the system log.
 
 #include "Benchmarks.h"
-#include "RecordedStream.h"
+#include "DecodeLoop.h"
 
 #include "SystemLog.h"
 
-#include <benchmark/benchmark.h>
+#include <string_view>
 
 namespace orvex::bench {
 namespace {
@@ -19,34 +19,16 @@ public:
     bool wants(Priority) const override { return false; }
 };
 
-void decodeAll(benchmark::State& state, const char* technology, const std::vector<Bytes>& messages)
-{
-    DroppingLog log;
-    SystemLog::install(&log);
-    {
-        const auto generator = makeGenerator(technology);
-        Dictionary session;
-        for (auto _ : state) {
-            std::size_t count = 0;
-            for (const Bytes& message : messages) {
-                generator->updateState(session, message);
-                if (++count % kMessagesPerRefresh == 0)
-                    generator->generateLogUsingState(session); // hands over the raw packets
-            }
-        }
-        countMessages(state, messages.size());
-    }
-    SystemLog::install(nullptr);
-}
-
 void decode(benchmark::State& state, const Technology& technology)
 {
-    decodeAll(state, technology.identifier, recordedStream(technology));
+    DroppingLog log;
+    decodeInto(log, state, technology, recordedStream(technology), kMessagesPerRefresh);
 }
 
 void decodeBaseband(benchmark::State& state, const Technology& technology)
 {
-    decodeAll(state, technology.identifier, basebandStream(technology));
+    DroppingLog log;
+    decodeInto(log, state, technology, basebandStream(technology), kMessagesPerRefresh);
 }
 
 } // namespace
@@ -54,12 +36,9 @@ void decodeBaseband(benchmark::State& state, const Technology& technology)
 void registerDecoding()
 {
     for (const Technology& technology : kTechnologies) {
-        const std::string name = technology.name;
-        benchmark::RegisterBenchmark(("decode/" + name).c_str(), decode, technology)
-            ->Unit(benchmark::kMillisecond);
-        if (name != "ifx") // it has no packets, only property lists
-            benchmark::RegisterBenchmark(("baseband/" + name).c_str(), decodeBaseband, technology)
-                ->Unit(benchmark::kMillisecond);
+        registerDecode("decode", technology, decode);
+        if (technology.name != std::string_view("ifx")) // it has no packets, only property lists
+            registerDecode("baseband", technology, decodeBaseband);
     }
 }
 

@@ -3,7 +3,7 @@
 // that the figures are ours and not those of a disk.
 
 #include "Benchmarks.h"
-#include "RecordedStream.h"
+#include "DecodeLoop.h"
 
 #include "FileSystemLog.h"
 #include "QueuedSystemLog.h"
@@ -58,41 +58,24 @@ private:
     QueuedSystemLog _queue{[this](const QueuedSystemLog::Lines& lines) { writeAll(lines); }};
 };
 
-void decodeInto(
-    SystemLog& log, benchmark::State& state, const Technology& technology, const std::vector<Bytes>& messages)
-{
-    SystemLog::install(&log);
-    {
-        const auto generator = makeGenerator(technology.identifier);
-        Dictionary session;
-        for (auto _ : state) {
-            for (const Bytes& message : messages)
-                generator->updateState(session, message);
-            generator->generateLogUsingState(session);
-        }
-        countMessages(state, messages.size());
-    }
-    SystemLog::install(nullptr);
-}
-
 void decodeIntoFile(benchmark::State& state, const Technology& technology)
 {
     FileSystemLog log(kNowhere);
-    decodeInto(log, state, technology, recordedStream(technology));
+    decodeInto(log, state, technology, recordedStream(technology), kOnceAtTheEnd);
 }
 
 // The queue drops lines when its thread cannot keep pace.
 void decodeIntoQueue(benchmark::State& state, const Technology& technology)
 {
     CountedQueue log;
-    decodeInto(log, state, technology, recordedStream(technology));
+    decodeInto(log, state, technology, recordedStream(technology), kOnceAtTheEnd);
     state.counters["kept %"] = log.keptPercent();
 }
 
 void decodeBasebandIntoFile(benchmark::State& state, const Technology& technology)
 {
     FileSystemLog log(kNowhere);
-    decodeInto(log, state, technology, basebandStream(technology));
+    decodeInto(log, state, technology, basebandStream(technology), kOnceAtTheEnd);
 }
 
 } // namespace
@@ -100,13 +83,9 @@ void decodeBasebandIntoFile(benchmark::State& state, const Technology& technolog
 void registerLoggedDecoding()
 {
     for (const Technology& technology : kTechnologies) {
-        const std::string name = technology.name;
-        benchmark::RegisterBenchmark(("decode+file/" + name).c_str(), decodeIntoFile, technology)
-            ->Unit(benchmark::kMillisecond);
-        benchmark::RegisterBenchmark(("baseband+file/" + name).c_str(), decodeBasebandIntoFile, technology)
-            ->Unit(benchmark::kMillisecond);
-        benchmark::RegisterBenchmark(("decode+queue/" + name).c_str(), decodeIntoQueue, technology)
-            ->Unit(benchmark::kMillisecond);
+        registerDecode("decode+file", technology, decodeIntoFile);
+        registerDecode("baseband+file", technology, decodeBasebandIntoFile);
+        registerDecode("decode+queue", technology, decodeIntoQueue);
     }
 }
 
