@@ -64,32 +64,26 @@ private:
         }
     }
 
-    // Every internal key is a row of the container. What decoders remember lasts for one packet: here the
-    // counters of the one before, without which no rate is shown.
+    // What decoders remember lasts for one packet: here the counters of the one before, without which no rate
+    // is shown.
     void addCDMA2000()
     {
-        for (const char* key : kInternalKeys)
-            Publisher::addRow(*_lookup, key, key, nullptr);
-        const DictionaryRef command = _c2k.getStartCommand();
-        const ArrayRef codes = (*command)[telephony::kSetMarlinLogCodes].array();
+        const ArrayRef codes = (*_c2k.generator.getStartCommand())[telephony::kSetMarlinLogCodes].array();
         for (const Value& code : *codes) {
             _decoders.push_back({"CDMA2000", static_cast<LogCode>(*code.integer()),
                 [this](const Value& container, const Bytes& packet) {
-                    for (const auto& [key, rows] : *_lookup)
-                        (*rows.array())[0].dictionary()->set("dict", container);
-                    Dictionary state;
+                    _c2k.showIn(container.dictionary());
                     for (const char* counter : {"FLDataSeqNum", "FLDataSent", "RLDataSeqNum", "RLDataSent"})
-                        state.set(counter, 0);
-                    _c2k.updateFromLog(packet, _lookup, state);
+                        _c2k.state.set(counter, 0);
+                    _c2k.state.remove("TrafficFER");
+                    _c2k.feed(packet);
+                    _c2k.log.take();
                 }});
         }
     }
 
-    FixedResources _resources;
-    FixedClock _clock;
-    C2KLogGenerator _c2k{GeneratorEnvironment{_resources, _clock, {}}};
-    DictionaryRef _lookup = Dictionary::make(); // of CDMA2000
-    std::unique_ptr<ClassIndex> _index;         // of the others
+    C2KFixture _c2k;
+    std::unique_ptr<ClassIndex> _index; // of the other technologies
     std::vector<Decoder> _decoders;
 };
 

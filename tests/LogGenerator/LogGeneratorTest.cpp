@@ -1,38 +1,16 @@
 #include "LogGenerator.h"
-#include "C2K/C2KLogGenerator.h"
-#include "GSM/GSMLogGenerator.h"
 #include "GSM/MRL_GSMLogGenerator.h"
 #include "LTE/LTELogGenerator.h"
-#include "UTRAN/UTRANLogGenerator.h"
 
 #include "Console.h"
 #include "GeneratorFixture.h"
-#include "TelephonyConstants.h"
 
 #include <gmock/gmock.h>
 
 namespace orvex::test {
 namespace {
 
-template <typename Generator>
-bool isMade(const GeneratorFixture& fixture, const Value& technology)
-{
-    const auto generator = LogGenerator::generatorFromTechnology(technology, fixture.environment());
-    return dynamic_cast<Generator*>(generator.get()) != nullptr;
-}
-
 class LogGeneratorTest : public GeneratorFixture { };
-
-TEST_F(LogGeneratorTest, ChoosesByTheTextOfTheTechnology)
-{
-    EXPECT_TRUE(isMade<LTELogGenerator>(*this, telephony::kTechnologyMRL_LTE));
-    EXPECT_TRUE(isMade<MRL_GSMLogGenerator>(*this, telephony::kTechnologyMRL_GSM));
-    EXPECT_TRUE(isMade<UTRANLogGenerator>(*this, telephony::kTechnologyMRL_UTRAN2));
-    EXPECT_TRUE(isMade<C2KLogGenerator>(*this, telephony::kTechnologyMRL_CDMA));
-    EXPECT_TRUE(isMade<GSMLogGenerator>(*this, telephony::kTechnologyIFX));
-    for (const Value& unknown : {Value("MRL_LTE "), Value("mrl_lte"), Value(""), Value(), Value(1)})
-        EXPECT_FALSE(isMade<LogGenerator>(*this, unknown));
-}
 
 // What a generator with this many sections says from its birth to its end.
 template <typename Generator>

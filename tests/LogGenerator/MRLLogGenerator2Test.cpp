@@ -64,7 +64,6 @@ TEST_F(MRLLogGenerator2Test, FramesRoutesAndKeepsMessages)
         {"81 07 01 00 00 16 41 00*6",
             "First={Packet=4116, 11}, Group={Second={Packet=4116, 11}, Text=as it is}"},
         {"FF 00 00 00 00 00*8", "First={Packet=FF0000, 13}, Group={Second={}, Text=as it is}"},
-        {"FF 00 00 16 41 00*8", nowhere},
         {"01 00 00 00 00 00*8", nowhere},
         {"00 00 00 16 41 00*8", nowhere, {"<3>Invalid log type: 0. Dropping."}},
         {"81 00 FE 00 00 16 41 00*6", nowhere, {"<3>Invalid log type: fe. Dropping."}},

@@ -31,9 +31,10 @@ public:
         log.take();
     }
 
-    void clear()
+    void clear() { showIn(Dictionary::make()); }
+    void showIn(const DictionaryRef& rows)
     {
-        display = Dictionary::make();
+        display = rows;
         _lookup = Dictionary::make();
         for (const char* key : kInternalKeys)
             Publisher::addRow(*_lookup, key, key, display);

@@ -93,19 +93,6 @@ TEST_F(C2KLogGeneratorTest, ShowsAValueInEveryRowThatNamesItsKey)
             {"SetMarlinLogCodes", Array::make({4234, 4483, 4498, 4790, 4508, 4509, 4734, 4943})}}));
 }
 
-TEST(Publisher, EndsAtADamagedEntry)
-{
-    const auto row = Dictionary::make();
-    const Value whole = Dictionary::make({{"key", "row"}, {"dict", row}});
-    for (const Value& damaged : {Value("x"), Value(Dictionary::make({{"key", "row"}})),
-             Value(Dictionary::make({{"key", 1}, {"dict", row}}))}) {
-        Publisher(Dictionary::make({{"k", Array::make({damaged, whole})}})).publish("k", "value");
-        EXPECT_TRUE(row->isEmpty());
-    }
-    Publisher(Dictionary::make({{"k", "x"}})).publish("k", "value");
-    Publisher(nullptr).publish("k", "value");
-}
-
 TEST_F(C2KLogGeneratorTest, FramesAndKeepsWhatReachesADecoder)
 {
     const char* const decoded = "SID=258, Revision=7";
