@@ -22,10 +22,7 @@ std::string repeated(std::string_view text, std::size_t count)
 
 TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
 {
-    const struct {
-        std::string xml;
-        const char* reason;
-    } cases[] = {
+    const std::pair<std::string, const char*> cases[] = {
         {xmlList(repeated("<array>", 257)), "nested deeper than 256"},
         {xmlList(repeated("<dict><key>k</key>", 257)), "nested deeper than 256"},
         {xmlList("<array>" + repeated("<true/>", 2'000'000) + "</array>"), "more than 2000000 values"},
@@ -58,10 +55,10 @@ TEST(HostilePropertyList, XMLIsRefusedWithTheReason)
         {xmlList("<array a=\">\"></array>"), "a malformed tag"},
         {xmlList("<?><array/><?a?>"), "a malformed processing instruction"},
     };
-    for (const auto& test : cases) {
-        const auto result = propertyListFromData(bytesOf(test.xml));
-        EXPECT_FALSE(result.value) << test.xml.substr(0, 200);
-        EXPECT_THAT(result.error, HasSubstr(test.reason)) << test.xml.substr(0, 200);
+    for (const auto& [xml, reason] : cases) {
+        const auto result = propertyListFromData(bytesOf(xml));
+        EXPECT_FALSE(result.value) << xml.substr(0, 200);
+        EXPECT_THAT(result.error, HasSubstr(reason)) << xml.substr(0, 200);
     }
 }
 

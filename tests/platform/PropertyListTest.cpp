@@ -27,10 +27,7 @@ constexpr std::int64_t kHighest = std::numeric_limits<std::int64_t>::max();
 
 TEST(PropertyList, ReadsEachKindOfXMLValue)
 {
-    const struct {
-        const char* xml;
-        Value value;
-    } cases[] = {
+    const std::pair<const char*, Value> cases[] = {
         {"<string>a&lt;b&amp;c &#228;</string>", "a<b&c \u00e4"},
         {"<string>a<!-- <array> -->b<![CDATA[<c>]]></string>", "ab<c>"},
         {"<string> &quot;&#xFEFF;&#x1F600;&apos;&#65;&#228;&gt; </string>", " \"\uFEFF\U0001F600'A\u00e4> "},
@@ -52,9 +49,9 @@ TEST(PropertyList, ReadsEachKindOfXMLValue)
             Dictionary::make({{"b", true}, {"a&", true}})},
         {"<!-- <array> --><array\n></array ><?note <array> ?>", Array::make()},
     };
-    for (const auto& test : cases) {
-        const auto result = propertyListFromData(bytesOf(xmlList(test.xml)));
-        EXPECT_TRUE(result.value == test.value) << test.xml << ": " << result.error;
+    for (const auto& [xml, value] : cases) {
+        const auto result = propertyListFromData(bytesOf(xmlList(xml)));
+        EXPECT_TRUE(result.value == value) << xml << ": " << result.error;
     }
     EXPECT_TRUE(propertyListFromData(bytesOf("\xEF\xBB\xBF <plist><true/></plist>")).value);
 }
@@ -92,10 +89,7 @@ TEST(PropertyList, ReadsEachKindOfBinaryValue)
 
 TEST(PropertyList, WritesEachKindAsXML)
 {
-    const struct {
-        Value value;
-        const char* xml;
-    } cases[] = {
+    const std::pair<Value, const char*> cases[] = {
         {"a<b>&\u00e4", "<string>a&lt;b&gt;&amp;\u00e4</string>"},
         {std::string("\x01q\0\xFFq\xED\xA0\x80", 8),
             "<string>\uFFFDq\uFFFD\uFFFDq\uFFFD\uFFFD\uFFFD</string>"},
@@ -107,9 +101,9 @@ TEST(PropertyList, WritesEachKindAsXML)
         {Dictionary::make({{"k\x02", Array::make()}}), "<key>k\uFFFD</key>\n\t<array/>"},
         {data({0, 1, 255, 126}), "AAH/fg=="},
     };
-    for (const auto& test : cases) {
-        const Bytes xml = propertyListXML(test.value).value();
-        EXPECT_THAT(std::string(xml.begin(), xml.end()), HasSubstr(test.xml));
+    for (const auto& [value, expected] : cases) {
+        const Bytes xml = propertyListXML(value).value();
+        EXPECT_THAT(std::string(xml.begin(), xml.end()), HasSubstr(expected));
         EXPECT_EQ(propertyListFromData(xml).error, "");
     }
     // Reals come back exactly.
@@ -141,10 +135,7 @@ TEST(PropertyList, RefusesToWriteWhatHasNoFormOrIsTooLarge)
     const auto gigabyte = Array::make();
     for (int i = 0; i < 1024; ++i)
         gigabyte->append(megabyte);
-    const struct {
-        const char* name;
-        Value value;
-    } cases[] = {
+    const std::pair<const char*, Value> cases[] = {
         {"null inside", Array::make({1, Dictionary::make({{"a", Value()}})})},
         {"too deep", Array::make({deepest})},
         {"doubles sixty times", doubling},
@@ -152,8 +143,8 @@ TEST(PropertyList, RefusesToWriteWhatHasNoFormOrIsTooLarge)
         {"date too far", Date{5e9}},
         {"no date", Date{std::nan("")}},
     };
-    for (const auto& test : cases)
-        EXPECT_FALSE(propertyListXML(test.value)) << test.name;
+    for (const auto& [name, value] : cases)
+        EXPECT_FALSE(propertyListXML(value)) << name;
     EXPECT_EQ(propertyListFromData(propertyListXML(deepest).value()).error, "");
 }
 
