@@ -170,19 +170,17 @@ TEST_F(SocketMessagePortsTest, SendingWaitsForAPeerThatDoesNotReadAndLosesNothin
 TEST_F(SocketMessagePortsTest, WhatWaitsIsDeliveredWithoutTheEventLoop)
 {
     std::shared_ptr<LocalPort> port;
-    port = ports
-               .createLocalPort("a",
-                   [&](std::int32_t messageId, ByteView data) {
-                       collector()(messageId, data);
-                       if (messageId == 0)
-                           port->invalidate();
-                       return std::nullopt;
-                   })
-               .port;
+    const auto receiver = [&](std::int32_t messageId, ByteView data) {
+        if (messageId == 0)
+            port->invalidate();
+        return collector()(messageId, data);
+    };
+    port = ports.createLocalPort("a", receiver).port;
     std::optional<RawPeer> gone(pathOf("a"));
     const RawPeer present(pathOf("a"));
-    present.say(9, "here");
-    ASSERT_TRUE(waitUntil([&] { return received == "9:here "; })); // both are known to the port
+    const RawPeer last(pathOf("a"));
+    last.say(9, "here");
+    ASSERT_TRUE(waitUntil([&] { return received == "9:here "; })); // all are known to the port
 
     std::string expected = received;
     for (int i = 1; i <= 150; ++i) { // more than a turn of the event loop takes
@@ -191,12 +189,11 @@ TEST_F(SocketMessagePortsTest, WhatWaitsIsDeliveredWithoutTheEventLoop)
     }
     gone.reset();
     present.say(7, "y");
-    present.write(ByteView(Bytes{1, 0, 0})); // the beginning of another
+    present.write(Bytes{1, 0, 0}); // the beginning of another
     port->deliverWaiting();
     EXPECT_EQ(received, expected + "7:y ");
-    present.write(
-        ByteView(Bytes{0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 'e'})); // a receiver may close its port
-    present.say(8, "z");
+    present.write(Bytes{0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 'e'}); // at which the receiver closes its port
+    last.say(8, "z");
     port->deliverWaiting();
     EXPECT_EQ(received, expected + "7:y 0:e ");
     EXPECT_FALSE(port->isValid());
