@@ -115,10 +115,10 @@ private:
         const auto readText = xmlScalarReader(tag.name);
         if (!readText)
             throw Fault("an unknown element");
-        auto value = readText(contentOf(tag, tag.name == "string"));
-        if (!value)
+        Value value = readText(contentOf(tag, tag.name == "string"));
+        if (value.isNull())
             throw Fault("the content of <" + std::string(tag.name) + "> cannot be read");
-        return std::move(*value);
+        return value;
     }
 
     // What stands between the tag and the one that closes it. It holds until the next content is read.

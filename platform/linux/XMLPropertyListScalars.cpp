@@ -33,12 +33,12 @@ bool takeSign(std::string_view& text)
     return isNegative;
 }
 
-std::optional<Value> text(std::string_view content)
+Value text(std::string_view content)
 {
     return content;
 }
 
-std::optional<Value> integer(std::string_view content)
+Value integer(std::string_view content)
 {
     std::string_view digits = trimmed(content);
     const bool isNegative = takeSign(digits);
@@ -50,23 +50,23 @@ std::optional<Value> integer(std::string_view content)
     const auto read = std::from_chars(digits.data(), end, magnitude, isHexadecimal ? 16 : 10);
     constexpr std::uint64_t kLowest = std::uint64_t{1} << 63;
     if (read.ec != std::errc{} || read.ptr != end || (isNegative && magnitude > kLowest))
-        return std::nullopt;
+        return {};
     if (!isNegative && magnitude >= kLowest)
         return static_cast<double>(magnitude);
     return static_cast<std::int64_t>(isNegative ? 0 - magnitude : magnitude);
 }
 
-std::optional<Value> real(std::string_view content)
+Value real(std::string_view content)
 {
     std::string_view digits = trimmed(content);
     const bool isNegative = takeSign(digits);
     if (digits.starts_with('-'))
-        return std::nullopt;
+        return {};
     double number = 0;
     const char* end = digits.data() + digits.size();
     const auto read = std::from_chars(digits.data(), end, number);
     if (read.ptr != end || read.ec == std::errc::invalid_argument)
-        return std::nullopt;
+        return {};
     if (read.ec == std::errc::result_out_of_range) { // infinity or zero, which is what such a text means
         const DecimalPoint decimalPoint;
         number = std::strtod(std::string(digits).c_str(), nullptr);
@@ -74,7 +74,7 @@ std::optional<Value> real(std::string_view content)
     return isNegative ? -number : number;
 }
 
-std::optional<Value> date(std::string_view content)
+Value date(std::string_view content)
 {
     constexpr std::string_view kForm = "dddd-dd-ddTdd:dd:ddZ";
     const std::string_view text = trimmed(content);
@@ -82,29 +82,29 @@ std::optional<Value> date(std::string_view content)
         return form == 'd' ? std::isdigit(static_cast<unsigned char>(character)) != 0 : character == form;
     };
     if (!std::equal(text.begin(), text.end(), kForm.begin(), kForm.end(), fits))
-        return std::nullopt;
+        return {};
     const auto time = QDateTime::fromString(
         QString::fromLatin1(text.data(), static_cast<qsizetype>(text.size())), Qt::ISODate);
     if (!time.isValid())
-        return std::nullopt;
+        return {};
     return Date{static_cast<double>(time.toSecsSinceEpoch())};
 }
 
-std::optional<Value> data(std::string_view content)
+Value data(std::string_view content)
 {
     std::string digits(content);
     std::erase_if(digits, [](unsigned char character) { return std::isspace(character) != 0; });
     const auto decoded = QByteArray::fromBase64Encoding(
         QByteArray::fromStdString(digits), QByteArray::AbortOnBase64DecodingErrors);
     if (!decoded)
-        return std::nullopt;
+        return {};
     return std::make_shared<Bytes>((*decoded).begin(), (*decoded).end());
 }
 
 template <bool kFlag>
-std::optional<Value> flag(std::string_view content)
+Value flag(std::string_view content)
 {
-    return trimmed(content).empty() ? std::optional<Value>(kFlag) : std::nullopt;
+    return trimmed(content).empty() ? Value(kFlag) : Value();
 }
 
 constexpr struct {

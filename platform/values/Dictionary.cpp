@@ -33,7 +33,7 @@ Value& Dictionary::slot(std::string_view key, std::size_t& position)
     position = find(key);
     if (position == kNotFound) {
         position = _entries.size();
-        _entries.push_back({std::string(key), {}});
+        _entries.emplace_back().key = key;
         if (!_index.empty())
             _index.emplace(key, position);
         else if (_entries.size() > kSearchedDirectly)
