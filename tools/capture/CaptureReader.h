@@ -53,6 +53,8 @@ protected:
         _error = _path + ": " + reason;
         return Status::broken;
     }
+    // For the reason of another.
+    void breakOffAs(const CaptureReader& other) { _error = other._error; }
 
 private:
     std::string _path;

@@ -3,6 +3,7 @@
 #include "DecodeOptions.h"
 #include "OfflineSession.h"
 #include "Progress.h"
+#include "ReadAhead.h"
 #include "Reporting.h"
 #include "SnapshotDocument.h"
 #include "TreeJson.h"
@@ -29,10 +30,17 @@ namespace {
 constexpr int kFailure = 1;
 constexpr int kWrongUsage = 2;
 
-// Feeds the messages of one capture. False, after a line on standard error, when it could not be read whole.
-bool feed(OfflineSession& session, const std::string& path, Progress& progress)
+// Ahead of the decoding, but for jobs, which have other cores busy already.
+std::unique_ptr<CaptureReader> openCapture(const std::string& path, const DecodeOptions& options)
 {
-    const auto reader = CaptureReader::open(path);
+    auto reader = CaptureReader::open(path);
+    return options.jobs > 0 ? std::move(reader) : std::make_unique<ReadAhead>(std::move(reader));
+}
+
+// Feeds the messages of one capture. False, after a line on standard error, when it could not be read whole.
+bool feed(OfflineSession& session, const std::string& path, const DecodeOptions& options, Progress& progress)
+{
+    const auto reader = openCapture(path, options);
     const std::size_t before = session.messageCount();
     CaptureReader::Status status = reader->next();
     for (; status == CaptureReader::Status::message; status = reader->next()) {
@@ -89,7 +97,7 @@ int decodeCaptures(const DecodeOptions& options)
     {
         Progress progress(options.captures);
         for (const std::string& capture : options.captures)
-            isGood = feed(session, capture, progress) && isGood;
+            isGood = feed(session, capture, options, progress) && isGood;
     }
     // What could be read is shown, whatever could not; but nothing at all is no document.
     if (!isGood && session.messageCount() == 0)

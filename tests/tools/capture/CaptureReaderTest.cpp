@@ -1,4 +1,4 @@
-#include "CaptureReader.h"
+#include "ReadAhead.h"
 
 #include "DlfBytes.h"
 #include "PcapFile.h"
@@ -12,9 +12,8 @@ namespace {
 using namespace test;
 
 // The time of the first message, the lengths of all, and how it ended.
-std::string contentOf(const std::string& path)
+std::string contentOf(const std::string& path, std::unique_ptr<CaptureReader> reader)
 {
-    const auto reader = CaptureReader::open(path);
     std::string result;
     auto status = reader->next();
     for (; status == CaptureReader::Status::message; status = reader->next()) {
@@ -27,6 +26,14 @@ std::string contentOf(const std::string& path)
     if (const std::string omissions = reader->omissions(); !omissions.empty())
         result += "; " + omissions;
     return result;
+}
+
+// The same whether it is read ahead or not.
+std::string contentOf(const std::string& path)
+{
+    std::string content = contentOf(path, CaptureReader::open(path));
+    EXPECT_EQ(contentOf(path, std::make_unique<ReadAhead>(CaptureReader::open(path))), content);
+    return content;
 }
 
 TEST(CaptureReader, GivesWhatIsWholeAndSaysWhatIsNot)
@@ -70,6 +77,22 @@ TEST(CaptureReader, GivesWhatIsWholeAndSaysWhatIsNot)
     Bytes message{1}; // a record behind its log type
     EXPECT_EQ(Bytes(reader->message().begin(), reader->message().end()), message += dlfRecord(20, 1));
     EXPECT_EQ(contentOf("/no/such/capture"), "; No such file or directory");
+}
+
+TEST(ReadAhead, KeepsLongCapturesInOrderAndMayBeLeft)
+{
+    PcapFile capture;
+    for (std::size_t i = 0; i < 3'000; ++i)
+        capture.add(Bytes(1 + i % 700, static_cast<std::uint8_t>(i)));
+    const TemporaryFile file;
+    const std::string path = writeFile(file.path, capture.cut(1).bytes());
+    EXPECT_NE(contentOf(path).find("; truncated"), std::string::npos);
+    ReadAhead reader(CaptureReader::open(path));
+    for (std::size_t i = 0; i < 2'000; ++i) {
+        ASSERT_EQ(reader.next(), CaptureReader::Status::message);
+        ASSERT_EQ(Bytes(reader.message().begin(), reader.message().end()),
+            Bytes(1 + i % 700, static_cast<std::uint8_t>(i)));
+    }
 }
 
 } // namespace
