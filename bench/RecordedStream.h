@@ -22,7 +22,7 @@ extern const Technology kTechnologies[kTechnologyCount];
 // The first messages of a technology's drive through koratd's town, mixed as they come. Made once.
 const std::vector<Bytes>& recordedStream(const Technology& technology);
 const std::vector<Bytes>& recordedStream(const char* name);
-// The same without the extra packets, whose property lists are the telephony service's and take libplist's
+// The same without the extra packets, whose property lists are the telephony service's and take most of the
 // time.
 std::vector<Bytes> basebandStream(const Technology& technology);
 
