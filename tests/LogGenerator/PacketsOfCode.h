@@ -1,5 +1,6 @@
 #pragma once
 
+#include "PropertyList.h"
 #include "ScenarioItems.h"
 
 #include "PacketText.h"
@@ -12,7 +13,7 @@
 namespace orvex::test {
 
 // Packets to try on a technology's decoders, by code: the longest ones of a minute's drive, which have
-// lists that are not empty, and for baseband codes two of random bytes.
+// lists that are not empty, property lists in both forms, and for baseband codes two of random bytes.
 class PacketsOfCode {
 public:
     explicit PacketsOfCode(const std::string& technology)
@@ -23,8 +24,9 @@ public:
         for (auto& [code, packets] : _packets) {
             std::ranges::stable_sort(packets, std::greater(), &Bytes::size);
             packets.resize(std::min(packets.size(), kOfDrive));
-            const bool isOfOneLength = code == 0x108A || code == 0x1183; // others are dropped
-            if (code < kExtraCodeBase && !isOfOneLength) {
+            if (code >= kExtraCodeBase) {
+                packets.push_back(inBinaryForm(packets.front()));
+            } else if (std::ranges::find(kOfOneLength, code) == std::end(kOfOneLength)) {
                 for (const std::size_t length : {60U, 1800U})
                     packets.push_back(packet(code, randomBytes(length)));
             }
@@ -35,6 +37,16 @@ public:
 
 private:
     static constexpr std::size_t kOfDrive = 3;
+    static constexpr LogCode kOfOneLength[] = {0x108A, 0x1183}; // others are dropped
+
+    static Bytes inBinaryForm(const Bytes& packet)
+    {
+        const auto list = propertyListFromData(ByteView(packet).subspan(kPacketHeaderLength));
+        Bytes result(packet.begin(), packet.begin() + kPacketHeaderLength);
+        const Bytes binary = propertyListBinary(list.value.value()).value();
+        result.insert(result.end(), binary.begin(), binary.end());
+        return result;
+    }
 
     Bytes randomBytes(std::size_t length)
     {
