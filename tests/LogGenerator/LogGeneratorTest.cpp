@@ -12,6 +12,14 @@ namespace {
 
 class LogGeneratorTest : public GeneratorFixture { };
 
+TEST_F(LogGeneratorTest, NoneIsMadeForATechnologyThatIsNotNamedToTheLetter)
+{
+    for (const Value& unknown :
+        {Value("MRL_LTE "), Value("mrl_lte"), Value("MRL_UTRAN"), Value(""), Value(), Value(1)})
+        EXPECT_EQ(LogGenerator::generatorFromTechnology(unknown, environment()), nullptr);
+    EXPECT_NE(LogGenerator::generatorFromTechnology("MRL_LTE", environment()), nullptr);
+}
+
 // What a generator with this many sections says from its birth to its end.
 template <typename Generator>
 void expectLife(const GeneratorEnvironment& environment, const std::string& name, std::size_t sections)

@@ -139,6 +139,7 @@ TEST(OneXSystemIdentity, ReadsEachFieldFromItsOwnBytes)
     EXPECT_EQ(fixture.shownAfter(packet("02", "01000000", "03000080", 171)),
         "k1xRoamingHome=ON [1], kSystemId=(unknown system type -2147483645), "
         "kNetworkId=(unknown system type -2147483645), kPacketZoneId=200, kProtocolRevision=7");
+    EXPECT_EQ(fixture.textAfter(packet("02", "01000000", "02000000", 185), "kBaseId"), "(absent)");
     EXPECT_EQ(fixture.shownAfter(packet("01", "01000000", "02000000", 186)), "");
     EXPECT_EQ(
         fixture.linesNow(), "<3>Log code 0x134f has version=1; only version 2 or higher expected; dropping.");
@@ -171,6 +172,7 @@ TEST(SubpacketWalk, FindsWithinItsBounds)
             "<3>Log code error in subpkt#1: bad size (65535).<4>Log code 0x119d: missing traffic demod "
             "subpacket."},
         {"119D: EE 00 EE EE 0B EE 1900 01*21", false, missing},
+        {"119D: EE 01 EE EE 05 EE 0400 0B EE 1900 01*21", false, missing},
         {"119D: EE FF EE EE 05 EE 0000 0B EE 1900 01*21", false, missing}, // stays at a size of zero
         {"119D: EE 02 EE EE 05 EE 0400 0B 00 04", false, missing},
         {"119D: EE 01 EE EE 0B EE 1900 01*20", false}, // the error byte is behind the packet
@@ -197,6 +199,10 @@ TEST(TrafficFER, AveragesInSinglePrecision)
     EXPECT_EQ(status(6), "(absent)") << "shown once";
     EXPECT_EQ(frame(0), "0.00%") << "a new average";
 
+    fixture.state.remove("TrafficFER");
+    for (int i = 0; i < 60; ++i)
+        frame(i < 59 ? 1 : 0);
+    EXPECT_EQ(frame(0), "58.64%") << "58.63% in double precision";
     fixture.state.remove("TrafficFER");
     for (const int error : {1, 1, 1, 1, 0, 1})
         frame(error);
