@@ -1,7 +1,7 @@
 #include "BinaryPropertyListReader.h"
 
 #include "PropertyListCount.h"
-#include "PropertyListNode.h"
+#include "PropertyListEpoch.h"
 #include "UTF8.h"
 
 #include "Array.h"

@@ -2,6 +2,7 @@
 
 #include "PropertyList.h"
 
+#include "DecimalPoint.h"
 #include "PropertyListNode.h"
 
 #include <plist/plist.h>

@@ -2,6 +2,8 @@
 
 #include "PropertyList.h"
 
+#include "DecimalPoint.h"
+#include "PropertyListEpoch.h"
 #include "PropertyListNode.h"
 #include "XMLText.h"
 

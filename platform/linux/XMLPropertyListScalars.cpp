@@ -1,6 +1,6 @@
 #include "XMLPropertyListScalars.h"
 
-#include "PropertyListNode.h"
+#include "DecimalPoint.h"
 #include "XMLCharacters.h"
 
 #include <QByteArray>

@@ -1,7 +1,6 @@
 #include "FixedPoint.h"
 
 #include <array>
-#include <charconv>
 #include <cmath>
 #include <cstdint>
 #include <optional>
