@@ -7,6 +7,7 @@ namespace orvex::bench {
 
 // Each file of benchmarks enters its own, under the names by which the table knows them.
 void registerFloors();
+void registerDictionaries();
 void registerDecoding();
 void registerLoggedDecoding();
 void registerRebuilding();

@@ -99,6 +99,10 @@ constexpr Row kRows[] = {
         atLeast(1.0 / 3, {"decode/ifx", kRate})},
     {"— lines that were not dropped", Unit::percent, {"decode+queue/ifx", "kept %"}},
 
+    {"dictionary of 100,000 random keys", Unit::milliseconds, {"dictionary/random", nullptr}},
+    {"— of keys that collide in std::hash", Unit::milliseconds, {"dictionary/chosen", nullptr}, nullptr,
+        atMost(4, {"dictionary/random", nullptr})},
+
     {"rebuild the tree, LTE", Unit::microseconds, {"rebuild/lte", nullptr}},
     {"rebuild the tree, UTRAN", Unit::microseconds, {"rebuild/utran", nullptr}},
     {"rebuild the tree, GSM/UMTS", Unit::microseconds, {"rebuild/gsm", nullptr}},

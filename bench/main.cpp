@@ -47,6 +47,7 @@ int main(int argc, char** argv)
     const QApplication application(argc, argv);
     orvex::installConsole([](std::string_view) {}); // the terminal is the benchmarks'
     registerFloors();
+    registerDictionaries();
     registerDecoding();
     registerLoggedDecoding();
     registerRebuilding();

@@ -14,6 +14,7 @@ endif()
 if(ORVEX_BUILD_FUZZERS)
     # Everything is watched, so that an input counts as new wherever it leads to something new.
     target_compile_options(orvex_build_flags INTERFACE -fsanitize=fuzzer-no-link)
+    target_compile_definitions(orvex_build_flags INTERFACE FUZZING_BUILD_MODE_UNSAFE_FOR_PRODUCTION)
 endif()
 
 # What everybody trusts has its lines counted: the generators and the model.

@@ -1,15 +1,15 @@
 #include "NumberedRows.h"
 
-#include "TextFormat.h"
-
 namespace orvex {
 
 void NumberedRows::add(const std::string& name, const Value& value)
 {
-    int& number = _numbers.try_emplace(name, 1).first->second;
+    Value& last = _numbers.slot(name);
+    std::int64_t number = last.integer() ? *last.integer() : 1;
     std::string free = name;
     while (_rows->contains(free))
-        free = text("%s (%d)", name.c_str(), ++number);
+        free = name + " (" + std::to_string(++number) + ')';
+    last = number;
     _rows->set(free, value);
 }
 

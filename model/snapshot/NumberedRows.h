@@ -3,7 +3,6 @@
 #include "Dictionary.h"
 
 #include <string>
-#include <unordered_map>
 
 namespace orvex {
 
@@ -22,7 +21,7 @@ private:
     DictionaryRef _rows;
     // The last number of each name: a file may hold a name a hundred thousand times, and looking for a free
     // one from 2 on every time would take minutes.
-    std::unordered_map<std::string, int> _numbers;
+    Dictionary _numbers;
 };
 
 } // namespace orvex

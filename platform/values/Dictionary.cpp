@@ -1,6 +1,9 @@
 #include "Dictionary.h"
 
+#include "SipHash.h"
+
 #include <algorithm>
+#include <bit>
 
 namespace orvex {
 
@@ -34,8 +37,8 @@ Value& Dictionary::slot(std::string_view key, std::size_t& position)
     if (position == kNotFound) {
         position = _entries.size();
         _entries.emplace_back().key = key;
-        if (!_index.empty())
-            _index.emplace(key, position);
+        if (_entries.size() * 2 <= _index.size())
+            _index[placeInIndex(key)] = static_cast<std::uint32_t>(position + 1);
         else if (_entries.size() > kSearchedDirectly)
             rebuildIndex();
     }
@@ -80,8 +83,8 @@ bool operator==(const Dictionary& left, const Dictionary& right)
 std::size_t Dictionary::find(std::string_view key) const
 {
     if (!_index.empty()) {
-        const auto found = _index.find(key);
-        return found == _index.end() ? kNotFound : found->second;
+        const std::uint32_t found = _index[placeInIndex(key)];
+        return found == 0 ? kNotFound : found - 1;
     }
     for (std::size_t i = 0; i < _entries.size(); ++i) {
         if (_entries[i].key == key)
@@ -90,13 +93,23 @@ std::size_t Dictionary::find(std::string_view key) const
     return kNotFound;
 }
 
+std::size_t Dictionary::placeInIndex(std::string_view key) const
+{
+    const std::size_t mask = _index.size() - 1;
+    std::size_t place = sipHash(key) & mask;
+    while (_index[place] != 0 && _entries[_index[place] - 1].key != key)
+        place = (place + 1) & mask;
+    return place;
+}
+
 void Dictionary::rebuildIndex()
 {
     _index.clear();
     if (_entries.size() <= kSearchedDirectly)
         return;
+    _index.resize(std::bit_ceil(_entries.size() * 4));
     for (std::size_t i = 0; i < _entries.size(); ++i)
-        _index.emplace(_entries[i].key, i);
+        _index[placeInIndex(_entries[i].key)] = static_cast<std::uint32_t>(i + 1);
 }
 
 } // namespace orvex

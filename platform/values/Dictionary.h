@@ -2,9 +2,9 @@
 
 #include "Value.h"
 
+#include <cstdint>
 #include <initializer_list>
 #include <string_view>
-#include <unordered_map>
 #include <utility>
 
 namespace orvex {
@@ -13,7 +13,8 @@ namespace orvex {
 // accident. Keys keep the order in which they were first set; setting a key again keeps its place, removing
 // and setting it moves it to the end.
 //
-// Small dictionaries, the rows of a screen, are searched directly; large ones get an index.
+// Small dictionaries, the rows of a screen, are searched directly; large ones get an index, whose hash is
+// keyed so that nobody who chooses the keys of a property list can make its look-up slow.
 class Dictionary {
 public:
     struct Entry {
@@ -66,16 +67,15 @@ private:
     static constexpr std::size_t kNotFound = static_cast<std::size_t>(-1);
     static constexpr std::size_t kSearchedDirectly = 24;
 
-    struct KeyHash : std::hash<std::string_view> {
-        using is_transparent = void;
-    };
-    using Index = std::unordered_map<std::string, std::size_t, KeyHash, std::equal_to<>>;
-
     std::size_t find(std::string_view key) const;
+    // The place in the index that is the key's, or free for it.
+    std::size_t placeInIndex(std::string_view key) const;
     void rebuildIndex();
 
     std::vector<Entry> _entries;
-    Index _index; // empty while the dictionary is small
+    // Open addressing, its size a power of two: each place holds a position in _entries plus one, or zero
+    // when it is free. Empty while the dictionary is small.
+    std::vector<std::uint32_t> _index;
 };
 
 } // namespace orvex

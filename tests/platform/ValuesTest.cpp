@@ -1,5 +1,6 @@
 #include "Array.h"
 #include "Dictionary.h"
+#include "SipHash.h"
 #include "TextFormat.h"
 
 #include <gtest/gtest.h>
@@ -48,6 +49,24 @@ TEST(Dictionary, LargeOnesFindRemoveAndCopyLikeSmallOnes)
         }
         EXPECT_TRUE(keysOf(dictionary).ends_with(" key 3 "));
     }
+}
+
+// The reference's own vectors: the bytes 0, 1, 2, ... under the key 0, 1, ... 15.
+TEST(SipHash, IsTheOneThatWasPublished)
+{
+    std::string text;
+    for (char i = 0; i < 15; ++i)
+        text += i;
+    const struct {
+        std::size_t length;
+        std::uint64_t hash;
+    } cases[] = {{0, 0x726FDB47DD0E0E31}, {1, 0x74F839C593DC67FD}, {8, 0x93F5F5799A932462},
+        {15, 0xA129CA6149BE45E5}};
+    for (const auto& [length, hash] : cases)
+        EXPECT_EQ(sipHash(std::string_view(text).substr(0, length), {0x0706050403020100, 0x0F0E0D0C0B0A0908}),
+            hash)
+            << length;
+    EXPECT_NE(sipHash(text), sipHash(text, {0, 0})) << "without a key of its own";
 }
 
 TEST(Value, ContainersAreSharedAndShallowCopiesShareWhatTheyHold)
