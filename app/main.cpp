@@ -24,6 +24,7 @@
 
 #include "Console.h"
 #include "SystemLog.h"
+#include "VisibleText.h"
 
 #include <QApplication>
 
@@ -175,7 +176,7 @@ int showSnapshot(int argc, char** argv, const CommandLine& commandLine)
     const std::string& path = *commandLine.snapshot;
     const auto [snapshot, error] = readSnapshot(path);
     if (!snapshot) {
-        std::fprintf(stderr, "orvex: %s\n", error.c_str());
+        std::fprintf(stderr, "orvex: %s\n", visibleText(error).c_str());
         return kExitFailure;
     }
     if (commandLine.action == CommandLine::Action::console) {

@@ -5,6 +5,7 @@
 #include "TelephonyConstants.h"
 
 #include "Dictionary.h"
+#include "VisibleText.h"
 
 #include <cerrno>
 #include <limits>
@@ -20,7 +21,7 @@ constexpr auto kReceiveTimeout = 1s;
 
 TelephonyConnection::LogChannelReply failure(int error, const std::string& why)
 {
-    systemLog(Priority::error, "Telephony service: %s", why.c_str());
+    systemLog(Priority::error, "Telephony service: %s", visibleText(why).c_str());
     return {0, error, std::nullopt};
 }
 

@@ -1,6 +1,7 @@
 #include "PortDirectory.h"
 
 #include "SystemLog.h"
+#include "VisibleText.h"
 
 #include <cerrno>
 #include <cstdlib>
@@ -91,15 +92,16 @@ bool PortDirectory::isUsable() const
 
 std::optional<std::string> PortDirectory::socketPath(const std::string& portName) const
 {
-    if (portName.empty() || portName == "." || portName == ".."
-        || portName.find_first_of(std::string_view("/\0", 2)) != std::string::npos) {
-        systemLog(Priority::error, "\"%s\" cannot be the name of a message port", portName.c_str());
+    const std::string shown = visibleText(portName);
+    if (portName.empty() || portName == "." || portName == ".." || portName.find('/') != std::string::npos
+        || shown != portName) { // what goes into the log as an escape is no name either
+        systemLog(Priority::error, "\"%s\" cannot be the name of a message port", shown.c_str());
         return std::nullopt;
     }
     auto path = _path + '/' + portName;
     if (path.size() >= sizeof(sockaddr_un::sun_path)) {
         systemLog(Priority::error, "Message port %s: the path is too long for a socket: %s", portName.c_str(),
-            path.c_str());
+            visibleText(path).c_str());
         return std::nullopt;
     }
     return path;

@@ -2,6 +2,7 @@
 #include "Dictionary.h"
 #include "SipHash.h"
 #include "TextFormat.h"
+#include "VisibleText.h"
 
 #include <gtest/gtest.h>
 
@@ -60,13 +61,30 @@ TEST(SipHash, IsTheOneThatWasPublished)
     const struct {
         std::size_t length;
         std::uint64_t hash;
-    } cases[] = {{0, 0x726FDB47DD0E0E31}, {1, 0x74F839C593DC67FD}, {8, 0x93F5F5799A932462},
-        {15, 0xA129CA6149BE45E5}};
+    } cases[] = {
+        {0, 0x726FDB47DD0E0E31}, {1, 0x74F839C593DC67FD}, {8, 0x93F5F5799A932462}, {15, 0xA129CA6149BE45E5}};
     for (const auto& [length, hash] : cases)
-        EXPECT_EQ(sipHash(std::string_view(text).substr(0, length), {0x0706050403020100, 0x0F0E0D0C0B0A0908}),
-            hash)
+        EXPECT_EQ(
+            sipHash(std::string_view(text).substr(0, length), {0x0706050403020100, 0x0F0E0D0C0B0A0908}), hash)
             << length;
     EXPECT_NE(sipHash(text), sipHash(text, {0, 0})) << "without a key of its own";
+}
+
+TEST(VisibleText, ShowsWhatWouldCommandATerminal)
+{
+    const std::string kLong(4093, 'x');
+    const std::pair<std::string, std::string> cases[] = {
+        {"plain \xc3\xa9 \\n", "plain \xc3\xa9 \\n"},
+        {"a\nb\tc\r", "a\\nb\\tc\\x0d"},
+        {"\x1b[2J\x7f", "\\x1b[2J\\x7f"},
+        {"\xc2\x85\xc2\x9b\xc2\xa0", "\\x85\\x9b\xc2\xa0"},                // C1, and the character after it
+        {"\xe2\x80\xae\xe2\x81\xa6\xe2\x80\xa8", "\\u202e\\u2066\\u2028"}, // direction, end of line
+        {"\xc2 \x9b\xe2\x80", "\\xc2 \\x9b\\xe2\\x80"},                    // no UTF-8
+        {kLong + "\xe2\x82\xac", kLong + "\xe2\x82\xac"},
+        {kLong + "x\xe2\x82\xac", kLong + "x\xe2\x80\xa6"},
+    };
+    for (const auto& [given, shown] : cases)
+        EXPECT_EQ(visibleText(given), shown);
 }
 
 TEST(Value, ContainersAreSharedAndShallowCopiesShareWhatTheyHold)

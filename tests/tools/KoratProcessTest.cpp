@@ -17,6 +17,7 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::Key;
+using testing::Not;
 
 TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
 {
@@ -101,6 +102,26 @@ TEST(KoratProcess, ServesOneClientAtATime)
     ASSERT_EQ(second.open(), 0);
     EXPECT_EQ(second.technology(), Value("MRL_LTE"));
     EXPECT_TRUE(korat.waitForError("org.orvex.Test.Client has left; sent 1 messages"));
+}
+
+TEST(KoratProcess, RefusesChannelsToItselfAndToNamesThatAreNone)
+{
+    const ProgramFolder folder;
+    KoratProgram korat(folder);
+    const std::pair<std::string, long> cases[] = {
+        {"org.orvex.Korat", EINVAL},
+        {"org.orvex.Korat.LogChannel.1", EINVAL},
+        {"", ENOENT},
+        {"..", ENOENT},
+        {"../elsewhere", ENOENT},
+        {std::string(200, 'x'), ENOENT},
+        {"\x1b[2J", ENOENT},
+    };
+    for (const auto& [name, error] : cases)
+        EXPECT_EQ(KoratClient(folder.ports(), name).open(), error) << name;
+    EXPECT_EQ(KoratClient(folder.ports()).open(), 0);
+    korat.terminateAndCount();
+    EXPECT_THAT(korat.errors(), Not(HasSubstr("\x1b")));
 }
 
 TEST(KoratProcess, ASecondServiceFindsThePlaceTakenAndLeavesTheRecordingAlone)

@@ -1,5 +1,7 @@
 #include "Reporting.h"
 
+#include "VisibleText.h"
+
 #include <cerrno>
 #include <cstring>
 #include <fstream>
@@ -9,7 +11,7 @@ namespace orvex {
 
 bool complain(const std::string& message)
 {
-    std::cerr << "orvex-decode: " << message << '\n';
+    std::cerr << "orvex-decode: " << visibleText(message) << '\n';
     return false;
 }
 

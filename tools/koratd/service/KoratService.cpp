@@ -106,6 +106,10 @@ Bytes KoratService::openChannel(const std::string& clientPortName)
         return channelReply(*_options.faults.refuseChannel);
     if (_options.faults.nullPort)
         return channelReply(0);
+    if (clientPortName == telephony::kServicePortName || clientPortName.starts_with(kChannelPortPrefix)) {
+        report("refused %s: it is a port of this service", clientPortName.c_str());
+        return channelReply(EINVAL);
+    }
     // It may have gone since the last look.
     if (_channel && !_channel->isClientThere())
         closeChannel();
