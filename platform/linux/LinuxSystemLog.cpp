@@ -25,10 +25,15 @@ void writeToStandardError(const QueuedSystemLog::Lines& lines)
 void writeToSyslog(const QueuedSystemLog::Lines& lines)
 {
     constexpr std::size_t kLongest = std::numeric_limits<int>::max();
-    for (const auto& line : lines) {
-        // Bits beyond those of a severity name a facility there, and are meant to.
-        syslog(static_cast<int>(line.priority), "%.*s",
-            static_cast<int>(std::min(line.text.size(), kLongest)), line.text.data());
+    for (const auto& [priority, text] : lines) {
+        const int value = static_cast<int>(priority);
+        const int length = static_cast<int>(std::min(text.size(), kLongest));
+        // Bits beyond a severity would name a facility and leave severity 0, an emergency, which daemons
+        // print on every terminal.
+        if (value > LOG_PRIMASK)
+            syslog(LOG_ERR, "<%d>%.*s", value, length, text.data());
+        else
+            syslog(value, "%.*s", length, text.data());
     }
 }
 } // namespace

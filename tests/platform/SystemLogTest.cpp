@@ -43,7 +43,7 @@ void writeTo(const char* destination, const std::function<void(SystemLog&)>& wri
     _exit(0);
 }
 
-TEST(LinuxSystemLogDeathTest, SyslogGetsThePriorityAsItIsAndStandardErrorGetsLines)
+TEST(LinuxSystemLogDeathTest, SyslogGetsItsOwnPrioritiesAndStandardErrorGetsLines)
 {
     const auto write = [](SystemLog& log) {
         log.write(Priority::error, "one");
@@ -51,7 +51,7 @@ TEST(LinuxSystemLogDeathTest, SyslogGetsThePriorityAsItIsAndStandardErrorGetsLin
         log.write(Priority::notice, "");
     };
     const testing::ExitedWithCode well(0);
-    EXPECT_EXIT(writeTo(nullptr, write), well, "^syslog 3 onesyslog 16 100% %s\nsyslog 5 $");
+    EXPECT_EXIT(writeTo(nullptr, write), well, "^syslog 3 onesyslog 3 <16>100% %s\nsyslog 5 $");
     EXPECT_EXIT(writeTo("stderr", write), well, "^<3>one\n<16>100% %s\n<5>\n$");
 }
 
