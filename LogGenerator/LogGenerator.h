@@ -47,6 +47,10 @@ public:
     // What a snapshot stores: an array of dictionaries, each with a "Description".
     virtual ArrayRef getSaveContentsFromState(const Dictionary& state) const = 0;
 
+    // Why the state has no display and cannot get one: which template, and what is wrong with it, in one
+    // line. Empty when all is well. Nothing is logged.
+    virtual std::string templateError(const Dictionary& /*state*/) const { return {}; }
+
 protected:
     // Marks the construction of a generator on which no set-up runs, not even the log line of its birth.
     struct NeverSetUp { };

@@ -72,6 +72,11 @@ Value MRLLogGenerator2::generateLogUsingState(Dictionary& state)
     return display;
 }
 
+std::string MRLLogGenerator2::templateError(const Dictionary& state) const
+{
+    return _template.errorIn(state, environment().resources);
+}
+
 Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
 {
     const DictionaryRef display = state["Display"].dictionary();

@@ -31,6 +31,7 @@ public:
     DictionaryRef getStartCommand() const override;
     void updateState(Dictionary& state, ByteView data) override;
     Value generateLogUsingState(Dictionary& state) override;
+    std::string templateError(const Dictionary& state) const override;
 
     // Frames one message and routes it:
     //
@@ -54,6 +55,7 @@ protected:
         : MRLLogGenerator(environment, tag)
     {
     }
+    bool isSetUp() const { return _cIndex != nullptr; }
 
 private:
     void printDict(const Value& object) const;

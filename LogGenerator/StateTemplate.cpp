@@ -16,12 +16,17 @@ DictionaryRef StateTemplate::in(const Dictionary& state) const
 
 DictionaryRef StateTemplate::loadInto(Dictionary& state, const Resources& resources) const
 {
-    auto skeleton = _name.empty() ? nullptr : resources.dictionaryNamed(_name);
+    auto skeleton = _name.empty() ? nullptr : resources.dictionaryNamed(_name).dictionary;
     if (skeleton) {
         state.set(kTemplate, skeleton);
         state.set(kTemplateName, _name);
     }
     return skeleton;
+}
+
+std::string StateTemplate::errorIn(const Dictionary& state, const Resources& resources) const
+{
+    return in(state) ? "" : resources.dictionaryNamed(_name).error;
 }
 
 void StateTemplate::removeFrom(Dictionary& state)

@@ -23,6 +23,9 @@ public:
     // The template of the resource, put into the state. Null, and the state as it was, when there is none.
     DictionaryRef loadInto(Dictionary& state, const Resources& resources) const;
 
+    // Why there would be none, in one line; empty when the state has it or it can be loaded.
+    std::string errorIn(const Dictionary& state, const Resources& resources) const;
+
     // For a display that was laid out from no template.
     static void removeFrom(Dictionary& state);
 

@@ -110,16 +110,15 @@ void OrvexApp::showSaveView()
 {
     if (!_window || saveViewController())
         return;
-    const auto& [runLoop, ports, telephony, generators] = _platform.session;
     // In a later turn: the screen must not go inside the action of its own button.
-    auto close = [&runLoop = runLoop, app = weak_from_this()] {
+    auto close = [&runLoop = _platform.session.runLoop, app = weak_from_this()] {
         runLoop.post([app] {
             if (const auto self = app.lock())
                 self->closeSaveView();
         });
     };
     _window->presentModally(std::make_unique<OrvexSaveViewController>(_model->getSaveContents(),
-                                generators.clock, reportDirectory(), std::move(close)),
+                                _platform.session.generators.clock, reportDirectory(), std::move(close)),
         true);
 }
 

@@ -45,6 +45,11 @@ using namespace orvex;
 constexpr int kExitFailure = 1;
 constexpr int kExitWrongUsage = 2;
 
+void complain(const std::string& why)
+{
+    std::fprintf(stderr, "orvex: %s\n", visibleText(why).c_str());
+}
+
 // The platform's implementations, in the order in which they need each other.
 struct LinuxPlatform {
     explicit LinuxPlatform(const std::string& resourceDirectory)
@@ -57,7 +62,8 @@ struct LinuxPlatform {
         return {.session = {.runLoop = runLoop,
                     .ports = ports,
                     .telephony = telephony,
-                    .generators = {.resources = resources, .clock = clock, .buildVersion = ORVEX_VERSION}},
+                    .generators = {.resources = resources, .clock = clock, .buildVersion = ORVEX_VERSION},
+                    .complain = complain},
             .preferences = preferences};
     }
 
@@ -71,7 +77,7 @@ struct LinuxPlatform {
 
 void complainOfNoDisplay()
 {
-    std::fputs("orvex: There is no display to connect to. Try 'orvex --console'.\n", stderr);
+    complain("There is no display to connect to. Try 'orvex --console'.");
 }
 
 bool displayIsNamed()
@@ -176,7 +182,7 @@ int showSnapshot(int argc, char** argv, const CommandLine& commandLine)
     const std::string& path = *commandLine.snapshot;
     const auto [snapshot, error] = readSnapshot(path);
     if (!snapshot) {
-        std::fprintf(stderr, "orvex: %s\n", visibleText(error).c_str());
+        complain(error);
         return kExitFailure;
     }
     if (commandLine.action == CommandLine::Action::console) {

@@ -48,7 +48,7 @@ DictionaryRef ownTemplate(const std::string& technology)
     static std::map<std::string, DictionaryRef> known;
     const auto [entry, isNew] = known.try_emplace(technology);
     if (const char* name = templateName(technology); name && isNew)
-        entry->second = FileResources(ORVEX_RESOURCES).dictionaryNamed(name);
+        entry->second = FileResources(ORVEX_RESOURCES).dictionaryNamed(name).dictionary;
     return entry->second;
 }
 

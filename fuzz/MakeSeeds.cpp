@@ -212,7 +212,8 @@ private:
         const FileResources resources(ORVEX_RESOURCES);
         for (std::size_t i = 0; i < std::size(kTemplates); ++i) {
             Messages messages = firstMessages(kTechnologies[i].identifier, 3);
-            const Bytes list = propertyListBinary(resources.dictionaryNamed(kTemplates[i])).value();
+            const Bytes list =
+                propertyListBinary(resources.dictionaryNamed(kTemplates[i]).dictionary).value();
             messages.insert(messages.begin(), list);
             Bytes input = InputMessages::inputOf(messages);
             input.insert(input.begin(), static_cast<std::uint8_t>(i));

@@ -38,6 +38,12 @@ constexpr Decoder kDecoders[] = {
     {0x134F, &OneXSystemIdentity::decode},
 };
 
+const StateTemplate& ownTemplate()
+{
+    static const StateTemplate kTemplate("C2KTemplate");
+    return kTemplate;
+}
+
 } // namespace
 
 std::unique_ptr<LogGenerator> C2KLogGenerator::generator(const GeneratorEnvironment& environment)
@@ -68,6 +74,11 @@ Value C2KLogGenerator::generateLogUsingState(Dictionary& state)
     return display;
 }
 
+std::string C2KLogGenerator::templateError(const Dictionary& state) const
+{
+    return ownTemplate().errorIn(state, environment().resources);
+}
+
 void C2KLogGenerator::processTemplate(
     const Dictionary& skeleton, const DictionaryRef& storeDisplayIntoDict, Dictionary& storeLookupIntoDict)
 {
@@ -89,13 +100,12 @@ void C2KLogGenerator::processTemplate(
 
 DictionaryRef C2KLogGenerator::getDisplayFromState(Dictionary& state, const Resources& resources)
 {
-    static const StateTemplate kTemplate("C2KTemplate");
-    auto skeleton = kTemplate.in(state);
+    auto skeleton = ownTemplate().in(state);
     auto display = state["Display"].dictionary();
     if (display && skeleton)
         return display;
     if (!skeleton)
-        skeleton = kTemplate.loadInto(state, resources);
+        skeleton = ownTemplate().loadInto(state, resources);
     if (!skeleton) {
         systemLog(Priority::error, "Cannot load C2K template for display");
         return nullptr;

@@ -18,6 +18,7 @@ public:
     DictionaryRef getStartCommand() const override;
     void updateState(Dictionary& state, ByteView data) override;
     Value generateLogUsingState(Dictionary& state) override;
+    std::string templateError(const Dictionary& state) const override;
 
     // Lays out the display of a template: dictionaries become sections, the text "_sorted" stays, any other
     // text becomes an empty row that shows the internal key it names. Other values make no row.

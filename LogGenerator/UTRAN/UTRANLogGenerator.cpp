@@ -42,4 +42,11 @@ UTRANLogGenerator::UTRANLogGenerator(const GeneratorEnvironment& environment, Ne
 {
 }
 
+std::string UTRANLogGenerator::templateError(const Dictionary& state) const
+{
+    // Without any resource that would do, the one that is installed is what the user misses.
+    return isSetUp() ? MRLLogGenerator2::templateError(state)
+                     : environment().resources.dictionaryNamed("MRL_UTRAN2").error;
+}
+
 } // namespace orvex

@@ -10,6 +10,7 @@ namespace orvex {
 class UTRANLogGenerator final : public MRLLogGenerator2 {
 public:
     static std::unique_ptr<LogGenerator> generator(const GeneratorEnvironment& environment);
+    std::string templateError(const Dictionary& state) const override;
 
 private:
     UTRANLogGenerator(const GeneratorEnvironment& environment, const std::string& templateName);

@@ -159,6 +159,9 @@ void OrvexModel::startMonitor()
         const auto self = shared_from_this();
         refresh();
     });
+    const std::string error = _logGenerator->templateError(*_state);
+    if (!error.empty() && _platform.complain)
+        _platform.complain(error);
 }
 
 bool OrvexModel::sendStartCommand()

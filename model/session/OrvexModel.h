@@ -8,6 +8,7 @@
 #include "TelephonyService.h"
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 
 namespace orvex {
@@ -32,6 +33,8 @@ public:
         MessagePorts& ports;
         TelephonyService& telephony;
         GeneratorEnvironment generators;
+        // Told at each start of a session that can show nothing, in one line: which template, and why.
+        std::function<void(const std::string& why)> complain = {};
     };
 
     static std::shared_ptr<OrvexModel> create(const Platform& platform);

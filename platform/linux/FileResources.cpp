@@ -1,7 +1,6 @@
 #include "FileResources.h"
 
 #include "PropertyList.h"
-#include "SystemLog.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -23,10 +22,9 @@ bool isInside(const fs::path& path, const fs::path& directory)
     return inDirectory == directory.end();
 }
 
-DictionaryRef refuse(const std::string& path, const std::string& why)
+DictionaryResult refuse(const std::string& path, const std::string& why)
 {
-    systemLog(Priority::error, "Resource %s: %s", path.c_str(), why.c_str());
-    return nullptr;
+    return {nullptr, path + ": " + why};
 }
 } // namespace
 
@@ -54,15 +52,13 @@ std::vector<std::string> FileResources::propertyListPaths() const
         if (entry->path().extension() == ".plist")
             paths.push_back(entry->path().filename().string());
     }
-    if (error)
-        systemLog(Priority::error, "Resources %s: %s", _directory.c_str(), error.message().c_str());
     std::sort(paths.begin(), paths.end());
     return paths;
 }
 
-DictionaryRef FileResources::dictionaryNamed(const std::string& baseName) const
+DictionaryResult FileResources::dictionaryNamed(const std::string& baseName) const
 {
-    const std::string path = _directory + '/' + baseName + ".plist";
+    const std::string path = fs::path(_directory) / (baseName + ".plist");
     std::error_code error;
     if (fs::is_directory(path, error))
         return refuse(path, "it is a directory");
@@ -73,10 +69,9 @@ DictionaryRef FileResources::dictionaryNamed(const std::string& baseName) const
     const auto list = propertyListFromData(data);
     if (!list.value)
         return refuse(path, list.error);
-    const auto dictionary = list.value->dictionary();
-    return dictionary
-        ? dictionary
-        : refuse(path, std::string("it holds no dictionary but: ") + nameOf(list.value->kind()));
+    if (auto dictionary = list.value->dictionary())
+        return {std::move(dictionary), {}};
+    return refuse(path, std::string("it holds no dictionary but: ") + nameOf(list.value->kind()));
 }
 
 } // namespace orvex

@@ -19,7 +19,7 @@ public:
     static std::string defaultDirectory();
 
     std::vector<std::string> propertyListPaths() const override;
-    DictionaryRef dictionaryNamed(const std::string& baseName) const override;
+    DictionaryResult dictionaryNamed(const std::string& baseName) const override;
 
 private:
     std::string _directory;

@@ -127,7 +127,7 @@ TEST(SectionPlan, ClassIndexAndTemplateNameTheSameSections)
     for (const auto& [templateName, index, plan] : technologies()) {
         std::multiset<std::string> laidOut;
         const FileResources resources(ORVEX_SOURCE_DIR "/resources");
-        collectSections(*index, *resources.dictionaryNamed(templateName), laidOut);
+        collectSections(*index, *resources.dictionaryNamed(templateName).dictionary, laidOut);
         std::multiset<std::string> planned;
         std::map<LogCode, std::vector<const Base*>> wanted;
         for (const auto& [name, packets, entryLine, otherCodes] : plan) {

@@ -32,7 +32,8 @@ public:
 
     std::shared_ptr<OrvexModel> newModel()
     {
-        auto result = OrvexModel::create({runLoop, telephony, telephony, {resources, clock, "1.0"}});
+        auto result = OrvexModel::create({runLoop, telephony, telephony, {resources, clock, "1.0"},
+            [this](const std::string& why) { complaints.push_back(why); }});
         result->setListener(this);
         return result;
     }
@@ -50,6 +51,7 @@ public:
     FixedClock clock;
     std::shared_ptr<OrvexModel> model;
     int updates = 0;
+    std::vector<std::string> complaints;
 };
 
 TEST_F(OrvexModelTest, StartsTheStreamAndFollowsIt)
@@ -197,6 +199,27 @@ TEST_F(OrvexModelTest, InvalidatedLocalPortRestartsAtOnceAndDeliberateShutdownNo
     EXPECT_EQ(telephony.localPortsCreated, 2);
     EXPECT_EQ(runLoop.timerCount(), 0U);
     EXPECT_THAT(log.lines, Not(Contains(testing::HasSubstr("INVALIDATED"))));
+}
+
+TEST_F(OrvexModelTest, MissingTemplateIsComplainedOfAtEachStartAndLoggedForEachMessage)
+{
+    const std::string line = "<3>Cannot load template for display";
+    const auto laidOut = resources.templates.extract("LTE");
+    model->restartMonitor();
+    model->restartMonitor();
+    EXPECT_THAT(complaints, ElementsAre("LTE.plist: missing", "LTE.plist: missing"));
+    log.take();
+    telephony.deliver(kAntennaPacket);
+    telephony.deliver(kAntennaPacket);
+    EXPECT_THAT(log.take(), testing::IsSupersetOf({line, line}));
+    EXPECT_EQ(complaints.size(), 2U);
+
+    resources.templates["LTE"] = laidOut.mapped();
+    telephony.deliver(kAntennaPacket);
+    EXPECT_THAT(log.take(), Not(Contains(line)));
+    resources.templates.clear(); // the state keeps what it needs
+    model->restartMonitor();
+    EXPECT_EQ(complaints.size(), 2U);
 }
 
 TEST_F(OrvexModelTest, WithoutAGeneratorAMessageIsDroppedButCountsAsNews)

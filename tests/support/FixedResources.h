@@ -18,10 +18,12 @@ public:
             paths.push_back(name + ".plist");
         return paths;
     }
-    DictionaryRef dictionaryNamed(const std::string& baseName) const override
+    DictionaryResult dictionaryNamed(const std::string& baseName) const override
     {
         const auto found = templates.find(baseName);
-        return found == templates.end() ? nullptr : found->second;
+        if (found == templates.end())
+            return {nullptr, baseName + ".plist: missing"};
+        return {found->second, {}};
     }
 
     std::map<std::string, DictionaryRef> templates;

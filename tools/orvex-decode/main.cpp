@@ -81,6 +81,13 @@ struct Platform {
     SystemClock clock;
 };
 
+// False, after a line on standard error, when there is no template to lay the display out.
+bool hasTemplate(const LogGenerator& generator)
+{
+    const std::string error = generator.templateError({});
+    return error.empty() || complain(error);
+}
+
 bool save(const OfflineSession& session, Date begun, const DecodeOptions& options)
 {
     const Snapshot snapshot{dateText(begun), session.saveContents(), options.description};
@@ -92,8 +99,9 @@ int decodeCaptures(const DecodeOptions& options)
 {
     const Platform platform(options);
     const Date begun = platform.clock.now();
-    OfflineSession session(platform.generatorFor(options.technology), options.refreshEvery);
-    bool isGood = true;
+    auto generator = platform.generatorFor(options.technology);
+    bool isGood = hasTemplate(*generator);
+    OfflineSession session(std::move(generator), options.refreshEvery);
     {
         Progress progress(options.captures);
         for (const std::string& capture : options.captures)
@@ -130,8 +138,11 @@ int showSnapshots(const DecodeOptions& options)
             continue;
         }
         SnapshotDocument document(*snapshot);
-        if (!options.technology.empty())
-            document.decodeAnew(platform.generatorFor(options.technology));
+        if (!options.technology.empty()) {
+            auto generator = platform.generatorFor(options.technology);
+            isGood = hasTemplate(*generator) && isGood;
+            document.decodeAnew(std::move(generator));
+        }
         for (const std::string& omission : document.omissions())
             complain(text("%s: %s", path.c_str(), omission.c_str()));
         if (options.dlfFile)

@@ -135,6 +135,7 @@ TEST_F(C2KLogGeneratorTest, MissingTemplateIsTriedAgainAtEveryCall)
     RecordingLog log;
     generator->updateState(state, identity(7));
     EXPECT_TRUE(state.isEmpty());
+    EXPECT_EQ(generator->templateError(state), "C2KTemplate.plist: missing");
     EXPECT_TRUE(generator->generateLogUsingState(state).isNull());
     EXPECT_EQ(log.take(), Lines(2, "<3>Cannot load C2K template for display"));
     EXPECT_EQ(keptMessages(), identity(7));

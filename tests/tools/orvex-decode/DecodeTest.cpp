@@ -105,10 +105,13 @@ TEST_F(DecodeTest, WritesDocumentAndLogIntoFiles)
 TEST_F(DecodeTest, AsksForTheDisplayAsOftenAsItIsTold)
 {
     const Bytes five = PcapFile().add({1}).add({1}).add({1}).add({1}).add({1}).bytes();
-    // Without a template every request says so once, and every message does.
+    // Without a template every request and every message logs so once, and nothing else says why.
     const auto failures = [&](const char* messages) {
-        decode({"--log", name("log"), "--technology", "MRL_LTE", "--resources", name(""), "--refresh-every",
-            messages, write("five.pcap", five)});
+        const Result result = decode({"--log", name("log"), "--technology", "MRL_LTE", "--resources",
+            name("none"), "--refresh-every", messages, write("five.pcap", five)});
+        EXPECT_EQ(result.status, 1);
+        EXPECT_EQ(result.errors, "orvex-decode: " + path("none/LTE.plist") + ": No such file or directory\n");
+        EXPECT_EQ(contentsOf(path("log")).find("No such"), std::string::npos);
         return QString::fromStdString(contentsOf(path("log"))).count("Cannot load template");
     };
     EXPECT_EQ(failures("6"), 5 + 1);
