@@ -36,7 +36,7 @@ public:
     // Binds the section to its container.
     void updateSectionRef(const Value& container);
 
-    // Published arrays change only through these two and fillList() below, which take the array lock.
+    // Arrays bound to sections change only through these two and refillSection(), which take the array lock.
     static void clearElementsInArray(Array& array);
     static void replaceArray(Array& array, const Array& with);
 
@@ -60,35 +60,36 @@ protected:
     template <typename Filler>
     void fillSection(Filler fill) const
     {
-        fillList(array(), fill);
+        const ArrayLockScope lock;
+        RowList list(array());
+        fill(list);
     }
     // The same with one row dictionary a record, written by print(Rows&, record).
     template <typename Records, typename Printer>
     void refillSection(const Records& records, Printer print) const
     {
-        refill(array(), records, print);
+        fillSection([&](RowList& list) { printRecords(list, records, print); });
     }
-    // Both with a list that is a row, say.
-    template <typename Filler>
-    static void fillList(Array* array, Filler fill)
-    {
-        const ArrayLockScope lock;
-        RowList list(array);
-        fill(list);
-    }
+    // A new array of such dictionaries, to be set as a row.
     template <typename Records, typename Printer>
-    static void refill(Array* list, const Records& records, Printer print)
+    static ArrayRef listOf(const Records& records, Printer print)
     {
-        fillList(list, [&](RowList& rows) {
-            for (const auto& record : records)
-                print(rows.next(), record);
-        });
+        auto result = Array::make();
+        RowList list(result.get());
+        printRecords(list, records, print);
+        return result;
     }
 
     // "Received an unknown log message: %d"
     static void reportUnknown(LogCode logCode);
 
 private:
+    template <typename Records, typename Printer>
+    static void printRecords(RowList& list, const Records& records, Printer print)
+    {
+        for (const auto& record : records)
+            print(list.next(), record);
+    }
     void updateLogCodeDict(CodeDictionary& codeDict);
 
     std::string _sectionName;

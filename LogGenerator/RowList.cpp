@@ -14,12 +14,6 @@ Rows& RowList::next()
     return _row;
 }
 
-void RowList::append(LateText text)
-{
-    if (_list)
-        nextElement().set(text);
-}
-
 Value& RowList::nextElement()
 {
     return _count < _list->size() ? _list->slot(_count++) : (++_count, _list->appendSlot());

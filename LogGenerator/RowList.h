@@ -25,8 +25,6 @@ public:
 
     // The rows of the next record, to be written until the next call.
     Rows& next();
-    // A record that is a text alone.
-    void append(LateText text);
 
 private:
     Value& nextElement();

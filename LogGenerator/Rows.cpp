@@ -1,7 +1,5 @@
 #include "Rows.h"
 
-#include "Array.h"
-
 namespace orvex {
 
 Value& Rows::slotElsewhere(std::string_view name)
@@ -13,16 +11,6 @@ Value& Rows::slotElsewhere(std::string_view name)
     Value& value = _dictionary->slot(name, position);
     _next = _isWrittenAnew ? _dictionary->size() : position + 1; // it may be a row that was set already
     return value;
-}
-
-Array* Rows::list(std::string_view name)
-{
-    if (!_dictionary)
-        return nullptr;
-    Value& value = slot(name);
-    if (!value.ownArray())
-        value = Array::make();
-    return value.ownArray();
 }
 
 void Rows::remove(std::string_view name)

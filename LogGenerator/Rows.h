@@ -42,9 +42,6 @@ public:
         if (_dictionary)
             slot(name).set(LateText(format, arguments...));
     }
-    // An array as a row: the one that is there when no one else holds it, else a new one. A writer over
-    // nothing has none.
-    Array* list(std::string_view name);
     void remove(std::string_view name);
 
     void end()

@@ -22,7 +22,7 @@ void BLER::update(const LogCode_0x4116& report)
 {
     Rows row = rows();
     row.print("Window Size", "%d", report.windowSize());
-    refill(row.list("Transport Channels"), report.transportChannels(), printRecord);
+    row.set("Transport Channels", listOf(report.transportChannels(), printRecord));
 }
 
 } // namespace orvex

@@ -31,9 +31,9 @@ void HSDPAInformation::update(const LogCode_0x4221& report)
     row.print("Sub Frames", "%u", report.subframes());
     row.set("Carrier Info", textFor(report.carrierConfiguration(), kCarrierConfigurations, ""));
     if (report.primaryProcesses().count() > 0)
-        refill(row.list("Primary HARQ Process"), report.primaryProcesses(), printRecord);
+        row.set("Primary HARQ Process", listOf(report.primaryProcesses(), printRecord));
     if (report.secondaryProcesses().count() > 0)
-        refill(row.list("Secondary HARQ Process"), report.secondaryProcesses(), printRecord);
+        row.set("Secondary HARQ Process", listOf(report.secondaryProcesses(), printRecord));
 }
 
 } // namespace orvex

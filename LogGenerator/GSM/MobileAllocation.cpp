@@ -11,10 +11,10 @@ void MobileAllocation::update(const LogCode_0x51F8& report)
 {
     Rows row = rows();
     row.print("HSN", "%d", report.hoppingSequenceNumber());
-    fillList(row.list("ARFCNs"), [&](RowList& list) {
-        for (const auto& channel : report.channels())
-            list.append(LateText("%d", channel.arfcn()));
-    });
+    auto channels = Array::make();
+    for (const auto& channel : report.channels())
+        channels->append(LateText("%d", channel.arfcn()));
+    row.set("ARFCNs", channels);
 }
 
 } // namespace orvex

@@ -8,9 +8,10 @@ void printRecord(Rows& row, const LogCode_0xD00C::CompositeChannel& channel)
 {
     row.print("CCTRCH ID", "%d", channel.identity());
     row.print("TSNUM", "%d", channel.timeSlotNumber());
-    RowList ratios(row.list("SIR"));
+    auto ratios = Array::make();
     for (std::size_t i = 0; i < LogCode_0xD00C::CompositeChannel::kSIRCount; ++i)
-        ratios.append(LateText("%d", channel.sir(i)));
+        ratios->append(LateText("%d", channel.sir(i)));
+    row.set("SIR", ratios);
 }
 
 } // namespace

@@ -26,8 +26,7 @@ GSMNeighbhorMeasurements::GSMNeighbhorMeasurements(ClassDictionary& dict, CodeDi
 void GSMNeighbhorMeasurements::update(const LogCode_0xD00E& report)
 {
     clearSection();
-    refill(nullptr, report.neighbors(),
-        printRecord); // to nowhere: what one sees here has always been an empty list
+    listOf(report.neighbors(), printRecord); // shown nowhere: the list on screen has always been empty
 }
 
 } // namespace orvex

@@ -87,17 +87,6 @@ TEST(RowsTest, KeepsTheOthersAndTheirOrder)
     rows.print("A", "%d", 10);
     rows.set("D", "40");
     EXPECT_EQ(described(Array({dictionary})), "A=10 B=2 C=30 D=40 | ");
-    EXPECT_FALSE(Rows(nullptr).list("L"));
-}
-
-TEST(RowsTest, AListInARowIsFilledAgainUnlessSomebodyElseHoldsIt)
-{
-    const auto dictionary = Dictionary::make({{"L", "no list yet"}});
-    for (const int number : {1, 2})
-        fill(*Rows(dictionary.get()).list("L"), {{{"A", number}}});
-    const ArrayRef kept = (*dictionary)["L"].array();
-    fill(*Rows(dictionary.get()).list("L"), {{{"A", 3}}});
-    EXPECT_EQ(described(*kept), "A=2 | ");
 }
 
 } // namespace

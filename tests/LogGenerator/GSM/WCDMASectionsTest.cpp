@@ -102,6 +102,29 @@ TEST(WCDMASections, BlockErrors)
     });
 }
 
+TEST(WCDMASections, ListsInRowsAreNewArrays)
+{
+    const struct {
+        const char* section;
+        const char* packet;
+        const char* row;
+    } cases[] = {
+        {"BLER", "4116: 01 3492 07 01020304 FF*4", "Transport Channels"},
+        {"HSDPA Info", "4221: 09 21 0B 01 00 FF*9", "Primary HARQ Process"},
+        {"Mobile Allocation", "51F8: 3F 01 3412", "ARFCNs"},
+    };
+    const QuietConsole quiet;
+    for (const auto& [section, packet, row] : cases) {
+        const MRL_GSMClassIndex index;
+        const auto rows = Dictionary::make();
+        feed(*index.getClass(section), rows, {packetOfText(packet)});
+        const std::weak_ptr<Array> first = (*rows)[row].array();
+        ASSERT_FALSE(first.expired()) << section;
+        feed(*index.getClass(section), rows, {packetOfText(packet)});
+        EXPECT_TRUE(first.expired()) << section;
+    }
+}
+
 // Each carrier's processes take 9 bytes. Those of the secondary carrier stand behind room for 18 of each of
 // the primary one; a carrier without processes keeps the list it had.
 TEST(WCDMASections, HSDPAProcesses)
