@@ -1,11 +1,15 @@
 #include "C2K/LogCode_0x119C_ActiveSet.h"
 
+#include "ArrayOutOfBoundsException.h"
+
 #include <cmath>
 
 namespace orvex {
 
 std::optional<LogCode_0x119C_ActiveSet::Pilot> LogCode_0x119C_ActiveSet::pilot(int index) const
 {
+    if (index < 0 || index >= count())
+        throw ArrayOutOfBoundsException();
     const auto fingers = static_cast<std::size_t>(field8(9));
     const std::size_t stride = (6 * fingers + 15) & 0xFFC;
     const std::size_t start = 12 + static_cast<std::size_t>(index) * stride;

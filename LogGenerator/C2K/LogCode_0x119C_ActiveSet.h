@@ -34,7 +34,8 @@ public:
     bool isReadable() const { return _subpacket.contains(4, 8); }
     int count() const { return field8(8); }
     int referencePN() const { return field16(10); }
-    // None when the packet does not hold the pilot's fields.
+    // None when the packet does not hold the pilot's fields. Throws ArrayOutOfBoundsException at or beyond
+    // the count.
     std::optional<Pilot> pilot(int index) const;
 
 private:

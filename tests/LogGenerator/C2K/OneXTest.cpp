@@ -2,6 +2,9 @@
 
 #include "C2KFixture.h"
 
+#include "ArrayOutOfBoundsException.h"
+#include "C2K/LogCode_0x119C_ActiveSet.h"
+
 namespace orvex::test {
 namespace {
 
@@ -124,6 +127,10 @@ TEST(OneXStatus, ListsPilotsWithTheirStrength)
         fixture.shownAfter(kFour + kState + kRadio + kFingers + lastSet);
         EXPECT_EQ((*fixture.display)["k1xActiveSetInfo"].dictionary()->size(), pilots + 1) << length;
     }
+    const Bytes one = PacketText(set("0100 01 00", "4800")).bytes();
+    for (const int index : {-1, 1})
+        EXPECT_THROW(
+            LogCode_0x119C_ActiveSet(Subpacket(PacketReader(one))).pilot(index), ArrayOutOfBoundsException);
 }
 
 TEST(OneXSystemIdentity, ReadsEachFieldFromItsOwnBytes)
