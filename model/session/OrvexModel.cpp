@@ -61,7 +61,7 @@ bool OrvexModel::createPorts()
             model->restartMonitor();
     });
 
-    const auto connection = _platform.telephony.connect([weakModel] {
+    auto connection = _platform.telephony.connect([weakModel] {
         if (const auto model = weakModel.lock())
             model->refresh();
     });
@@ -70,6 +70,7 @@ bool OrvexModel::createPorts()
         return false;
     }
     const auto channel = connection->createNetworkMonitorLogChannel(portName);
+    connection.reset(); // it has done its work
     if (channel.errorCode != 0) {
         systemLog(Priority::error, "_KoratServerConnectionNetworkMonitorCreateLogChannel returns error: %ld!",
             channel.errorCode);

@@ -67,6 +67,7 @@ TEST_F(OrvexModelTest, StartsTheStreamAndFollowsIt)
     EXPECT_EQ((*telephony.sent[1].dictionary())["SetState"], Value("Streaming"));
     EXPECT_THAT(telephony.portNames, testing::Each("org.orvex.BasebandStateReport.LogChannel"));
     EXPECT_THAT(telephony.messageIds, ElementsAre(0, 0));
+    EXPECT_FALSE(telephony.wasConnectedAtRemotePort);
     EXPECT_THAT(telephony.timeouts, ElementsAre(1s, 1s, 1s)) << "query out, query back, command out";
     EXPECT_THAT(log.lines, Contains(StartsWith("<3> ***** Created ports (send=0x")));
     EXPECT_THAT(log.lines, Contains(StartsWith("<3>Got log generated: 0x")));

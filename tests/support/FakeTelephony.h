@@ -56,6 +56,8 @@ public:
     std::vector<std::int32_t> messageIds;
     std::vector<std::chrono::milliseconds> timeouts;
     std::function<void()> notifyConnection;
+    bool isConnected = false; // a connection exists
+    bool wasConnectedAtRemotePort = false;
 
     // Delivers a message to the local port and returns its reply.
     std::optional<Bytes> deliver(const Bytes& message, std::int32_t messageId = 0)
@@ -76,6 +78,7 @@ public:
 
     std::shared_ptr<RemotePort> createRemotePort(const std::string&) override
     {
+        wasConnectedAtRemotePort = isConnected;
         if (remotePortFails)
             return nullptr;
         remotePort = std::make_shared<FakeRemotePort>(*this);
@@ -93,7 +96,9 @@ private:
         explicit FakeConnection(FakeTelephony& owner)
             : _owner(owner)
         {
+            _owner.isConnected = true;
         }
+        ~FakeConnection() override { _owner.isConnected = false; }
         LogChannelReply createNetworkMonitorLogChannel(const std::string& name) override
         {
             _owner.portNames.push_back(name);
