@@ -39,13 +39,25 @@ QSize ActivityIndicator::sizeHint() const
 void ActivityIndicator::startAnimating()
 {
     _isAnimating = true;
-    setVisible(true);
+    updateVisibility();
 }
 
 void ActivityIndicator::stopAnimating()
 {
     _isAnimating = false;
-    setVisible(false);
+    updateVisibility();
+}
+
+void ActivityIndicator::updateVisibility()
+{
+    setVisible(_isAnimating && parentWidget());
+}
+
+bool ActivityIndicator::event(QEvent* event)
+{
+    if (event->type() == QEvent::ParentChange)
+        updateVisibility();
+    return QWidget::event(event);
 }
 
 void ActivityIndicator::showEvent(QShowEvent* event)

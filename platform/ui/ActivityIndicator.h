@@ -5,7 +5,8 @@
 
 namespace orvex {
 
-// The small spinner. Hidden while stopped. Its timer runs only while there is something to see.
+// The small spinner. Hidden while stopped, and until it has a parent: alone it would be a window. Its timer
+// runs only while there is something to see.
 class ActivityIndicator final : public QWidget {
 public:
     explicit ActivityIndicator(QWidget* parent = nullptr);
@@ -20,12 +21,15 @@ public:
     QSize minimumSizeHint() const override { return sizeHint(); }
 
 protected:
+    bool event(QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
     void showEvent(QShowEvent* event) override;
     void hideEvent(QHideEvent* event) override;
     void timerEvent(QTimerEvent* event) override;
 
 private:
+    void updateVisibility();
+
     bool _isAnimating = false;
     QBasicTimer _ticks;
 };

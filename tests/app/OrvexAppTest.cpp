@@ -8,9 +8,25 @@
 
 #include <filesystem>
 #include <fstream>
+#include <set>
 
 namespace orvex::test {
 namespace {
+
+// Every widget that was ever shown as a window of its own.
+class WindowWatch final : public QObject {
+public:
+    WindowWatch() { qApp->installEventFilter(this); }
+    bool eventFilter(QObject* watched, QEvent* event) override
+    {
+        const bool isWindow = watched->isWidgetType() && static_cast<QWidget*>(watched)->isWindow();
+        if (event->type() == QEvent::Show && isWindow)
+            shown.insert(watched);
+        return false;
+    }
+
+    std::set<const QObject*> shown;
+};
 
 class OrvexAppTest : public testing::Test, public SessionFixture {
 protected:
@@ -110,6 +126,23 @@ TEST_F(OrvexAppTest, SaysThatItConnectsFromTheNextRefreshOrNavigationAfterALoss)
     EXPECT_EQ(status(), "Updated 2023-11-15 at 00:13:20"); // of the last data
     app->applicationWillTerminate();
     EXPECT_EQ(printed(), "");
+}
+
+TEST_F(OrvexAppTest, ShowsNoWindowBesidesItsOwn)
+{
+    const WindowWatch watch;
+    launchAndShow(1);
+    QCoreApplication::processEvents();
+    tapRow(pane(0).tableList(), 1);
+    loseService();
+    refresh();
+    app->navigationStack()->pop(false);
+    EXPECT_EQ(status(), "[busy] Connecting...");
+    telephony.serviceIsAbsent = false;
+    runLoop.advance(std::chrono::seconds(5));
+    deliverNeighbors(2);
+    refresh();
+    EXPECT_EQ(watch.shown, std::set<const QObject*>{app->window()});
 }
 
 TEST_F(OrvexAppTest, OffersTheSaveButtonOnInternalBuildsAlone)
