@@ -110,11 +110,13 @@ void OrvexPaneController::didSelectRow(TableList& list, std::optional<int> row)
     const OrvexModelNodeRef child = _nodes->childNodes()->at(static_cast<std::size_t>(*row));
     if (!child->childNodes())
         return list.deselectRow();
+    // A row can be released after its screen was popped or covered.
+    if (!navigationStack() || &navigationStack()->topScreen() != this)
+        return;
     auto screen =
         std::make_unique<OrvexPaneController>(_host, child, pathByAppending(_keyPath, child->displayName()));
     screen->setStatus(_status, _isLoading);
-    if (navigationStack())
-        navigationStack()->push(std::move(screen), true);
+    navigationStack()->push(std::move(screen), true);
 }
 
 void OrvexPaneController::createToolbarItems()

@@ -30,7 +30,7 @@ NavigationStack::NavigationStack(std::unique_ptr<Screen> root, QWidget* parent)
     adopt(std::move(root));
     setFocusProxy(&topScreen());
     titleChanged();
-    _toolbar->showRow(topScreen().toolbarRow(), false);
+    _toolbar->showRow(topScreen().toolbarRow());
 }
 
 void NavigationStack::adopt(std::unique_ptr<Screen> screen)
@@ -57,9 +57,13 @@ void NavigationStack::popTo(int index, bool animated)
         return;
     _slide.finish();
     Screen& leaving = topScreen();
-    for (int above = index + 1; above < count() - 1; ++above) {
-        screenAt(above).hide();
-        screenAt(above).deleteLater();
+    for (int above = index + 1; above < count(); ++above) {
+        Screen& popped = screenAt(above);
+        popped._stack = nullptr;
+        if (&popped == &leaving)
+            continue; // still to slide out
+        popped.hide();
+        popped.deleteLater();
     }
     _screens.resize(static_cast<std::size_t>(index) + 1);
     announce(leaving, animated);
@@ -73,7 +77,7 @@ void NavigationStack::announce(Screen& leaving, bool animated)
     if (_delegate)
         _delegate->willShowScreen(*this, topScreen(), animated);
     titleChanged();
-    _toolbar->showRow(topScreen().toolbarRow(), false);
+    _toolbar->showRow(topScreen().toolbarRow());
 }
 
 void NavigationStack::slide(Screen& leaving, Direction direction, bool animated)
@@ -117,10 +121,10 @@ void NavigationStack::titleChanged()
     _bar->setTitles(topScreen().title(), hasBack ? screenAt(count() - 2).title() : QString(), hasBack);
 }
 
-void NavigationStack::toolbarItemsChanged(const Screen& screen)
+void NavigationStack::toolbarRowChanged(const Screen& screen, const ToolbarRow* replaced)
 {
     if (&screen == &topScreen())
-        _toolbar->showRow(screen.toolbarRow(), true);
+        _toolbar->showRow(screen.toolbarRow(), replaced);
 }
 
 void NavigationStack::setToolbarHidden(bool hidden)

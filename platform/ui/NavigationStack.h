@@ -45,7 +45,7 @@ public:
 
     // Told by screens.
     void titleChanged();
-    void toolbarItemsChanged(const Screen& screen);
+    void toolbarRowChanged(const Screen& screen, const ToolbarRow* replaced);
 
 protected:
     void resizeEvent(QResizeEvent* event) override;

@@ -32,7 +32,7 @@ void Screen::setToolbarItems(std::vector<ToolbarItem> items, bool animated)
     ToolbarRow* const old = _toolbarRow;
     _toolbarRow = new ToolbarRow(std::move(items));
     if (_stack)
-        _stack->toolbarItemsChanged(*this);
+        _stack->toolbarRowChanged(*this, old);
     _toolbarRow->replace(old, animated);
 }
 

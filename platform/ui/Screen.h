@@ -24,7 +24,7 @@ public:
     // Null until items were set.
     ToolbarRow* toolbarRow() const { return _toolbarRow; }
 
-    // The stack the screen is on; null before its push.
+    // The stack the screen is on; null before its push and after its pop.
     NavigationStack* navigationStack() const { return _stack; }
 
     // Called by the stack, before the screen comes into view and before it goes.

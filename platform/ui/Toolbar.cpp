@@ -17,11 +17,11 @@ Toolbar::Toolbar(QWidget* parent)
     setAttribute(Qt::WA_OpaquePaintEvent);
 }
 
-void Toolbar::showRow(ToolbarRow* row, bool replacesShownRow)
+void Toolbar::showRow(ToolbarRow* row, const ToolbarRow* replaced)
 {
     if (_row == row)
         return;
-    if (_row && !replacesShownRow)
+    if (_row && _row != replaced)
         _row->hide();
     _row = row;
     if (!row)

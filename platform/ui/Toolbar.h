@@ -14,9 +14,9 @@ public:
 
     explicit Toolbar(QWidget* parent);
 
-    // The row stays its screen's; the bar only lends it a place. Null empties the bar. What becomes of the
-    // row shown so far is the new one's affair when that replaces it.
-    void showRow(ToolbarRow* row, bool replacesShownRow);
+    // The row still belongs to its screen. Null empties the bar. Hides the row shown so far, unless that is
+    // the one being replaced: its successor decides when it goes.
+    void showRow(ToolbarRow* row, const ToolbarRow* replaced = nullptr);
 
 protected:
     void paintEvent(QPaintEvent* event) override;

@@ -43,6 +43,24 @@ TEST_F(OrvexPaneControllerTest, ShowsItsStatusAndTheSaveButtonInItsToolbar)
     EXPECT_FALSE(static_cast<ActivityIndicator*>(items[0].widget)->isTicking());
 }
 
+TEST_F(OrvexPaneControllerTest, OnlyTheToolbarRowOfTheScreenOnTopIsShown)
+{
+    show(Tree(rows({{"A", rows({{"B", rows({})}})}})));
+    const auto expectOneRow = [this] {
+        for (const auto* widget : stack->findChildren<QWidget*>()) {
+            const auto* const row = dynamic_cast<const ToolbarRow*>(widget);
+            EXPECT_TRUE(!row || row == top().toolbarRow() || !row->isVisible());
+        }
+        EXPECT_TRUE(top().toolbarRow()->isVisible());
+    };
+    for (int level = 0; level < 2; ++level) {
+        tapRow(top().tableList(), 0);
+        expectOneRow();
+    }
+    stack->pop(false);
+    expectOneRow();
+}
+
 TEST_F(OrvexPaneControllerTest, OpensBranchesByTapAndByKeyAndComesBack)
 {
     show(lteTree());
@@ -101,6 +119,29 @@ TEST_F(OrvexPaneControllerTest, PopsBackToTheLastScreenWhosePathIsLeft)
         if (!test.display.isNull()) {
             EXPECT_EQ(shownAt(paneAt(*stack, 0), 0), "Z=new");
         }
+    }
+}
+
+TEST_F(OrvexPaneControllerTest, ARowReleasedAfterItsScreenWasPoppedOrCoveredOpensNothing)
+{
+    const Tree tree(rows({{"A", rows({{"B", rows({})}})}}));
+    const Tree without(rows({{"C", "value"}}));
+    for (const bool isPopped : {true, false}) {
+        SCOPED_TRACE(isPopped ? "popped" : "covered");
+        show(tree);
+        tapRow(top().tableList(), 0);
+        TableList& list = top().tableList();
+        QTest::mousePress(&list, Qt::LeftButton, {}, {60, 20});
+        if (isPopped) {
+            reload(without);
+        } else {
+            list.selectRow(0);
+            key(Qt::Key_Return);
+        }
+        const Paths paths = pathsOn(*stack);
+        EXPECT_EQ(paths.size(), isPopped ? 1U : 3U);
+        QTest::mouseRelease(&list, Qt::LeftButton, {}, {60, 20});
+        EXPECT_EQ(pathsOn(*stack), paths);
     }
 }
 
