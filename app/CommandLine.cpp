@@ -5,6 +5,22 @@
 namespace orvex {
 
 namespace {
+
+// Pairs of which one option would be ignored.
+constexpr struct {
+    const char* option;
+    const char* other;
+} kExclusions[] = {
+    {"light", "dark"},
+    {"console", "light"},
+    {"console", "dark"},
+    {"console", "print-status"},
+    {"console", "until-painted"},
+    {"open", "resources"},
+    {"open", "print-status"},
+    {"open", "until-painted"},
+};
+
 CommandLine wrongUsage(const QString& error)
 {
     CommandLine result;
@@ -12,6 +28,7 @@ CommandLine wrongUsage(const QString& error)
     result.error = error.toStdString();
     return result;
 }
+
 } // namespace
 
 CommandLine CommandLine::parse(const QStringList& arguments)
@@ -34,19 +51,28 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     if (!parser.positionalArguments().isEmpty())
         return wrongUsage(
             QStringLiteral("Unexpected argument '%1'.").arg(parser.positionalArguments().first()));
-    if (parser.isSet(light) && parser.isSet(dark))
-        return wrongUsage(QStringLiteral("--light and --dark exclude each other."));
-    if (parser.isSet(printStatus) && (parser.isSet(console) || parser.isSet(open)))
-        return wrongUsage(QStringLiteral("--print-status goes with a session in a window."));
 
     CommandLine result;
-    result.printsStatus = parser.isSet(printStatus);
-    if (parser.isSet(help))
-        result.action = Action::help;
-    else if (parser.isSet(version))
-        result.action = Action::version;
-    else if (parser.isSet(console))
+    if (parser.isSet(help) || parser.isSet(version)) {
+        result.action = parser.isSet(help) ? Action::help : Action::version;
+        return result;
+    }
+    for (const auto& [option, other] : kExclusions) {
+        if (parser.isSet(QLatin1String(option)) && parser.isSet(QLatin1String(other)))
+            return wrongUsage(QStringLiteral("--%1 cannot be combined with --%2.")
+                                  .arg(QLatin1String(option), QLatin1String(other)));
+    }
+    for (const auto& option : {resources, open}) {
+        QStringList values = parser.values(option);
+        values.removeDuplicates();
+        if (values.size() > 1)
+            return wrongUsage(
+                QStringLiteral("--%1 is given with different values.").arg(option.names().first()));
+    }
+
+    if (parser.isSet(console))
         result.action = Action::console;
+    result.printsStatus = parser.isSet(printStatus);
     result.endsWhenPainted = parser.isSet(untilPainted);
     if (parser.isSet(light))
         result.theme = Theme::Mode::light;
@@ -71,7 +97,7 @@ std::string CommandLine::usage()
            "                   after the number of messages decoded so far.\n"
            "  --resources DIR  Take the section templates from this directory.\n"
            "  --light, --dark  Choose the colours. Default: as the desktop has them.\n"
-           "  --until-painted  Say when the window has been painted first, and end.\n"
+           "  --until-painted  Print 'painted' after the first frame, then exit.\n"
            "  -h, --help       Show this help and exit.\n"
            "  -v, --version    Show the version and exit.\n";
 }

@@ -18,7 +18,7 @@ struct CommandLine {
     std::optional<std::string> resources; // a directory in place of the default one
     std::optional<std::string> snapshot;  // a file to show in place of a session
     bool printsStatus = false;            // the window's status line goes to standard output too
-    bool endsWhenPainted = false;         // for measuring how long the start takes
+    bool endsWhenPainted = false;         // to measure how long the start takes
     std::string error;                    // with wrongUsage: one line
 
     // The arguments as the program got them, its own name first.

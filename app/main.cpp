@@ -208,7 +208,7 @@ int main(int argc, char** argv)
     const CommandLine commandLine = CommandLine::parse(arguments);
     switch (commandLine.action) {
     case CommandLine::Action::wrongUsage:
-        std::fprintf(stderr, "orvex: %s\n%s", commandLine.error.c_str(), CommandLine::usage().c_str());
+        std::fprintf(stderr, "orvex: %s Try 'orvex --help'.\n", commandLine.error.c_str());
         return kExitWrongUsage;
     case CommandLine::Action::help: std::fputs(CommandLine::usage().c_str(), stdout); return EXIT_SUCCESS;
     case CommandLine::Action::version: std::puts("orvex " ORVEX_VERSION); return EXIT_SUCCESS;

@@ -25,6 +25,14 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         {{"--no-such"}, Action::wrongUsage},
         {{"file"}, Action::wrongUsage},
         {{"--light", "--dark"}, Action::wrongUsage},
+        {{"--light", "--dark", "--help"}, Action::help},
+        {{"--console", "--light"}, Action::wrongUsage},
+        {{"--console", "--until-painted"}, Action::wrongUsage},
+        {{"--open", "a", "--console"}, Action::console},
+        {{"--open", "a", "--resources", "/r"}, Action::wrongUsage},
+        {{"--open", "a", "--until-painted"}, Action::wrongUsage},
+        {{"--open", "a", "--open", "b"}, Action::wrongUsage},
+        {{"--resources", "/a b", "--resources", "/a b"}, Action::window, Mode::system, "/a b"},
     };
     for (const auto& test : cases) {
         SCOPED_TRACE(test.arguments.join(' ').toStdString());
