@@ -1,10 +1,16 @@
 #include "CommandLine.h"
 
 #include <QCommandLineParser>
+#include <QRegularExpression>
+
+#include <algorithm>
 
 namespace orvex {
 
 namespace {
+
+constexpr QSize kHandsetSize{375, 667};
+constexpr int kBroadestHandset = 600; // the shorter side of its screen
 
 // Pairs of which one option would be ignored.
 constexpr struct {
@@ -16,6 +22,7 @@ constexpr struct {
     {"console", "dark"},
     {"console", "print-status"},
     {"console", "until-painted"},
+    {"console", "size"},
     {"open", "resources"},
     {"open", "print-status"},
     {"open", "until-painted"},
@@ -27,6 +34,16 @@ CommandLine wrongUsage(const QString& error)
     result.action = CommandLine::Action::wrongUsage;
     result.error = error.toStdString();
     return result;
+}
+
+// "375x667"; none for anything else.
+std::optional<QSize> sizeFrom(const QString& text)
+{
+    static const QRegularExpression pattern(QStringLiteral("^([1-9][0-9]{0,3})x([1-9][0-9]{0,3})\\z"));
+    const QRegularExpressionMatch match = pattern.match(text);
+    if (!match.hasMatch())
+        return std::nullopt;
+    return QSize(match.captured(1).toInt(), match.captured(2).toInt());
 }
 
 } // namespace
@@ -41,9 +58,11 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     const QCommandLineOption printStatus(QStringLiteral("print-status"));
     const QCommandLineOption light(QStringLiteral("light"));
     const QCommandLineOption dark(QStringLiteral("dark"));
+    const QCommandLineOption size(QStringLiteral("size"), {}, QStringLiteral("SIZE"));
     const QCommandLineOption untilPainted(QStringLiteral("until-painted"));
     QCommandLineParser parser;
-    parser.addOptions({help, version, console, resources, open, printStatus, light, dark, untilPainted});
+    parser.addOptions(
+        {help, version, console, resources, open, printStatus, light, dark, size, untilPainted});
 
     // parse() rather than process(), which would end the program in its own way.
     if (!parser.parse(arguments))
@@ -62,7 +81,7 @@ CommandLine CommandLine::parse(const QStringList& arguments)
             return wrongUsage(QStringLiteral("--%1 cannot be combined with --%2.")
                                   .arg(QLatin1String(option), QLatin1String(other)));
     }
-    for (const auto& option : {resources, open}) {
+    for (const auto& option : {resources, open, size}) {
         QStringList values = parser.values(option);
         values.removeDuplicates();
         if (values.size() > 1)
@@ -70,6 +89,12 @@ CommandLine CommandLine::parse(const QStringList& arguments)
                 QStringLiteral("--%1 is given with different values.").arg(option.names().first()));
     }
 
+    if (parser.isSet(size)) {
+        result.fillsHandset = parser.value(size) == QLatin1String("handset");
+        result.size = result.fillsHandset ? kHandsetSize : sizeFrom(parser.value(size));
+        if (!result.size)
+            return wrongUsage(QStringLiteral("--size takes WIDTHxHEIGHT, such as 375x667, or 'handset'."));
+    }
     if (parser.isSet(console))
         result.action = Action::console;
     result.printsStatus = parser.isSet(printStatus);
@@ -85,6 +110,13 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     return result;
 }
 
+std::optional<QSize> CommandLine::windowSizeOn(const QSize& screen) const
+{
+    if (fillsHandset && std::min(screen.width(), screen.height()) <= kBroadestHandset)
+        return std::nullopt;
+    return size;
+}
+
 std::string CommandLine::usage()
 {
     return "Usage: orvex [options]\n"
@@ -97,6 +129,8 @@ std::string CommandLine::usage()
            "                   after the number of messages decoded so far.\n"
            "  --resources DIR  Take the section templates from this directory.\n"
            "  --light, --dark  Choose the colours. Default: as the desktop has them.\n"
+           "  --size WxH       Open the window with this size instead of the screen's. 'handset' is\n"
+           "                   375x667, or the screen's where that is a handset's.\n"
            "  --until-painted  Print 'painted' after the first frame, then exit.\n"
            "  -h, --help       Show this help and exit.\n"
            "  -v, --version    Show the version and exit.\n";

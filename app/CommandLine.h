@@ -2,6 +2,7 @@
 
 #include "Theme.h"
 
+#include <QSize>
 #include <QStringList>
 
 #include <optional>
@@ -19,10 +20,14 @@ struct CommandLine {
     std::optional<std::string> snapshot;  // a file to show in place of a session
     bool printsStatus = false;            // the window's status line goes to standard output too
     bool endsWhenPainted = false;         // to measure how long the start takes
+    std::optional<QSize> size;            // the window's, in points; none is the screen's
+    bool fillsHandset = false;            // the size is for larger screens only
     std::string error;                    // with wrongUsage: one line
 
     // The arguments as the program got them, its own name first.
     static CommandLine parse(const QStringList& arguments);
+    // The size the window opens with on such a screen; none is the screen's.
+    std::optional<QSize> windowSizeOn(const QSize& screen) const;
     static std::string usage();
 };
 

@@ -23,13 +23,15 @@ std::string reportDirectory()
 }
 } // namespace
 
-std::shared_ptr<OrvexApp> OrvexApp::create(const AppPlatform& platform)
+std::shared_ptr<OrvexApp> OrvexApp::create(
+    const AppPlatform& platform, const std::optional<QSize>& windowSize)
 {
-    return std::shared_ptr<OrvexApp>(new OrvexApp(platform));
+    return std::shared_ptr<OrvexApp>(new OrvexApp(platform, windowSize));
 }
 
-OrvexApp::OrvexApp(const AppPlatform& platform)
+OrvexApp::OrvexApp(const AppPlatform& platform, const std::optional<QSize>& windowSize)
     : _platform(platform)
+    , _windowSize(windowSize)
 {
 }
 
@@ -43,7 +45,7 @@ OrvexApp::~OrvexApp()
 void OrvexApp::applicationDidFinishLaunching()
 {
     getSaveButtonPref();
-    _window = std::make_unique<Window>(QStringLiteral("Orvex"), Window::kHandsetSize);
+    _window = std::make_unique<Window>(QStringLiteral("Orvex"), _windowSize);
     _model = OrvexModel::create(_platform.session);
     _model->setListener(this);
     _updateMessage = kConnectingMessage;

@@ -20,7 +20,9 @@ class OrvexApp final : public std::enable_shared_from_this<OrvexApp>,
                        public NavigationStack::Delegate,
                        public PaneHost {
 public:
-    static std::shared_ptr<OrvexApp> create(const AppPlatform& platform);
+    // The window fills the main screen unless it is to open with another size.
+    static std::shared_ptr<OrvexApp> create(
+        const AppPlatform& platform, const std::optional<QSize>& windowSize = std::nullopt);
     ~OrvexApp() override;
     OrvexApp(const OrvexApp&) = delete;
     OrvexApp& operator=(const OrvexApp&) = delete;
@@ -53,9 +55,10 @@ public:
     OrvexModel* model() const { return _model.get(); }
 
 private:
-    explicit OrvexApp(const AppPlatform& platform);
+    OrvexApp(const AppPlatform& platform, const std::optional<QSize>& windowSize);
 
     AppPlatform _platform;
+    std::optional<QSize> _windowSize;
     std::unique_ptr<Window> _window;
     NavigationStack* _navController = nullptr; // the window's
     std::shared_ptr<OrvexModel> _model;

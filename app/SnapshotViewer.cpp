@@ -8,9 +8,10 @@
 
 namespace orvex {
 
-SnapshotViewer::SnapshotViewer(const Snapshot& snapshot, const std::string& name)
-    : _window(std::make_unique<Window>(
-        QStringLiteral("Orvex – %1").arg(QString::fromStdString(name)), Window::kHandsetSize))
+SnapshotViewer::SnapshotViewer(
+    const Snapshot& snapshot, const std::string& name, const std::optional<QSize>& windowSize)
+    : _window(
+        std::make_unique<Window>(QStringLiteral("%1 – Orvex").arg(QString::fromStdString(name)), windowSize))
 {
     auto root = std::make_unique<OrvexPaneController>(*this, snapshotTree(snapshot), "/");
     root->setStatus(snapshotMessage(snapshot), false); // the screens above take it over

@@ -3,7 +3,10 @@
 #include "PaneHost.h"
 #include "Snapshot.h"
 
+#include <QSize>
+
 #include <memory>
+#include <optional>
 #include <string>
 
 namespace orvex {
@@ -14,12 +17,14 @@ class Window;
 // Shows a saved snapshot on the list screens. There is no session: nothing moves, nothing can be saved.
 class SnapshotViewer final : public PaneHost {
 public:
-    // The name stands in the title of the window.
-    SnapshotViewer(const Snapshot& snapshot, const std::string& name);
+    // The name stands in the title of the window, which fills the main screen unless another size is given.
+    SnapshotViewer(const Snapshot& snapshot, const std::string& name,
+        const std::optional<QSize>& windowSize = std::nullopt);
     ~SnapshotViewer() override;
     SnapshotViewer(const SnapshotViewer&) = delete;
     SnapshotViewer& operator=(const SnapshotViewer&) = delete;
 
+    const Window& window() const { return *_window; }
     NavigationStack& navigationStack() const { return *_navController; }
 
     bool offersSaveButton() const override { return false; }

@@ -27,6 +27,7 @@
 #include "VisibleText.h"
 
 #include <QApplication>
+#include <QScreen>
 
 #include <algorithm>
 #include <clocale>
@@ -131,6 +132,11 @@ int runConsole(int argc, char** argv, const std::string& resourceDirectory)
     return status;
 }
 
+std::optional<QSize> windowSize(const CommandLine& commandLine)
+{
+    return commandLine.windowSizeOn(QGuiApplication::primaryScreen()->size());
+}
+
 // Runs the body with an application object that can open windows.
 int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<int()>& body)
 {
@@ -143,7 +149,6 @@ int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<in
     keepDecimalPoints();
     qInstallMessageHandler(usualHandler);
     QApplication::setApplicationName(QStringLiteral("orvex"));
-    QApplication::setApplicationDisplayName(QStringLiteral("Orvex"));
     Theme::use(theme);
     installAccessibility();
     return body();
@@ -153,7 +158,7 @@ int runWindow(int argc, char** argv, const std::string& resourceDirectory, const
 {
     return runInWindow(argc, argv, commandLine.theme, [&resourceDirectory, &commandLine] {
         LinuxPlatform platform(resourceDirectory);
-        const auto app = OrvexApp::create(platform.forApp());
+        const auto app = OrvexApp::create(platform.forApp(), windowSize(commandLine));
         StandardOutput output([] {}); // the window stays when nobody reads
         std::optional<StatusPrinter> statusPrinter;
         if (commandLine.printsStatus) {
@@ -192,7 +197,8 @@ int showSnapshot(int argc, char** argv, const CommandLine& commandLine)
         return written ? EXIT_SUCCESS : kExitFailure;
     }
     return runInWindow(argc, argv, commandLine.theme, [&, &shown = *snapshot] {
-        const SnapshotViewer viewer(shown, std::filesystem::path(path).filename().string());
+        const SnapshotViewer viewer(
+            shown, std::filesystem::path(path).filename().string(), windowSize(commandLine));
         const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
         return QApplication::exec();
     });

@@ -1,15 +1,21 @@
 #include "Window.h"
 
+#include <QGuiApplication>
+#include <QScreen>
+
 namespace orvex {
 
 namespace {
 constexpr int kSlideMilliseconds = 300;
 } // namespace
 
-Window::Window(const QString& title, const QSize& size)
+Window::Window(const QString& title, const std::optional<QSize>& size)
 {
     setWindowTitle(title);
-    resize(size);
+    if (size)
+        resize(*size);
+    else
+        setGeometry(QGuiApplication::primaryScreen()->geometry());
 }
 
 void Window::setRootView(std::unique_ptr<QWidget> view)

@@ -7,15 +7,15 @@
 #include <QWidget>
 
 #include <memory>
+#include <optional>
 
 namespace orvex {
 
 // The application's window: a root view that fills it, and at most one modal screen that slides up over it.
 class Window final : public QWidget {
 public:
-    static constexpr QSize kHandsetSize{375, 667};
-
-    Window(const QString& title, const QSize& size);
+    // With the bounds of the main screen unless another size is given.
+    explicit Window(const QString& title, const std::optional<QSize>& size = std::nullopt);
 
     void setRootView(std::unique_ptr<QWidget> view);
 

@@ -6,6 +6,8 @@
 
 #include "FixedPaths.h"
 
+#include <QScreen>
+
 #include <filesystem>
 #include <fstream>
 #include <set>
@@ -58,7 +60,7 @@ TEST_F(OrvexAppTest, LaunchesBeforeItStartsTheSession)
 {
     app->applicationDidFinishLaunching();
     EXPECT_EQ(telephony.localPortsCreated, 0);
-    EXPECT_EQ(app->window()->size(), QSize(375, 667));
+    EXPECT_EQ(app->window()->size(), QGuiApplication::primaryScreen()->size());
     EXPECT_TRUE(app->window()->isVisible());
     EXPECT_EQ(pane(0).title(), "Orvex");
     EXPECT_EQ(status(), "[busy] Connecting");

@@ -1,6 +1,7 @@
 #include "SnapshotViewer.h"
 
 #include "PaneFixture.h"
+#include "Window.h"
 
 namespace orvex::test {
 namespace {
@@ -13,7 +14,10 @@ TEST(SnapshotViewer, ShowsEntriesThenTheirTrees)
     };
     const auto data = Array::make({entry("Snapshot (a)", "1"), entry("Snapshot (a)", "2"), Dictionary::make(),
         Dictionary::make({{"DLF", std::make_shared<Bytes>(161)}})});
-    const SnapshotViewer viewer({"2024-03-05 14:07:09 +0000", data, "no service"}, "x.orvex");
+    const SnapshotViewer viewer(
+        {"2024-03-05 14:07:09 +0000", data, "no service"}, "x.orvex", QSize(300, 500));
+    EXPECT_EQ(viewer.window().windowTitle(), "x.orvex – Orvex");
+    EXPECT_EQ(viewer.window().size(), QSize(300, 500));
     NavigationStack& stack = viewer.navigationStack();
     const auto& root = paneAt(stack, 0);
     ASSERT_EQ(root.tableList().rowCount(), 4);
