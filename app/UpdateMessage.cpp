@@ -1,6 +1,7 @@
 #include "UpdateMessage.h"
 
 #include <QDateTime>
+#include <QLocale>
 
 #include <cmath>
 
@@ -9,8 +10,9 @@ namespace orvex {
 std::string updateMessageAt(Date moment)
 {
     const auto seconds = static_cast<qint64>(std::floor(moment.secondsSince1970));
-    return QDateTime::fromSecsSinceEpoch(seconds)
-        .toString(QStringLiteral("'Updated' yyyy-MM-dd 'at' HH:mm:ss"))
+    return QLocale()
+        .toString(
+            QDateTime::fromSecsSinceEpoch(seconds), QStringLiteral("'Updated' yyyy-MM-dd 'at' HH:mm:ss"))
         .toStdString();
 }
 

@@ -3,9 +3,11 @@
 #include "PaneFixture.h"
 #include "SessionFixture.h"
 #include "StatusPrinter.h"
+#include "UpdateMessage.h"
 
 #include "FixedPaths.h"
 
+#include <QLocale>
 #include <QScreen>
 
 #include <filesystem>
@@ -90,6 +92,21 @@ TEST_F(OrvexAppTest, SaysWhenItWasUpdatedAndLeavesAScreenWhoseRowIsGone)
     app->navigationStack()->pop(false);
     tapRow(pane(0).tableList(), 0);
     EXPECT_EQ(shownAt(pane(1), 1), "E-ARFCN=6300");
+}
+
+TEST(UpdateMessage, HasTheDigitsOfTheUsersLocale)
+{
+    const QLocale usual;
+    const std::pair<const char*, const char*> cases[] = {
+        {"de_DE", "Updated 2023-11-15 at 00:13:20"},
+        {"ar_EG", "Updated ٢٠٢٣-١١-١٥ at ٠٠:١٣:٢٠"},
+        {"fa_IR", "Updated ۲۰۲۳-۱۱-۱۵ at ۰۰:۱۳:۲۰"},
+    };
+    for (const auto& [locale, message] : cases) {
+        QLocale::setDefault(QLocale(locale));
+        EXPECT_EQ(updateMessageAt(FixedClock().now()), message);
+    }
+    QLocale::setDefault(usual);
 }
 
 TEST_F(OrvexAppTest, SaysThatItConnectsFromTheNextRefreshOrNavigationAfterALoss)

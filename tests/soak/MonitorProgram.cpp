@@ -20,6 +20,7 @@ MonitorProgram::MonitorProgram(const test::ProgramFolder& folder)
     QObject::connect(&_process, &QProcess::readyReadStandardError, &_process, [this] { readErrors(); });
     auto environment = folder.environment();
     environment.insert("QT_QPA_PLATFORM", "offscreen");
+    environment.insert("LC_ALL", "C.UTF-8"); // the digits of the status line
     environment.insert("ORVEX_ROOT", QString::fromStdString(folder.path("root")));
     // Freed memory that the address sanitizer holds back would look like a leak.
     environment.insert("ASAN_OPTIONS", "quarantine_size_mb=1");
