@@ -3,6 +3,7 @@
 #include "ActivityIndicator.h"
 #include "TableCell.h"
 #include "TableList.h"
+#include "TouchArea.h"
 
 #include <QAccessible>
 #include <QAccessibleWidget>
@@ -19,6 +20,8 @@ QAccessibleInterface* interfaceFor(const QString&, QObject* object)
         return new QAccessibleWidget(cell, QAccessible::ListItem);
     if (auto* const indicator = dynamic_cast<ActivityIndicator*>(object))
         return new QAccessibleWidget(indicator, QAccessible::Indicator);
+    if (auto* const area = dynamic_cast<TouchArea*>(object))
+        return new QAccessibleWidget(area, QAccessible::Pane);
     return nullptr;
 }
 } // namespace

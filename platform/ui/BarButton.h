@@ -10,6 +10,10 @@ class BarButton final : public QAbstractButton {
 public:
     enum class Style { plain, back };
 
+    explicit BarButton(QWidget* parent)
+        : BarButton(Style::plain, {}, parent)
+    {
+    }
     BarButton(Style style, const QString& title, QWidget* parent = nullptr);
 
     QSize sizeHint() const override;

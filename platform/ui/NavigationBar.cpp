@@ -4,8 +4,6 @@
 #include "TextLabel.h"
 #include "Theme.h"
 
-#include <QPainter>
-
 #include <algorithm>
 
 namespace orvex {
@@ -17,11 +15,10 @@ constexpr double kBackButtonShare = 0.4; // of the width, which it may have even
 } // namespace
 
 NavigationBar::NavigationBar(QWidget* parent)
-    : QWidget(parent)
+    : Bar(parent)
     , _titleLabel(new TextLabel(Theme::boldSystemFont(17), this))
     , _backButton(new BarButton(BarButton::Style::back, {}, this))
 {
-    setAttribute(Qt::WA_OpaquePaintEvent);
     _backButton->hide();
 }
 
@@ -62,13 +59,6 @@ void NavigationBar::layoutTitle()
 void NavigationBar::resizeEvent(QResizeEvent*)
 {
     layoutTitle();
-}
-
-void NavigationBar::paintEvent(QPaintEvent*)
-{
-    QPainter painter(this);
-    painter.fillRect(rect(), Theme::current().bar);
-    painter.fillRect(QRect(0, height() - 1, width(), 1), Theme::current().barSeparator);
 }
 
 } // namespace orvex

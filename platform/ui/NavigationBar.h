@@ -1,6 +1,6 @@
 #pragma once
 
-#include <QWidget>
+#include "Bar.h"
 
 namespace orvex {
 
@@ -9,10 +9,8 @@ class TextLabel;
 
 // The bar at the top: the title of the screen on top and, above the root, a button with the title of the
 // screen below.
-class NavigationBar final : public QWidget {
+class NavigationBar final : public Bar {
 public:
-    static constexpr int kHeight = 44;
-
     explicit NavigationBar(QWidget* parent);
 
     BarButton& backButton() const { return *_backButton; }
@@ -21,7 +19,6 @@ public:
     void setTitles(const QString& title, const QString& backTitle, bool showsBackButton);
 
 protected:
-    void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
 
 private:

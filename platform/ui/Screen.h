@@ -31,6 +31,9 @@ public:
     virtual void viewWillAppear(bool /*animated*/) { }
     virtual void viewWillDisappear(bool /*animated*/) { }
 
+    // What a modal screen gives the keyboard to.
+    virtual QWidget& firstResponder() { return *this; }
+
 protected:
     void paintEvent(QPaintEvent* event) override;
 

@@ -14,8 +14,13 @@
 namespace orvex {
 
 TableList::TableList(DataSource& source, QWidget* parent)
+    : TableList(parent)
+{
+    _source = &source;
+}
+
+TableList::TableList(QWidget* parent)
     : QWidget(parent)
-    , _source(source)
     , _indicator(new ScrollIndicator(this))
 {
     setAttribute(Qt::WA_OpaquePaintEvent);
@@ -29,6 +34,12 @@ TableList::TableList(DataSource& source, QWidget* parent)
 
 TableList::~TableList() = default;
 
+void TableList::setDataSource(DataSource& source)
+{
+    _source = &source;
+    reloadData();
+}
+
 std::unique_ptr<TableCell> TableList::dequeueReusableCell(std::string_view identifier)
 {
     return _reusable.take(identifier);
@@ -36,7 +47,8 @@ std::unique_ptr<TableCell> TableList::dequeueReusableCell(std::string_view ident
 
 void TableList::reloadData()
 {
-    _rowCount = _source.numberOfRows(*this);
+    _rowCount = _source ? _source->numberOfRows(*this) : 0;
+    updateGeometry();
     // Before whatever else waits for reuse, so that each row finds its own cell first.
     std::vector<std::unique_ptr<TableCell>> inView;
     for (auto& [row, cell] : _cells)
@@ -109,7 +121,7 @@ void TableList::layoutRows()
 
 void TableList::showCell(int row)
 {
-    std::unique_ptr<TableCell> cell = _source.cellForRow(*this, row);
+    std::unique_ptr<TableCell> cell = _source->cellForRow(*this, row);
     if (cell->_row != row && cell->sidewaysScrollView())
         cell->sidewaysScrollView()->setOffset(0);
     cell->_row = row;

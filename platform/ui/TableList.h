@@ -37,13 +37,21 @@ public:
 
     static constexpr int kDefaultRowHeight = 44;
 
+    // Empty until it has a source.
+    explicit TableList(QWidget* parent);
     TableList(DataSource& source, QWidget* parent);
     ~TableList() override;
+
+    // Held by address.
+    void setDataSource(DataSource& source);
 
     // Null when no cell with the identifier waits for reuse.
     std::unique_ptr<TableCell> dequeueReusableCell(std::string_view identifier);
     // Asks for everything anew. Keeps the scroll position and the selected row as far as they still exist.
     void reloadData();
+
+    // High enough for all rows.
+    QSize sizeHint() const override { return {0, _rowCount * _rowHeight}; }
 
     int rowCount() const { return _rowCount; }
     int rowHeight() const { return _rowHeight; }
@@ -83,7 +91,7 @@ private:
     bool scrollSideways(int row, int distance);
     SidewaysScrollView* sidewaysViewAtRow(std::optional<int> row) const;
 
-    DataSource& _source;
+    DataSource* _source = nullptr;
     int _rowHeight = kDefaultRowHeight;
     int _rowCount = 0;
     int _offset = 0;

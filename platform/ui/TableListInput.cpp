@@ -99,7 +99,8 @@ void TableList::mouseReleaseEvent(QMouseEvent* event)
     const auto row = rowAt(drag.start());
     if (row)
         selectRow(*row);
-    _source.didSelectRow(*this, row);
+    if (_source)
+        _source->didSelectRow(*this, row);
 }
 
 void TableList::wheelEvent(QWheelEvent* event)
@@ -145,7 +146,7 @@ void TableList::keyPressEvent(QKeyEvent* event)
         return;
     }
     if ((key == Qt::Key_Return || key == Qt::Key_Enter) && _selectedRow)
-        return _source.didSelectRow(*this, _selectedRow);
+        return _source->didSelectRow(*this, _selectedRow);
     QWidget::keyPressEvent(event);
 }
 

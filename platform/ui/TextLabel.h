@@ -8,6 +8,10 @@ namespace orvex {
 // break in it does not break the row. Text that runs beyond the label or its parent ends in an ellipsis.
 class TextLabel final : public QLabel {
 public:
+    explicit TextLabel(QWidget* parent)
+        : TextLabel(QFont(), parent)
+    {
+    }
     explicit TextLabel(const QFont& font, QWidget* parent = nullptr);
 
     void setLine(const QString& text);

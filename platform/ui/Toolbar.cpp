@@ -1,20 +1,12 @@
 #include "Toolbar.h"
 
-#include "Theme.h"
 #include "ToolbarRow.h"
-
-#include <QPainter>
 
 namespace orvex {
 
-namespace {
-constexpr int kSeparatorHeight = 1;
-} // namespace
-
 Toolbar::Toolbar(QWidget* parent)
-    : QWidget(parent)
+    : Bar(parent, Line::above)
 {
-    setAttribute(Qt::WA_OpaquePaintEvent);
 }
 
 void Toolbar::showRow(ToolbarRow* row, const ToolbarRow* replaced)
@@ -33,20 +25,13 @@ void Toolbar::showRow(ToolbarRow* row, const ToolbarRow* replaced)
 
 void Toolbar::place(QWidget& row) const
 {
-    row.setGeometry(0, kSeparatorHeight, width(), height() - kSeparatorHeight);
+    row.setGeometry(0, kLineHeight, width(), height() - kLineHeight);
 }
 
 void Toolbar::resizeEvent(QResizeEvent*)
 {
     if (_row)
         place(*_row);
-}
-
-void Toolbar::paintEvent(QPaintEvent*)
-{
-    QPainter painter(this);
-    painter.fillRect(rect(), Theme::current().bar);
-    painter.fillRect(QRect(0, 0, width(), kSeparatorHeight), Theme::current().barSeparator);
 }
 
 } // namespace orvex

@@ -1,17 +1,16 @@
 #pragma once
 
+#include "Bar.h"
+
 #include <QPointer>
-#include <QWidget>
 
 namespace orvex {
 
 class ToolbarRow;
 
 // The bar at the bottom: shows the row of the screen on top.
-class Toolbar final : public QWidget {
+class Toolbar final : public Bar {
 public:
-    static constexpr int kHeight = 44;
-
     explicit Toolbar(QWidget* parent);
 
     // The row still belongs to its screen. Null empties the bar. Hides the row shown so far, unless that is
@@ -19,7 +18,6 @@ public:
     void showRow(ToolbarRow* row, const ToolbarRow* replaced = nullptr);
 
 protected:
-    void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
 
 private:

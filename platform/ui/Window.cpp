@@ -39,7 +39,7 @@ void Window::presentModally(std::unique_ptr<Screen> screen, bool animated)
     _modal->viewWillAppear(animated);
     _modal->show();
     _modal->raise();
-    _modal->setFocus();
+    _modal->firstResponder().setFocus();
     _slide.start(
         kSlideMilliseconds, [this](double progress) { _modal->move(0, qRound((1 - progress) * height())); },
         // Out of sight the root view is out of the Tab key's reach too.

@@ -64,7 +64,7 @@ TEST_F(OrvexSaveViewControllerTest, SavesWhatThereWasWhenItWasOpened)
     screen.saveDescription().insert(QStringLiteral("ü"));
     clock.moment.secondsSince1970 += 60;
     deliverNeighbors(2); // not in the snapshot any more
-    screen.savePressed();
+    QTest::mouseClick(screen.findChild<QAbstractButton*>(QStringLiteral("saveButton")), Qt::LeftButton);
     EXPECT_EQ(app->saveViewController(), &screen) << "not inside the action of its own button";
     runLoop.runPosted();
     EXPECT_EQ(app->saveViewController(), nullptr);
@@ -83,7 +83,8 @@ TEST_F(OrvexSaveViewControllerTest, SavesWhatThereWasWhenItWasOpened)
 
 TEST_F(OrvexSaveViewControllerTest, CancelSavesNothing)
 {
-    open().cancelPressed();
+    const auto& screen = open();
+    QTest::mouseClick(screen.findChild<QAbstractButton*>(QStringLiteral("cancelButton")), Qt::LeftButton);
     runLoop.runPosted();
     EXPECT_EQ(app->saveViewController(), nullptr);
     EXPECT_TRUE(std::filesystem::is_empty(paths::diagnosticReports()));
@@ -117,10 +118,11 @@ TEST_F(OrvexSaveViewControllerTest, ATouchBesideTheFieldTakesTheKeyboardAway)
 {
     OrvexSaveViewController& screen = open();
     QLineEdit& field = screen.saveDescription();
-    QApplication::setActiveWindow(app->window());
+    EXPECT_TRUE(field.hasFocus()) << "from the start";
     const std::function<void()> touches[] = {
         [&screen] { tapRow(screen.saveContentTable(), 0); },
-        [&screen] { QTest::mouseClick(&screen, Qt::LeftButton, {}, QPoint(100, 600)); },
+        [&screen] { QTest::mouseClick(screen.childAt(100, 600), Qt::LeftButton); },
+        [&screen] { QTest::mouseClick(screen.childAt(20, 110), Qt::LeftButton); }, // the caption
         [&field] { QTest::keyClick(&field, Qt::Key_Return); },
     };
     for (const auto& touch : touches) {
@@ -129,7 +131,12 @@ TEST_F(OrvexSaveViewControllerTest, ATouchBesideTheFieldTakesTheKeyboardAway)
         touch();
         EXPECT_FALSE(field.hasFocus());
     }
-    EXPECT_EQ(screen.saveContentTable().selectedRow(), std::nullopt);
+    EXPECT_EQ(screen.saveContentTable().selectedRow(), 0);
+    for (const auto* button : screen.findChildren<QAbstractButton*>())
+        EXPECT_FALSE(button->isDown());
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
+    runLoop.runPosted();
+    EXPECT_EQ(app->saveViewController(), nullptr);
 }
 
 TEST_F(OrvexSaveViewControllerTest, WithoutContentsSavesAnEmptyListAndNoWords)
