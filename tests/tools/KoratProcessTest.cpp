@@ -43,8 +43,6 @@ TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
         {"no such fault: refuse-channel=0", {"--fault", "refuse-channel=0"}},
         {"no such fault: null-port=1", {"--fault", "null-port=1"}},
         {"unexpected argument: town", {"town"}},
-        {"--record would overwrite the capture that is replayed",
-            {"--replay", capture, "--record", QString::fromStdString(folder.path("./capture"))}},
         {"koratd: /no/such/capture: No such file or directory\n", {"--replay", "/no/such/capture"}, 1},
         {"neither a pcap nor a DLF file\n", {"--replay", capture, "--loop"}, 1},
         {"koratd: /no/such/file: No such file or directory\n", {"--record", "/no/such/file"}, 1},
@@ -56,6 +54,14 @@ TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
         EXPECT_THAT(korat.errors(), HasSubstr(complaint));
         EXPECT_EQ(korat.errors().find("Usage:") != std::string::npos, status == 2) << complaint;
     }
+
+    const QString link = QString::fromStdString(folder.path("link"));
+    ASSERT_TRUE(QFile::link(capture, link));
+    Program overwriting(folder, KORATD_PATH, {"--replay", capture, "--record", link});
+    EXPECT_EQ(overwriting.waitForEnd(), 2);
+    EXPECT_EQ(overwriting.errors(),
+        "koratd: --record " + link.toStdString() + " and --replay " + capture.toStdString()
+            + " are the same file\n");
     EXPECT_EQ(file.size(), 1000);
     Program help(folder, KORATD_PATH, {"--help"});
     EXPECT_EQ(help.waitForEnd(), 0);

@@ -1,9 +1,10 @@
 #include "Options.h"
 
+#include "FileConflict.h"
+
 #include <QCommandLineParser>
 
 #include <cmath>
-#include <filesystem>
 
 namespace orvex::korat {
 
@@ -100,11 +101,17 @@ std::string readCaptures(const QCommandLineParser& parser, Options& options)
         if (parser.isSet(option))
             return std::string("--replay and --") + option + " exclude each other";
     }
-    std::error_code notThere;
-    if (options.record && std::filesystem::equivalent(*options.replay, *options.record, notThere))
-        return "--record would overwrite the capture that is replayed";
     options.scenario = nullptr;
     return {};
+}
+
+// What is wrong with the files; empty when nothing is.
+std::string conflictOf(const Options& options)
+{
+    if (!options.replay || !options.record)
+        return {};
+    return fileConflict({{"--replay " + *options.replay, *options.replay}},
+        {{"--record " + *options.record, *options.record}});
 }
 
 // The options as they stand; the error is empty when all of them make sense.
@@ -181,8 +188,12 @@ OptionsResult optionsFromArguments(const std::vector<std::string>& arguments)
     } else {
         Options options;
         result.error = read(parser, options);
-        if (result.error.empty())
-            result.options = options;
+        if (result.error.empty()) {
+            result.error = conflictOf(options);
+            if (result.error.empty())
+                result.options = options;
+            return result;
+        }
     }
     if (!result.options)
         result.text = parser.helpText().toStdString();

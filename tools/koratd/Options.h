@@ -25,7 +25,7 @@ struct Options {
 struct OptionsResult {
     std::optional<Options> options;
     std::string text;  // without options: what to print instead, help or version...
-    std::string error; // ... or why the line is wrong; the text is the usage then
+    std::string error; // ... or what is wrong; the text is the usage then, unless only a file is at fault
 };
 
 // The arguments, the program's name first.

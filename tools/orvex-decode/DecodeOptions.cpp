@@ -142,6 +142,7 @@ const char* DecodeOptions::usage()
            "A capture is a pcap file with link type 147 (USER0), one log message per packet, or\n"
            "a DLF file. A snapshot is an .orvex file.\n"
            "T is IFX, MRL_GSM, MRL_CDMA, MRL_LTE or MRL_UTRAN2.\n"
+           "No file that is written may be one that is read or written already.\n"
            "\n"
            "Options:\n"
            "  --format tree|json   How to print the tree. Default: tree.\n"

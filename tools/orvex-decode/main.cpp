@@ -1,6 +1,7 @@
 #include "CaptureJobs.h"
 #include "CaptureReader.h"
 #include "DecodeOptions.h"
+#include "FileConflict.h"
 #include "OfflineSession.h"
 #include "Progress.h"
 #include "ReadAhead.h"
@@ -64,10 +65,41 @@ std::string textOf(const Value& display, DecodeOptions::Format format)
                                                  : DisplayTreePrinter::text(*tree);
 }
 
+std::string resourcesOf(const DecodeOptions& options)
+{
+    return options.resources.value_or(FileResources::defaultDirectory());
+}
+
+// Why the files that the options name cannot be used together; empty when they can.
+std::string conflictOf(const DecodeOptions& options)
+{
+    std::vector<FileInUse> inputs;
+    for (const std::string& capture : options.captures)
+        inputs.push_back({"the input " + capture, capture});
+    const std::string resources = resourcesOf(options);
+    for (const std::string& name : FileResources(resources).propertyListPaths())
+        inputs.push_back({"the template " + name, resources + '/' + name});
+
+    std::vector<FileInUse> outputs;
+    if (!options.outputFile)
+        outputs.push_back({"standard output", "/dev/stdout"});
+    const std::pair<const char*, const std::optional<std::string>*> files[] = {
+        {"--output ", &options.outputFile},
+        {"--log ", &options.logFile},
+        {"--snapshot ", &options.snapshotFile},
+        {"--dlf ", &options.dlfFile},
+    };
+    for (const auto& [option, path] : files) {
+        if (*path)
+            outputs.push_back({option + **path, **path});
+    }
+    return fileConflict(inputs, outputs);
+}
+
 // What decoding takes from the platform.
 struct Platform {
     explicit Platform(const DecodeOptions& options)
-        : resources(options.resources.value_or(FileResources::defaultDirectory()))
+        : resources(resourcesOf(options))
     {
     }
 
@@ -195,6 +227,10 @@ int main(int argc, char** argv)
         std::cerr << DecodeOptions::usage();
         return kWrongUsage;
     case DecodeOptions::Action::decode: break;
+    }
+    if (const std::string conflict = conflictOf(options); !conflict.empty()) {
+        complain(conflict);
+        return kWrongUsage;
     }
 
     installConsole([](std::string_view) {}); // standard output carries the document alone

@@ -8,6 +8,7 @@
 #include <gmock/gmock.h>
 
 #include <algorithm>
+#include <filesystem>
 
 namespace orvex::test {
 namespace {
@@ -100,6 +101,47 @@ TEST_F(DecodeTest, WritesDocumentAndLogIntoFiles)
     const Result unwritable = decodeCaptures({PcapFile().bytes()}, {"--output", "/no/such/folder/file"});
     EXPECT_EQ(unwritable.status, 1);
     EXPECT_EQ(unwritable.errors, "orvex-decode: /no/such/folder/file: No such file or directory\n");
+}
+
+TEST_F(DecodeTest, WritesNoFileThatItReadsOrWritesAlready)
+{
+    namespace fs = std::filesystem;
+    const Bytes bytes = PcapFile().add(antennas(4)).bytes();
+    const QString capture = write("x.pcap", bytes);
+    fs::create_hard_link(path("x.pcap"), path("hard"));
+    fs::create_symlink("x.pcap", path("soft"));
+    fs::create_symlink("new", path("dangling"));
+    fs::create_directory(path("folder"));
+    fs::create_symlink("folder/../dangling", path("further"));
+    write("T.plist", Bytes());
+    const struct {
+        QStringList arguments;
+        const char* conflict; // empty: none
+    } cases[] = {
+        {{"--output", name("x.pcap")}, "--output %1/x.pcap and the input %1/x.pcap"},
+        {{"--snapshot", name("folder/../x.pcap")}, "--snapshot %1/folder/../x.pcap and the input %1/x.pcap"},
+        {{"--log", name("hard")}, "--log %1/hard and the input %1/x.pcap"},
+        {{"--jobs", "2", "--log", name("soft")}, "--log %1/soft and the input %1/x.pcap"},
+        {{"--output", name("new"), "--log", name("./new")}, "--log %1/./new and --output %1/new"},
+        {{"--output", name("new"), "--log", name("further")}, "--log %1/further and --output %1/new"},
+        {{"--log", name("dangling"), "--snapshot", name("further")},
+            "--snapshot %1/further and --log %1/dangling"},
+        {{"--output", name("T.plist")}, "--output %1/T.plist and the template T.plist"},
+        {{"--output", "/dev/null", "--log", "/dev/null"}, ""},
+    };
+    const QString folder = name(".").chopped(2);
+    for (const auto& [arguments, conflict] : cases) {
+        const QStringList common{"--technology", "MRL_LTE", "--resources", folder, capture};
+        const Result result = decode(arguments + common);
+        const bool isConflict = *conflict;
+        EXPECT_EQ(result.status, isConflict ? 2 : 0) << conflict;
+        EXPECT_EQ(result.errors,
+            isConflict
+                ? ("orvex-decode: " + QString(conflict).arg(folder) + " are the same file\n").toStdString()
+                : "");
+        EXPECT_EQ(contentsOf(path("x.pcap")), std::string(bytes.begin(), bytes.end())) << conflict;
+        EXPECT_FALSE(fs::exists(path("new"))) << conflict;
+    }
 }
 
 TEST_F(DecodeTest, AsksForTheDisplayAsOftenAsItIsTold)

@@ -1,0 +1,19 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+namespace orvex {
+
+// A file that a program reads or writes.
+struct FileInUse {
+    std::string label; // for the user: "--output x.pcap"
+    std::string path;
+};
+
+// Finds an output that is also an input or another output, whether by its path, a link or a link to a file
+// that does not exist yet. Returns one line that names both, or an empty text. Devices and pipes may be used
+// more than once.
+std::string fileConflict(const std::vector<FileInUse>& inputs, const std::vector<FileInUse>& outputs);
+
+} // namespace orvex
