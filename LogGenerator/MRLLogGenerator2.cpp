@@ -120,6 +120,8 @@ Value MRLLogGenerator2::processTemplate(const Value& object)
     if (object.string())
         return object;
     if (const auto dictionary = object.dictionary()) {
+        for (std::size_t i = 0; i < dictionary->leftOut(); ++i)
+            systemLog(Priority::error, "Dictionary Key is not a string?");
         auto result = Dictionary::make();
         for (const auto& [key, value] : *dictionary) {
             const Value processed = processTemplate(value); // children are bound before their parent

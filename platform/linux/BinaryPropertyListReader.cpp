@@ -87,9 +87,9 @@ private:
         case kUID:
             require(object.size < 8);
             requireBytes(object.content, 1, object.size + 1);
-            return {};
-        case kArray:
-        case kSet: return arrayOf(object, depth);
+            return UID{number(object.content, object.size + 1)};
+        case kArray: return arrayOf(object, depth);
+        case kSet: return Set{arrayOf(object, depth)};
         case kDictionary: return dictionaryOf(object, depth);
         default: throw Fault("an object of unknown kind");
         }
@@ -111,11 +111,12 @@ private:
         requireBytes(object.content, object.size, 2 * _referenceSize);
         auto dictionary = Dictionary::make();
         for (std::uint64_t i = 0; i < object.size; ++i) {
-            _count.addNode();
-            const Object key = objectAt(referenceAt(object, i));
-            if (key.kind != kASCII && key.kind != kUTF16)
-                throw Fault("a key that is no text");
-            dictionary->set(textOf(key), valueOf(referenceAt(object, object.size + i), depth + 1));
+            const Value key = valueOf(referenceAt(object, i), depth + 1);
+            Value value = valueOf(referenceAt(object, object.size + i), depth + 1);
+            if (const std::string* name = key.string())
+                dictionary->set(*name, std::move(value));
+            else
+                dictionary->leaveOutOne();
         }
         return dictionary;
     }

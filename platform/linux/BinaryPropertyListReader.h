@@ -22,8 +22,8 @@ namespace orvex {
 //
 // All numbers are big-endian. An array is followed by references to its elements, a dictionary by those to
 // all keys, then those to all values. Integers of up to four bytes have no sign, those of eight have one,
-// those of sixteen hold what is too large for that and become reals. The identifiers of archives mean nothing
-// outside of them and become null.
+// those of sixteen hold what is too large for that and become reals. A dictionary leaves out what stands
+// under a key that is no text.
 Value readBinaryPropertyList(std::span<const std::uint8_t> list, const PropertyListLimits& limits);
 
 } // namespace orvex

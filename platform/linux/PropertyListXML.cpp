@@ -42,6 +42,9 @@ public:
         case Value::Kind::boolean: return own(plist_new_bool(*value.boolean() ? 1 : 0));
         case Value::Kind::date: return dateNode(*value.date());
         case Value::Kind::data: return dataNode(*value.data());
+        case Value::Kind::uid: return uidNode(*value.uid());
+        case Value::Kind::set:
+            return depth < _limits.maximumDepth ? arrayNode(*value.set()->elements, depth) : nullptr;
         case Value::Kind::array:
             return depth < _limits.maximumDepth ? arrayNode(*value.array(), depth) : nullptr;
         case Value::Kind::dictionary:
@@ -81,6 +84,14 @@ private:
         if (!(seconds >= Range::min() && seconds <= Range::max()))
             return nullptr;
         return own(plist_new_date(static_cast<std::int32_t>(seconds), 0));
+    }
+
+    // XML has no UIDs; this is what others write for one.
+    static PropertyListNode uidNode(UID uid)
+    {
+        auto node = own(plist_new_dict());
+        plist_dict_set_item(node.get(), "CF$UID", plist_new_uint(uid.number));
+        return node;
     }
 
     PropertyListNode arrayNode(const Array& array, std::size_t depth)

@@ -58,6 +58,11 @@ public:
         return isThere ? &_entries[position].value : nullptr;
     }
 
+    // Entries that the file the dictionary was read from has under keys that are no strings. They are not in
+    // the dictionary; a copy knows nothing of them.
+    std::size_t leftOut() const { return _leftOut; }
+    void leaveOutOne() { ++_leftOut; }
+
     DictionaryRef shallowCopy() const;
 
     // Equal entries in any order.
@@ -76,6 +81,7 @@ private:
     // Open addressing, its size a power of two: each place holds a position in _entries plus one, or zero
     // when it is free. Empty while the dictionary is small.
     std::vector<std::uint32_t> _index;
+    std::size_t _leftOut = 0;
 };
 
 } // namespace orvex

@@ -3,6 +3,8 @@
 #include "Array.h"
 #include "Dictionary.h"
 
+#include <algorithm>
+
 namespace orvex {
 
 Value::Value(BytesRef data)
@@ -23,6 +25,12 @@ Value::Value(DictionaryRef dictionary)
         _content = std::move(dictionary);
 }
 
+Value::Value(Set set)
+{
+    if (set.elements)
+        _content = std::move(set);
+}
+
 Value Value::shallowCopy() const
 {
     switch (kind()) {
@@ -35,12 +43,16 @@ Value Value::shallowCopy() const
 
 Value Value::deepCopy() const
 {
-    if (const ArrayRef elements = array()) {
+    const auto copyOf = [](const Array& elements) {
         auto copy = Array::make();
-        for (const Value& element : *elements)
+        for (const Value& element : elements)
             copy->append(element.deepCopy());
         return copy;
-    }
+    };
+    if (const Array* elements = heldArray())
+        return copyOf(*elements);
+    if (const Set* held = set())
+        return Set{copyOf(*held->elements)};
     if (const DictionaryRef entries = dictionary()) {
         auto copy = Dictionary::make();
         for (const auto& [key, value] : *entries)
@@ -64,6 +76,10 @@ bool operator==(const Value& left, const Value& right)
     case Value::Kind::real: return *left.real() == *right.real();
     case Value::Kind::boolean: return *left.boolean() == *right.boolean();
     case Value::Kind::date: return *left.date() == *right.date();
+    case Value::Kind::uid: return *left.uid() == *right.uid();
+    case Value::Kind::set:
+        return std::is_permutation(left.set()->elements->begin(), left.set()->elements->end(),
+            right.set()->elements->begin(), right.set()->elements->end());
     }
     return false;
 }
@@ -71,7 +87,7 @@ bool operator==(const Value& left, const Value& right)
 const char* nameOf(Value::Kind kind)
 {
     static constexpr const char* kNames[] = {
-        "null", "string", "integer", "real", "boolean", "date", "data", "array", "dictionary"};
+        "null", "string", "integer", "real", "boolean", "date", "data", "array", "dictionary", "UID", "set"};
     return kNames[static_cast<std::size_t>(kind)];
 }
 

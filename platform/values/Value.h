@@ -21,6 +21,18 @@ using ArrayRef = std::shared_ptr<Array>;
 using DictionaryRef = std::shared_ptr<Dictionary>;
 using BytesRef = std::shared_ptr<Bytes>;
 
+// The reference that archives keep to an object of theirs.
+struct UID {
+    std::uint64_t number = 0;
+
+    friend bool operator==(const UID&, const UID&) = default;
+};
+
+// Elements in no order. They are not changed any more.
+struct Set {
+    std::shared_ptr<const Array> elements;
+};
+
 // The one value type of property lists, generator state, display dictionary and snapshots.
 //
 // Scalars are held by value. Arrays, dictionaries and byte buffers are held by reference: copying a Value
@@ -28,9 +40,12 @@ using BytesRef = std::shared_ptr<Bytes>;
 //
 // A text may be given as a LateText. Nobody can tell: it is made by whoever reads it first. For its sake a
 // value is read by one thread at a time.
+//
+// UIDs and sets come out of binary property lists alone. Nothing in Orvex makes use of them; they are kept so
+// that they are not taken for something else.
 class Value {
 public:
-    enum class Kind { null, string, integer, real, boolean, date, data, array, dictionary };
+    enum class Kind { null, string, integer, real, boolean, date, data, array, dictionary, uid, set };
 
     Value() = default;
     Value(std::string text)
@@ -69,6 +84,11 @@ public:
     Value(BytesRef data);
     Value(ArrayRef array);
     Value(DictionaryRef dictionary);
+    Value(UID uid)
+        : _content(uid)
+    {
+    }
+    Value(Set set);
 
     Kind kind() const
     {
@@ -90,6 +110,8 @@ public:
     BytesRef data() const { return reference<BytesRef>(); }
     ArrayRef array() const { return reference<ArrayRef>(); }
     DictionaryRef dictionary() const { return reference<DictionaryRef>(); }
+    const UID* uid() const { return std::get_if<UID>(&_content); }
+    const Set* set() const { return std::get_if<Set>(&_content); }
     // The same for a look, without a share in it.
     Array* heldArray() const { return reference<ArrayRef>().get(); }
     Dictionary* heldDictionary() const { return reference<DictionaryRef>().get(); }
@@ -134,7 +156,7 @@ private:
 
     // In the order of Kind.
     mutable std::variant<std::monostate, std::string, std::int64_t, double, bool, Date, BytesRef, ArrayRef,
-        DictionaryRef, LateText>
+        DictionaryRef, UID, Set, LateText>
         _content;
 };
 

@@ -2,7 +2,7 @@
 
 #include "GSM/MRL_GSMClassIndex.h"
 
-#include "PropertyList.h"
+#include "PropertyListForms.h"
 #include "SectionCases.h"
 
 namespace orvex::test {
@@ -44,12 +44,17 @@ TEST(ExtraPackets, SimFilesAndPDPContexts)
 TEST(ExtraPackets, AreReadInBinaryFormToo)
 {
     const MRL_GSMClassIndex index;
-    const auto packet = packetOfText("FF0000: <dict><key>kSimFile_ICCID</key><string>8901</string></dict>");
-    const auto list = propertyListFromData(ByteView(packet).subspan(kPacketHeaderLength));
-    const Bytes binary = propertyListBinary(list.value.value()).value();
+    const auto text = [](std::string_view characters) {
+        Bytes object{0x5F, 0x10, static_cast<std::uint8_t>(characters.size())};
+        object.insert(object.end(), characters.begin(), characters.end());
+        return object;
+    };
+    const Bytes binary = binaryList({{0xD3, 1, 2, 3, 4, 5, 6}, text("kSimFile_ICCID"), text("kSimFile_LOCI"),
+        text("kSimFile_AD"), text("8901"), {0x80, 7}, {0xC1, 4}});
     Bytes bytes = packetHeader(kExtraCodeSimFiles);
     bytes.insert(bytes.end(), binary.begin(), binary.end());
-    EXPECT_EQ(outcomeOf(*index.getClass("SIM Info"), {bytes}).shown, "EF-ICCID=8901");
+    EXPECT_EQ(outcomeOf(*index.getClass("SIM Info"), {bytes}).shown,
+        "EF-ICCID=8901, EF-LOCI=(UID), EF-ADMINISTRATIVE DATA=(set)");
 }
 
 } // namespace

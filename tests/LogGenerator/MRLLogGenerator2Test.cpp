@@ -134,6 +134,17 @@ TEST_F(MRLLogGenerator2Test, TemplateWithAnotherKindOfValueIsFatal)
     }
 }
 
+TEST_F(MRLLogGenerator2Test, TemplateEntryUnderAnotherKeyThanATextIsReported)
+{
+    const auto group = (*resources.templates["Probe"])["Group"].dictionary();
+    group->leaveOutOne();
+    const auto generator = makeGenerator();
+    RecordingLog log;
+    generator->getDisplayFromState(state);
+    EXPECT_THAT(log.take(), testing::Contains("<3>Dictionary Key is not a string?"));
+    EXPECT_EQ(display(), "First={Packet=-}, Group={Second={}, Text=as it is}");
+}
+
 TEST_F(MRLLogGenerator2Test, SuccessorsShareTheDisplayOfTheirTemplate)
 {
     state.set("Display", Dictionary::make({{"Foreign", "x"}})); // without a template it is nobody's

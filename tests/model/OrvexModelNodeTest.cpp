@@ -56,9 +56,10 @@ TEST(OrvexModelNode, ShowsEveryKindOfObject)
         {"arrays in arrays", Array::make({Array::make(), Array::make({"a"})}),
             Tree{"/", "/0", "/1", "/1/0=a"}},
         {"other values are unknown",
-            Dictionary::make(
-                {{"n", 1}, {"r", 1.5}, {"t", true}, {"d", Date()}, {"b", std::make_shared<Bytes>()}}),
-            Tree{"/", "/n=(unknown)", "/r=(unknown)", "/t=(unknown)", "/d=(unknown)", "/b=(unknown)"}},
+            Dictionary::make({{"n", 1}, {"r", 1.5}, {"t", true}, {"d", Date()},
+                {"b", std::make_shared<Bytes>()}, {"u", UID()}, {"s", Set{Array::make({"a"})}}}),
+            Tree{"/", "/n=(unknown)", "/r=(unknown)", "/t=(unknown)", "/d=(unknown)", "/b=(unknown)",
+                "/u=(unknown)", "/s=(unknown)"}},
         {"only the top dictionary is sorted",
             Dictionary::make({{"_sorted", ""}, {"1;S", Dictionary::make({{"2;b", ""}, {"1;a", ""}})}}),
             Tree{"/", "/S", "/S/2;b=", "/S/1;a="}},

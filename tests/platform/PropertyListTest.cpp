@@ -76,14 +76,20 @@ TEST(PropertyList, ReadsEachKindOfBinaryValue)
         {"double", {{0x23, 0xBF, 0xD0, 0, 0, 0, 0, 0, 0}}, -0.25},
         {"date with a fraction", {{0x33, 0x3F, 0xF8, 0, 0, 0, 0, 0, 0}}, Date{978307201.5}},
         {"data", {{0x42, 0, 0xFF}}, data({0, 255})},
-        {"identifier", {{0x80, 5}}, {}},
+        {"UID", {{0x81, 5, 7}}, UID{0x0507}},
+        {"set", {{0xC2, 1, 2}, {0x08}, {0x51, 'a'}}, Set{Array::make({"a", false})}},
         {"shared element", {{0xA2, 1, 1}, {0x09}}, Array::make({true, true})},
         {"dictionary", {{0xD2, 1, 2, 3, 4}, {0x51, 'z'}, {0x51, 'a'}, {0x08}, {0xA0}},
             Dictionary::make({{"z", false}, {"a", Array::make()}})},
+        {"keys that are no texts", {{0xD3, 1, 2, 3, 3, 4, 2}, {0x10, 1}, {0x51, 'a'}, {0xA0}, {0x08}},
+            Dictionary::make({{"a", false}})},
     };
     for (const auto& test : cases) {
         const auto result = propertyListFromData(binaryList(test.objects));
         EXPECT_TRUE(result.value == test.value) << test.name << ": " << result.error;
+        const auto dictionary = result.value.value_or(Value()).dictionary();
+        EXPECT_TRUE(!dictionary || dictionary->leftOut() == (test.objects[0][0] & 0xFU) - dictionary->size())
+            << test.name;
     }
 }
 
@@ -100,6 +106,8 @@ TEST(PropertyList, WritesEachKindAsXML)
         {Date{-1.5}, "<date>1969-12-31T23:59:58Z</date>"},
         {Dictionary::make({{"k\x02", Array::make()}}), "<key>k\uFFFD</key>\n\t<array/>"},
         {data({0, 1, 255, 126}), "AAH/fg=="},
+        {UID{7}, "<dict>\n\t<key>CF$UID</key>\n\t<integer>7</integer>\n</dict>"},
+        {Set{Array::make({"a"})}, "<array>\n\t<string>a</string>\n</array>"},
     };
     for (const auto& [value, expected] : cases) {
         const Bytes xml = propertyListXML(value).value();

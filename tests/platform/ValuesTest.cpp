@@ -104,13 +104,14 @@ TEST(Value, ContainersAreSharedAndShallowCopiesShareWhatTheyHold)
 TEST(Value, KindsAreToldApart)
 {
     const Value values[] = {{}, "1", 1, 1.0, true, Date{1}, std::make_shared<Bytes>(Bytes{1}),
-        Array::make({1}), Dictionary::make({{"1", 1}})};
+        Array::make({1}), Dictionary::make({{"1", 1}}), UID{1}, Set{Array::make({1})}};
     for (const Value& one : values) {
         for (const Value& other : values)
             EXPECT_EQ(one == other, &one == &other) << nameOf(one.kind()) << ' ' << nameOf(other.kind());
     }
     EXPECT_TRUE(Dictionary({{"a", 1}, {"b", 2}}) == Dictionary({{"b", 2}, {"a", 1}}));
     EXPECT_FALSE(Dictionary({{"a", 1}}) == Dictionary({{"b", 1}}));
+    EXPECT_EQ(Value(Set{Array::make({1, 2})}), Value(Set{Array::make({2, 1})}));
 }
 
 TEST(Array, GrowsFromItselfAndLosesItsFirst)

@@ -3,6 +3,7 @@
 #include "AssertionFailure.h"
 
 #include "GeneratorFixture.h"
+#include "PropertyListForms.h"
 
 namespace orvex::test {
 namespace {
@@ -85,16 +86,18 @@ TEST_F(GSMLogGeneratorTest, OtherMessagesAreFatal)
 {
     const std::string place = "LogGenerator/GSM/GSMLogGenerator, line ";
     const std::string unknown = " encountered (processObject:, " + place + "78)";
-    const std::pair<const char*, std::string> cases[] = {
-        {"<integer>1</integer>", "Unknown object of type integer" + unknown},
-        {"<dict><key>A</key><real>1</real></dict>", "Unknown object of type real" + unknown},
-        {"<array><string>h</string><true/></array>", "Unknown object of type boolean" + unknown},
-        {"<array><true/><data>AAAA</data></array>", "Unknown object of type data" + unknown},
-        {"<dict>", "Could not deserialize the object (updateState:withData:, " + place + "90)"},
+    const std::pair<Bytes, std::string> cases[] = {
+        {message("<integer>1</integer>"), "Unknown object of type integer" + unknown},
+        {message("<dict><key>A</key><real>1</real></dict>"), "Unknown object of type real" + unknown},
+        {message("<array><string>h</string><true/></array>"), "Unknown object of type boolean" + unknown},
+        {message("<array><true/><data>AAAA</data></array>"), "Unknown object of type data" + unknown},
+        {binaryList({{0xD1, 1, 2}, {0x51, 'A'}, {0x80, 7}}), "Unknown object of type UID" + unknown},
+        {binaryList({{0xD1, 1, 2}, {0x51, 'A'}, {0xC1, 1}}), "Unknown object of type set" + unknown},
+        {message("<dict>"), "Could not deserialize the object (updateState:withData:, " + place + "90)"},
     };
-    for (const auto& [inner, text] : cases) {
+    for (const auto& [bytes, text] : cases) {
         try {
-            generator.updateState(state, message(inner));
+            generator.updateState(state, bytes);
             ADD_FAILURE() << text;
         } catch (const AssertionFailure& failure) {
             EXPECT_EQ(failure.what(), text);
