@@ -23,7 +23,8 @@ DictionaryRef entryEndingAtFirstAbsent(std::initializer_list<Dictionary::Entry> 
     for (const auto& [key, value] : entries) {
         if (value.isNull())
             break;
-        result->set(key, value.shallowCopy());
+        // Bytes are replaced in the state, never changed: they need no copy of their own.
+        result->set(key, value.data() ? value : value.shallowCopy());
     }
     return result;
 }

@@ -35,7 +35,7 @@ public:
 
     // Appends copies of "DisplayState", "Display" and "ExtraInfo" with the current date to "History" and
     // drops the oldest entries beyond five. The copies are shallow: an entry keeps seeing what happens inside
-    // nested sections. The entry ends before the first of the three that is absent.
+    // nested sections. Bytes are shared. The entry ends before the first of the three that is absent.
     static void updateHistoryInState(Dictionary& state, const Clock& clock);
 
     // What the session sends to start the stream.

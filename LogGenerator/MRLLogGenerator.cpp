@@ -6,25 +6,44 @@
 #include "SystemLog.h"
 #include "TextFormat.h"
 
-#include <utility>
-
 namespace orvex {
 
 namespace {
 // What the report has always said in place of the program's name and date.
 constexpr const char* kExecutableName = "EXECUTABLE_NAME";
 constexpr const char* kBuildDate = "Dec 19 2018 23:59:16";
+
+// Leaves the newest entries theirs, as far as there is room, and the others none.
+void dropOldestPackets(const Array& history, std::size_t room)
+{
+    std::size_t dropped = 0;
+    for (std::size_t i = history.size(); i > 0; --i) {
+        const DictionaryRef entry = history[i - 1].dictionary();
+        const BytesRef packets = entry ? (*entry)["DisplayState"].data() : nullptr;
+        if (!packets)
+            continue;
+        if (packets->size() <= room) {
+            room -= packets->size();
+            continue;
+        }
+        room = 0;
+        dropped += packets->size();
+        entry->set("DisplayState", std::make_shared<Bytes>());
+    }
+    if (dropped > 0)
+        systemLog(Priority::warning, "The history dropped its oldest raw packets, %zu bytes", dropped);
+}
 } // namespace
 
 MRLLogGenerator::MRLLogGenerator(const GeneratorEnvironment& environment)
     : LogGenerator(environment)
-    , _binData(std::make_shared<Bytes>())
+    , _binData(environment.rawPacketLimit)
 {
 }
 
 BytesRef MRLLogGenerator::generateDlfFromState(const Dictionary& state) const
 {
-    const auto& [resources, clock, buildVersion] = environment();
+    const auto& [resources, clock, buildVersion, rawPacketLimit] = environment();
     const std::string version = buildVersion ? text("Orvex %s", buildVersion->c_str()) : "(none)";
     const Date now = clock.now();
     const Clock::Zone zone = clock.zoneAt(now);
@@ -77,10 +96,14 @@ ArrayRef MRLLogGenerator::getSaveContentsFromState(const Dictionary& state) cons
 
 void MRLLogGenerator::handOverBinData(Dictionary& state)
 {
-    auto next = std::make_shared<Bytes>();
-    if (_binData)
-        next->reserve(_binData->size()); // one interval is much like the next
-    state.set("DisplayState", std::exchange(_binData, std::move(next)));
+    state.set("DisplayState", Value()); // also the history's, which may drop it now
+    if (!_binData) {
+        _binData.emplace(environment().rawPacketLimit);
+        return;
+    }
+    if (const ArrayRef history = state["History"].array())
+        dropOldestPackets(*history, environment().rawPacketLimit - _binData->size());
+    state.set("DisplayState", _binData->take());
 }
 
 } // namespace orvex

@@ -1,6 +1,9 @@
 #pragma once
 
 #include "LogGenerator.h"
+#include "RawPackets.h"
+
+#include <optional>
 
 namespace orvex {
 
@@ -9,6 +12,10 @@ namespace orvex {
 //
 // A DLF is a flat sequence of records: u16 length (the record's own), u16 log code, 8 bytes time, payload.
 // A log packet is such a record once its first byte, the log type, is removed.
+//
+// What a peer sends does not decide how much memory this takes: an interval keeps what RawPackets keeps, and
+// the history as a whole no more than one interval may. When a new interval does not fit beside the older
+// ones, the oldest lose their packets, each all of its own; their displays stay.
 class MRLLogGenerator : public LogGenerator {
 public:
     explicit MRLLogGenerator(const GeneratorEnvironment& environment);
@@ -31,7 +38,7 @@ protected:
     // Moves the packets gathered so far into the state's "DisplayState" and starts anew.
     void handOverBinData(Dictionary& state);
 
-    BytesRef _binData; // every message since the last display request, in order of arrival
+    std::optional<RawPackets> _binData; // since the last display request
 };
 
 } // namespace orvex

@@ -43,7 +43,7 @@ void MRLLogGenerator2::updateState(Dictionary& state, ByteView data)
         getDisplayFromState(state);
     updateWithData(data);
     if (_binData)
-        _binData->insert(_binData->end(), data.begin(), data.end());
+        _binData->append(data);
 }
 
 void MRLLogGenerator2::updateWithData(ByteView data)

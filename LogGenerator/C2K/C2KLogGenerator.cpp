@@ -133,7 +133,7 @@ void C2KLogGenerator::updateFromLog(
         return;
     const Packet packet = frame.packet();
     decoder->decode(packet, usingState, Publisher(usingLookup));
-    _binData->insert(_binData->end(), packet.begin(), packet.end());
+    _binData->append(packet);
 }
 
 } // namespace orvex

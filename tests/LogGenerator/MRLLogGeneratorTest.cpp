@@ -4,6 +4,8 @@
 #include "GeneratorFixture.h"
 #include "PacketText.h"
 
+#include "TextFormat.h"
+
 namespace orvex::test {
 namespace {
 
@@ -11,8 +13,13 @@ class ProbeGenerator final : public MRLLogGenerator {
 public:
     using MRLLogGenerator::MRLLogGenerator;
     DictionaryRef getStartCommand() const override { return nullptr; }
-    void updateState(Dictionary&, ByteView) override { }
-    Value generateLogUsingState(Dictionary&) override { return {}; }
+    void updateState(Dictionary&, ByteView data) override { _binData->append(data); }
+    Value generateLogUsingState(Dictionary& state) override
+    {
+        handOverBinData(state);
+        updateHistoryInState(state, environment().clock);
+        return {};
+    }
 };
 
 class MRLLogGeneratorTest : public GeneratorFixture {
@@ -71,6 +78,61 @@ TEST_F(MRLLogGeneratorTest, SaveContentsAreTheHistoryAndTheDLF)
     (*history)[0].dictionary()->remove("DisplayState");
     EXPECT_EQ(generator.getSaveContentsFromState({{"History", history}})->size(), 2U);
     EXPECT_EQ(history->size(), 1U) << "the history itself is left alone";
+}
+
+// The sizes of what each history entry keeps, oldest first.
+std::vector<std::size_t> sizesOf(const Array& history)
+{
+    std::vector<std::size_t> sizes;
+    for (const Value& entry : history)
+        sizes.push_back((*entry.dictionary())["DisplayState"].data()->size());
+    return sizes;
+}
+
+TEST_F(MRLLogGeneratorTest, RawPacketsStayWithinTheirLimit)
+{
+    using Sizes = std::vector<std::size_t>;
+    const Lines full = {"<4>The raw packets since the last refresh exceed 80 bytes, dropping the oldest"};
+    const auto aged = [](int bytes) {
+        return Lines{text("<4>The history dropped its oldest raw packets, %d bytes", bytes)};
+    };
+    const struct {
+        int packets; // of 4 bytes, in this interval
+        Sizes kept;
+        Lines lines;
+    } intervals[] = {
+        {5, {20}, {}},
+        {15, {20, 60}, {}}, // the limit
+        {3, {0, 60, 12}, aged(20)},
+        {20, {0, 0, 0, 80}, aged(72)},
+        {21, {0, 0, 0, 0, 76}, {full[0], aged(80)[0]}},
+        {50, {0, 0, 0, 0, 80}, {full[0], aged(76)[0]}},
+        {0, {0, 0, 0, 80, 0}, {}},
+    };
+    const GeneratorEnvironment limited{
+        .resources = resources, .clock = clock, .buildVersion = {}, .rawPacketLimit = 80};
+    ProbeGenerator generator(limited);
+    RecordingLog log;
+    std::uint8_t number = 0;
+    for (const auto& [packets, kept, lines] : intervals) {
+        for (int i = 0; i < packets; ++i)
+            generator.updateState(state, Bytes{1, 2, 3, ++number});
+        generator.generateLogUsingState(state);
+        const Array& history = *state["History"].array();
+        EXPECT_EQ(sizesOf(history), kept) << packets;
+        EXPECT_EQ(log.take(), lines) << packets;
+        const Bytes& newest = *state["DisplayState"].data();
+        EXPECT_TRUE(newest.empty() || (newest[0] == 1 && newest.back() == number)) << packets;
+    }
+    generator.updateState(state, Bytes(81)); // longer than the limit: nothing fits beside it, nor does it
+    generator.generateLogUsingState(state);
+    EXPECT_TRUE(state["DisplayState"].data()->empty());
+
+    ProbeGenerator keepsNone({resources, clock, {}, 0});
+    log.take();
+    keepsNone.updateState(state, Bytes(5));
+    keepsNone.generateLogUsingState(state);
+    EXPECT_TRUE(state["DisplayState"].data()->empty());
 }
 
 TEST(MTLDLFAddVersionReport, NeedsRoomForAllOfIt)

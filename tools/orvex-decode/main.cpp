@@ -100,17 +100,19 @@ std::string conflictOf(const DecodeOptions& options)
 struct Platform {
     explicit Platform(const DecodeOptions& options)
         : resources(resourcesOf(options))
+        , rawPacketLimit(options.snapshotFile ? RawPackets::kLimit : 0)
     {
     }
 
     std::unique_ptr<LogGenerator> generatorFor(const std::string& technology) const
     {
         return LogGenerator::generatorFromTechnology(
-            technology, GeneratorEnvironment{resources, clock, ORVEX_VERSION});
+            technology, GeneratorEnvironment{resources, clock, ORVEX_VERSION, rawPacketLimit});
     }
 
     FileResources resources;
     SystemClock clock;
+    std::size_t rawPacketLimit; // only a snapshot needs them
 };
 
 // False, after a line on standard error, when there is no template to lay the display out.
