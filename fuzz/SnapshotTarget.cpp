@@ -10,7 +10,7 @@
 #include "TreeJson.h"
 #include "XMLText.h"
 
-#include <nlohmann/json.hpp>
+#include <sstream>
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
 {
@@ -24,7 +24,9 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
     DisplayTreePrinter::text(*snapshotTree(*read.snapshot));
     const SnapshotDocument document(*read.snapshot);
     document.tree();
-    documentText(document.json());
+    std::ostringstream text;
+    JsonWriter json(text);
+    document.writeJson(json);
 
     const fuzz::MemoryFile copy;
     if (!writeSnapshot(*read.snapshot, copy.path()))

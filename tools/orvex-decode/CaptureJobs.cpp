@@ -1,13 +1,13 @@
 #include "CaptureJobs.h"
 
+#include "JsonWriter.h"
 #include "Progress.h"
 #include "Reporting.h"
 #include "TemporaryFile.h"
-#include "TreeJson.h"
 #include "WorkerPool.h"
 
-#include <nlohmann/json.hpp>
-
+#include <algorithm>
+#include <array>
 #include <cerrno>
 #include <cstring>
 #include <iostream>
@@ -18,8 +18,6 @@
 namespace orvex {
 
 namespace {
-
-using Json = nlohmann::ordered_json;
 
 // What a worker writes, until it is its turn.
 struct Results {
@@ -46,14 +44,52 @@ public:
                 [this](std::size_t job) { return perform(job); },
                 [this](std::size_t job, const WorkerPool::End& end) { report(job, end); }});
         closeLog();
-        if (!_documents.empty() || !_json.empty())
-            _isGood = printDocument(document(), _options) && _isGood;
+        if (!_parts.empty())
+            _isGood = printDocument([this](std::ostream& stream) { write(stream); }, _options) && _isGood;
         return _isGood ? EXIT_SUCCESS : EXIT_FAILURE;
     }
 
 private:
-    bool isJson() const { return _options.format == DecodeOptions::Format::json; }
-    std::string document() const { return isJson() ? documentText({{"captures", _json}}) : _documents; }
+    // Calls `take` with all that a part of the documents holds, piece by piece, but for its last bytes.
+    template <typename Take>
+    void read(std::size_t length, std::size_t omitted, Take take)
+    {
+        std::array<char, 65536> chunk; // NOLINT(cppcoreguidelines-pro-type-member-init): filled by fread()
+        while (length > 0) {
+            const std::size_t wanted = std::min(length, chunk.size());
+            const std::size_t count = std::fread(chunk.data(), 1, wanted, _documents.stream());
+            if (count == 0)
+                return;
+            length -= count;
+            take(std::string_view(chunk.data(), count - (length == 0 ? omitted : 0)));
+        }
+    }
+
+    void write(std::ostream& stream)
+    {
+        std::rewind(_documents.stream());
+        if (_options.format == DecodeOptions::Format::tree) {
+            for (const auto& [capture, length] : _parts)
+                read(length, 0, [&](std::string_view piece) { stream << piece; });
+            return;
+        }
+        constexpr std::size_t kLineBreak = 1; // at the end of each document
+        JsonWriter json(stream);
+        json.beginObject();
+        json.key("captures");
+        json.beginArray();
+        for (const auto& [capture, length] : _parts) {
+            json.beginObject();
+            json.member("capture", capture);
+            json.key("display");
+            json.beginText();
+            read(length, kLineBreak, [&](std::string_view piece) { json.text(piece); });
+            json.endObject();
+        }
+        json.endArray();
+        json.endObject();
+        json.endDocument();
+    }
 
     // In the worker.
     int perform(std::size_t job)
@@ -79,11 +115,11 @@ private:
         _isGood = _isGood && end.isGood;
         if (_log && !results.log.appendTo(_log))
             failLog();
-        const std::string document = results.document.contents();
-        if (!isJson())
-            _documents += document;
-        else if (!document.empty())
-            _json.push_back({{"capture", capture}, {"display", Json::parse(document)}});
+        const auto length = results.document.appendTo(_documents.stream());
+        if (!length || std::fflush(_documents.stream()) != 0)
+            _isGood = complain(capture + ": " + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
+        else if (*length > 0)
+            _parts.push_back({capture, *length});
         _results.erase(job);
         _progress.advanceOverFile(capture);
     }
@@ -110,8 +146,13 @@ private:
     Progress _progress;
     std::FILE* _log = nullptr;
     std::map<std::size_t, Results> _results; // of jobs that are not yet reported
-    std::string _documents;
-    Json _json = Json::array();
+    // All documents, back to back, and whose they are.
+    struct Part {
+        std::string capture;
+        std::size_t length;
+    };
+    TemporaryFile _documents;
+    std::vector<Part> _parts;
     bool _isGood = true;
 };
 

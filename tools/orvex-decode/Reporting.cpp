@@ -15,18 +15,27 @@ bool complain(const std::string& message)
     return false;
 }
 
-bool writeFile(const std::string& path, std::string_view content)
+namespace {
+bool writeFile(const std::string& path, const std::function<void(std::ostream&)>& write)
 {
     std::ofstream file(path, std::ios::binary);
-    file << content << std::flush;
+    write(file);
+    file.flush();
     return file ? true : complain(path + ": " + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
 }
+} // namespace
 
-bool printDocument(const std::string& document, const DecodeOptions& options)
+bool writeFile(const std::string& path, std::string_view content)
+{
+    return writeFile(path, [content](std::ostream& stream) { stream << content; });
+}
+
+bool printDocument(const std::function<void(std::ostream&)>& write, const DecodeOptions& options)
 {
     if (options.outputFile)
-        return writeFile(*options.outputFile, document);
-    std::cout << document << std::flush;
+        return writeFile(*options.outputFile, write);
+    write(std::cout);
+    std::cout.flush();
     return std::cout ? true : complain("standard output: could not be written");
 }
 

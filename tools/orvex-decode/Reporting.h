@@ -2,6 +2,8 @@
 
 #include "DecodeOptions.h"
 
+#include <functional>
+#include <ostream>
 #include <string>
 #include <string_view>
 
@@ -14,6 +16,6 @@ bool complain(const std::string& message);
 // Replaces the file.
 bool writeFile(const std::string& path, std::string_view content);
 // Where the options want the document to go.
-bool printDocument(const std::string& document, const DecodeOptions& options);
+bool printDocument(const std::function<void(std::ostream&)>& write, const DecodeOptions& options);
 
 } // namespace orvex

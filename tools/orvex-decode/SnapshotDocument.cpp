@@ -11,8 +11,6 @@
 #include "SnapshotTree.h"
 #include "TextFormat.h"
 
-#include <nlohmann/json.hpp>
-
 #include <utility>
 
 namespace orvex {
@@ -83,21 +81,29 @@ std::string SnapshotDocument::tree() const
     return DisplayTreePrinter::text(*treeOf(rows.dictionary()));
 }
 
-nlohmann::ordered_json SnapshotDocument::json() const
+void SnapshotDocument::writeJson(JsonWriter& json) const
 {
-    using Json = nlohmann::ordered_json;
-    Json entries = Json::array();
+    json.beginObject();
+    json.member("timestamp", _timestamp);
+    json.member("description", _description);
+    json.key("entries");
+    json.beginArray();
     for (const Entry& entry : _entries) {
-        Json item = {{"description", entry.description}};
+        json.beginObject();
+        json.member("description", entry.description);
         if (const std::string* date = entry.date.string())
-            item["date"] = *date;
-        if (!entry.display.isNull())
-            item["display"] = treeJson(*treeOf(entry.display));
-        if (!entry.decoded.isNull())
-            item["decoded"] = treeJson(*treeOf(entry.decoded));
-        entries.push_back(std::move(item));
+            json.member("date", *date);
+        for (const auto& [name, display] :
+            {std::pair<const char*, const Value&>{"display", entry.display}, {"decoded", entry.decoded}}) {
+            if (display.isNull())
+                continue;
+            json.key(name);
+            writeTreeJson(json, *treeOf(display));
+        }
+        json.endObject();
     }
-    return {{"timestamp", _timestamp}, {"description", _description}, {"entries", std::move(entries)}};
+    json.endArray();
+    json.endObject();
 }
 
 } // namespace orvex

@@ -1,9 +1,8 @@
 #pragma once
 
+#include "JsonWriter.h"
 #include "LogGenerator.h"
 #include "Snapshot.h"
-
-#include <nlohmann/json_fwd.hpp>
 
 #include <memory>
 #include <string>
@@ -25,7 +24,7 @@ public:
     // {"timestamp": …, "description": …, "entries": [{"description": …, "date": …, "display": TREE,
     // "decoded": TREE}, …]}, the trees as those of captures. An entry without display has none, one without
     // messages is not decoded.
-    nlohmann::ordered_json json() const;
+    void writeJson(JsonWriter& json) const;
 
     // The binary log; null when the snapshot holds none.
     const BytesRef& dlf() const { return _dlf; }

@@ -39,15 +39,17 @@ std::string TemporaryFile::contents() const
     return result;
 }
 
-bool TemporaryFile::appendTo(std::FILE* stream) const
+std::optional<std::size_t> TemporaryFile::appendTo(std::FILE* stream) const
 {
     Chunk chunk;
+    std::size_t total = 0;
     std::rewind(_file.get());
     while (const std::size_t length = std::fread(chunk.data(), 1, chunk.size(), _file.get())) {
         if (std::fwrite(chunk.data(), 1, length, stream) != length)
-            return false;
+            return std::nullopt;
+        total += length;
     }
-    return true;
+    return total;
 }
 
 } // namespace orvex

@@ -2,6 +2,7 @@
 
 #include <cstdio>
 #include <memory>
+#include <optional>
 #include <string>
 
 namespace orvex {
@@ -18,8 +19,9 @@ public:
     std::string path() const;
 
     std::string contents() const;
-    // False when the stream could not be written.
-    bool appendTo(std::FILE* stream) const;
+    // The number of bytes; none when the stream could not be written.
+    std::optional<std::size_t> appendTo(std::FILE* stream) const;
+    std::FILE* stream() const { return _file.get(); }
 
 private:
     struct Close {

@@ -2,36 +2,55 @@
 
 #include "NodesByPath.h"
 
-#include <nlohmann/json.hpp>
+#include <algorithm>
+#include <string>
 
 namespace orvex {
 
 namespace {
-using Json = nlohmann::ordered_json;
 
-Json jsonOf(const OrvexModelNode& node, const std::string& path)
+constexpr std::size_t kLevelsWithPaths = 32;
+
+std::size_t levelsBelow(const OrvexModelNode& node)
 {
-    Json result = {{"name", node.displayName()}, {"path", path}};
+    std::size_t levels = 0;
     if (const auto* children = node.childNodes()) {
-        Json list = Json::array();
         for (const auto& child : *children)
-            list.push_back(jsonOf(*child, pathByAppending(path, child->displayName())));
-        result["children"] = std::move(list);
-    } else if (const std::string* value = node.value()) {
-        result["value"] = *value;
+            levels = std::max(levels, 1 + levelsBelow(*child));
     }
-    return result;
+    return levels;
 }
+
+// Without paths when there is none.
+void writeNode(JsonWriter& json, const OrvexModelNode& node, const std::string* path)
+{
+    json.beginObject();
+    json.member("name", node.displayName());
+    if (path)
+        json.member("path", *path);
+    if (const auto* children = node.childNodes()) {
+        json.key("children");
+        json.beginArray();
+        for (const auto& child : *children) {
+            const std::string childPath = path ? pathByAppending(*path, child->displayName()) : "";
+            writeNode(json, *child, path ? &childPath : nullptr);
+        }
+        json.endArray();
+    } else if (const std::string* value = node.value()) {
+        json.member("value", *value);
+    }
+    json.endObject();
+}
+
 } // namespace
 
-Json treeJson(const OrvexModelNode& root)
+void writeTreeJson(JsonWriter& json, const OrvexModelNode& root)
 {
-    return jsonOf(root, "/");
-}
-
-std::string documentText(const Json& document)
-{
-    return document.dump(2, ' ', false, Json::error_handler_t::replace) + "\n";
+    const std::string rootPath = "/";
+    const bool isDeep = levelsBelow(root) >= kLevelsWithPaths;
+    json.setCompact(isDeep);
+    writeNode(json, root, isDeep ? nullptr : &rootPath);
+    json.setCompact(false);
 }
 
 } // namespace orvex

@@ -1,18 +1,15 @@
 #pragma once
 
+#include "JsonWriter.h"
 #include "OrvexModelNode.h"
-
-#include <nlohmann/json_fwd.hpp>
-
-#include <string>
 
 namespace orvex {
 
-// The display tree as one JSON object: {"name", "path", "children"} for a branch, {"name", "path", "value"}
-// for a leaf. Bytes that are not UTF-8 become U+FFFD.
-nlohmann::ordered_json treeJson(const OrvexModelNode& root);
-
-// The text of a JSON document, indented.
-std::string documentText(const nlohmann::ordered_json& document);
+// Writes the display tree as one JSON object: {"name", "path", "children"} for a branch, {"name", "path",
+// "value"} for a leaf.
+//
+// A tree that reaches 32 levels or more below its root is written compact and without paths. A path repeats
+// every name above it, and indentation grows as well: a few KB of a hostile report would become gigabytes.
+void writeTreeJson(JsonWriter& json, const OrvexModelNode& root);
 
 } // namespace orvex

@@ -20,8 +20,6 @@
 #include "Snapshot.h"
 #include "TextFormat.h"
 
-#include <nlohmann/json.hpp>
-
 #include <iostream>
 
 using namespace orvex;
@@ -57,12 +55,21 @@ bool feed(OfflineSession& session, const std::string& path, const DecodeOptions&
         reader->error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
 }
 
-std::string textOf(const Value& display, DecodeOptions::Format format)
+bool print(const Value& display, const DecodeOptions& options)
 {
     NodesByPath paths;
     const auto tree = OrvexModelNode::makeTreeFromObject(display, paths);
-    return format == DecodeOptions::Format::json ? documentText(treeJson(*tree))
-                                                 : DisplayTreePrinter::text(*tree);
+    return printDocument(
+        [&](std::ostream& stream) {
+            if (options.format == DecodeOptions::Format::tree) {
+                stream << DisplayTreePrinter::text(*tree);
+                return;
+            }
+            JsonWriter json(stream);
+            writeTreeJson(json, *tree);
+            json.endDocument();
+        },
+        options);
 }
 
 std::string resourcesOf(const DecodeOptions& options)
@@ -144,7 +151,7 @@ int decodeCaptures(const DecodeOptions& options)
     // What could be read is shown, whatever could not; but nothing at all is no document.
     if (!isGood && session.messageCount() == 0)
         return kFailure;
-    isGood = printDocument(textOf(session.display(), options.format), options) && isGood;
+    isGood = print(session.display(), options) && isGood;
     if (options.snapshotFile)
         isGood = save(session, begun, options) && isGood;
     return isGood ? 0 : kFailure;
@@ -158,12 +165,28 @@ bool extractDlf(const SnapshotDocument& document, const DecodeOptions& options)
         *options.dlfFile, {reinterpret_cast<const char*>(document.dlf()->data()), document.dlf()->size()});
 }
 
+void write(const std::vector<SnapshotDocument>& documents, DecodeOptions::Format format, std::ostream& stream)
+{
+    if (format == DecodeOptions::Format::tree) {
+        for (const SnapshotDocument& document : documents)
+            stream << document.tree();
+        return;
+    }
+    JsonWriter json(stream);
+    json.beginObject();
+    json.key("snapshots");
+    json.beginArray();
+    for (const SnapshotDocument& document : documents)
+        document.writeJson(json);
+    json.endArray();
+    json.endObject();
+    json.endDocument();
+}
+
 int showSnapshots(const DecodeOptions& options)
 {
     const Platform platform(options);
-    const bool isJson = options.format == DecodeOptions::Format::json;
-    std::string tree;
-    auto json = nlohmann::ordered_json::array();
+    std::vector<SnapshotDocument> documents;
     bool isGood = true;
     for (const std::string& path : options.captures) {
         const auto [snapshot, error] = readSnapshot(path);
@@ -171,7 +194,7 @@ int showSnapshots(const DecodeOptions& options)
             isGood = complain(error);
             continue;
         }
-        SnapshotDocument document(*snapshot);
+        SnapshotDocument& document = documents.emplace_back(*snapshot);
         if (!options.technology.empty()) {
             auto generator = platform.generatorFor(options.technology);
             isGood = hasTemplate(*generator) && isGood;
@@ -181,15 +204,12 @@ int showSnapshots(const DecodeOptions& options)
             complain(text("%s: %s", path.c_str(), omission.c_str()));
         if (options.dlfFile)
             isGood = extractDlf(document, options) && isGood;
-        if (isJson)
-            json.push_back(document.json());
-        else
-            tree += document.tree();
     }
-    if (tree.empty() && json.empty())
+    if (documents.empty())
         return kFailure;
-    return printDocument(isJson ? documentText({{"snapshots", json}}) : tree, options) && isGood ? 0
-                                                                                                 : kFailure;
+    isGood = printDocument([&](std::ostream& stream) { write(documents, options.format, stream); }, options)
+        && isGood;
+    return isGood ? 0 : kFailure;
 }
 
 // Decodes what the options name, with the log that they want.

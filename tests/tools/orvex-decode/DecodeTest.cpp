@@ -45,7 +45,9 @@ TEST_F(DecodeTest, PrintsTheTreeOfWhatTheCapturesHold)
     EXPECT_THAT(tree.output, HasSubstr("Orvex\n  Serving Cell Info\n"));
     EXPECT_THAT(tree.output, HasSubstr("    Num Tx Antennas: 4\n"));
 
-    const auto root = Json::parse(decodeCaptures(captures, {"--format", "json"}).output);
+    const std::string document = decodeCaptures(captures, {"--format", "json"}).output;
+    const auto root = Json::parse(document);
+    EXPECT_EQ(document, root.dump(2) + "\n");
     EXPECT_EQ(root["name"], "Orvex");
     EXPECT_EQ(root["path"], "/");
     ASSERT_EQ(root["children"].size(), 11U);
@@ -58,6 +60,26 @@ TEST_F(DecodeTest, PrintsTheTreeOfWhatTheCapturesHold)
     EXPECT_EQ(decodeCaptures(nothing).output, "Orvex: (unknown)\n");
     EXPECT_EQ(Json::parse(decodeCaptures(nothing, {"--format", "json"}).output),
         (Json{{"name", "Orvex"}, {"path", "/"}, {"value", "(unknown)"}}));
+}
+
+TEST_F(DecodeTest, DeepTreesAreCompactAndWithoutPaths)
+{
+    for (const auto& [levels, hasPaths] : {std::pair(31, true), {32, false}, {250, false}}) {
+        std::string list = "<plist>";
+        for (int i = 1; i < levels; ++i)
+            list += "<dict><key>b\xC3\xA4</key><string>x</string><key>a</key>";
+        list += "<dict><key>c</key><string>y</string><key>d</key><string/></dict>";
+        for (int i = 1; i < levels; ++i)
+            list += "</dict>";
+        list += "</plist>";
+        const Result result = decode({"--technology", "IFX", "--format", "json",
+            write("deep.pcap", PcapFile().add(Bytes(list.begin(), list.end())).bytes())});
+        ASSERT_EQ(result.status, 0) << result.errors;
+        const auto root = Json::parse(result.output);
+        EXPECT_EQ(result.output, root.dump(hasPaths ? 2 : -1) + "\n") << levels;
+        EXPECT_EQ(result.output.find("path") != std::string::npos, hasPaths) << levels;
+        EXPECT_LT(result.output.size(), hasPaths ? 50'000 : 2 * list.size()) << levels;
+    }
 }
 
 TEST_F(DecodeTest, SaysInOneLineWhatCouldNotBeRead)

@@ -27,7 +27,9 @@ protected:
     static Json parsed(const Result& result)
     {
         EXPECT_EQ(result.status, 0) << result.errors;
-        return Json::parse(result.output);
+        Json document = Json::parse(result.output);
+        EXPECT_EQ(result.output, document.dump(2) + "\n");
+        return document;
     }
 };
 

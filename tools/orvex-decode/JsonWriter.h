@@ -1,0 +1,51 @@
+#pragma once
+
+#include <ostream>
+#include <string_view>
+#include <vector>
+
+namespace orvex {
+
+// Writes a JSON document as it comes, so that its size costs no memory: indented by two blanks, or, where it
+// is told to be compact, on one line. Bytes that are not UTF-8 become U+FFFD.
+class JsonWriter {
+public:
+    explicit JsonWriter(std::ostream& stream)
+        : _stream(stream)
+    {
+    }
+
+    void beginObject() { open('{'); }
+    void endObject() { close('}'); }
+    void beginArray() { open('['); }
+    void endArray() { close(']'); }
+    // Before each value of an object.
+    void key(std::string_view name);
+    void string(std::string_view text);
+    void member(std::string_view name, std::string_view text)
+    {
+        key(name);
+        string(text);
+    }
+    // A value that is JSON already, indented from the left margin on. May come in pieces.
+    void beginText() { beginValue(); }
+    void text(std::string_view piece);
+    // After the outermost value.
+    void endDocument() { _stream << '\n'; }
+
+    // From the next value on. Set it back before the container that was open is closed.
+    void setCompact(bool isCompact) { _isCompact = isCompact; }
+
+private:
+    void open(char bracket);
+    void close(char bracket);
+    void beginValue();
+    void beginLine();
+
+    std::ostream& _stream;
+    std::vector<bool> _isEmpty; // of each container that is open
+    bool _followsKey = false;
+    bool _isCompact = false;
+};
+
+} // namespace orvex
