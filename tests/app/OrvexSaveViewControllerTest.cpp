@@ -119,6 +119,7 @@ TEST_F(OrvexSaveViewControllerTest, ATouchBesideTheFieldTakesTheKeyboardAway)
     OrvexSaveViewController& screen = open();
     QLineEdit& field = screen.saveDescription();
     EXPECT_TRUE(field.hasFocus()) << "from the start";
+    EXPECT_EQ(field.mapTo(&screen, QPoint()), QPoint(10, 54)) << "below the bar";
     const std::function<void()> touches[] = {
         [&screen] { tapRow(screen.saveContentTable(), 0); },
         [&screen] { QTest::mouseClick(screen.childAt(100, 600), Qt::LeftButton); },
