@@ -8,6 +8,9 @@
 #include "TextLabel.h"
 #include "Theme.h"
 
+#include <algorithm>
+#include <utility>
+
 namespace orvex {
 
 namespace {
@@ -15,6 +18,22 @@ namespace {
 // reused cell may be of the other kind than its row.
 constexpr const char* kCellIdentifier = "OrvexPaneControllerCell";
 constexpr int kStatusFontSize = 14;
+
+// The child with the name, at its former place if it is still there.
+std::optional<int> rowNamed(const std::string& name, const OrvexModelNode* node, int formerRow)
+{
+    const auto* const children = node ? node->childNodes() : nullptr;
+    if (!children)
+        return std::nullopt;
+    const auto hasName = [&name](const OrvexModelNodeRef& child) { return child->displayName() == name; };
+    const auto former = static_cast<std::size_t>(formerRow);
+    if (former < children->size() && hasName((*children)[former]))
+        return formerRow;
+    const auto found = std::ranges::find_if(*children, hasName);
+    if (found == children->end())
+        return std::nullopt;
+    return static_cast<int>(found - children->begin());
+}
 } // namespace
 
 OrvexPaneController::OrvexPaneController(PaneHost& host, OrvexModelNodeRef node, std::string path)
@@ -23,7 +42,6 @@ OrvexPaneController::OrvexPaneController(PaneHost& host, OrvexModelNodeRef node,
     , _keyPath(std::move(path))
     , _list(new TableList(*this, this))
 {
-    setFocusProxy(_list);
     updateTitle();
     _list->reloadData();
 }
@@ -44,9 +62,12 @@ void OrvexPaneController::setStatus(const std::optional<std::string>& status, bo
 
 void OrvexPaneController::reloadWithNode(OrvexModelNodeRef node)
 {
-    _nodes = std::move(node);
+    const OrvexModelNodeRef former = std::exchange(_nodes, std::move(node));
     updateTitle();
-    _list->reloadData();
+    _list->reloadData([&](int row) {
+        const auto& child = former->childNodes()->at(static_cast<std::size_t>(row));
+        return rowNamed(child->displayName(), _nodes.get(), row);
+    });
     createToolbarItems();
 }
 

@@ -32,6 +32,7 @@ public:
     void setStatus(const std::optional<std::string>& status, bool isLoading);
     void reloadWithNode(OrvexModelNodeRef node);
 
+    QWidget& firstResponder() override { return *_list; }
     void viewWillAppear(bool animated) override;
     void viewWillDisappear(bool animated) override;
 

@@ -26,7 +26,7 @@ void NavigationBar::setTitles(const QString& title, const QString& backTitle, bo
 {
     _title = title;
     _backButton->setText(backTitle);
-    _backButton->setAccessibleName(QStringLiteral("Back to %1").arg(backTitle));
+    _backButton->setAccessibleName(showsBackButton ? QStringLiteral("Back to %1").arg(backTitle) : QString());
     _backButton->setVisible(showsBackButton);
     layoutTitle();
 }

@@ -28,7 +28,6 @@ NavigationStack::NavigationStack(std::unique_ptr<Screen> root, QWidget* parent)
     _edge->hide();
     connect(&_bar->backButton(), &QAbstractButton::clicked, this, [this] { pop(true); });
     adopt(std::move(root));
-    setFocusProxy(&topScreen());
     titleChanged();
     _toolbar->showRow(topScreen().toolbarRow());
 }
@@ -89,8 +88,7 @@ void NavigationStack::slide(Screen& leaving, Direction direction, bool animated)
     (isPush ? arriving : leaving).raise();
     _edge->raise();
     _edge->show();
-    setFocusProxy(&arriving);
-    arriving.setFocus();
+    arriving.firstResponder().setFocus();
     // A second tap that was meant for the screen below must not fall upon the one that slides in.
     _pages->setAttribute(Qt::WA_TransparentForMouseEvents);
 
@@ -164,6 +162,12 @@ void NavigationStack::showEvent(QShowEvent* event)
         QMetaObject::invokeMethod(this, announceRoot, Qt::QueuedConnection);
     }
     QWidget::showEvent(event);
+}
+
+// Not by a focus proxy: the Tab key takes the stack for its proxy and never reaches the back button.
+void NavigationStack::focusInEvent(QFocusEvent*)
+{
+    topScreen().firstResponder().setFocus();
 }
 
 void NavigationStack::keyPressEvent(QKeyEvent* event)

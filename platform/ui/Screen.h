@@ -31,7 +31,7 @@ public:
     virtual void viewWillAppear(bool /*animated*/) { }
     virtual void viewWillDisappear(bool /*animated*/) { }
 
-    // What a modal screen gives the keyboard to.
+    // What gets the keyboard when the screen comes into view.
     virtual QWidget& firstResponder() { return *this; }
 
 protected:

@@ -45,7 +45,7 @@ std::unique_ptr<TableCell> TableList::dequeueReusableCell(std::string_view ident
     return _reusable.take(identifier);
 }
 
-void TableList::reloadData()
+void TableList::reloadData(const RowMove& move)
 {
     _rowCount = _source ? _source->numberOfRows(*this) : 0;
     updateGeometry();
@@ -56,6 +56,12 @@ void TableList::reloadData()
     _cells.clear();
     _reusable.prepend(std::move(inView));
 
+    for (auto* row : {&_selectedRow, &_pressedRow}) {
+        if (*row && move)
+            *row = move(**row);
+    }
+    if (_selectedRow)
+        _lastSelectedRow = _selectedRow;
     for (auto* row : {&_selectedRow, &_lastSelectedRow, &_pressedRow}) {
         if (*row && **row >= _rowCount)
             row->reset();

@@ -6,6 +6,7 @@
 
 #include <QWidget>
 
+#include <functional>
 #include <map>
 #include <memory>
 #include <optional>
@@ -47,8 +48,12 @@ public:
 
     // Null when no cell with the identifier waits for reuse.
     std::unique_ptr<TableCell> dequeueReusableCell(std::string_view identifier);
-    // Asks for everything anew. Keeps the scroll position and the selected row as far as they still exist.
-    void reloadData();
+    // Where a row of before a reload is now; none where it is gone.
+    using RowMove = std::function<std::optional<int>(int row)>;
+
+    // Asks for everything anew. Keeps the scroll position as far as it still exists, and the selected and the
+    // pressed row where the move says they are: by default where they were.
+    void reloadData(const RowMove& move = {});
 
     // High enough for all rows.
     QSize sizeHint() const override { return {0, _rowCount * _rowHeight}; }

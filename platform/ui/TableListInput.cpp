@@ -93,10 +93,10 @@ void TableList::mouseReleaseEvent(QMouseEvent* event)
     _drag.reset();
     QScroller::scroller(this)->handleInput(
         QScroller::InputRelease, drag.scrollPosition(), millisecondsOf(*event));
+    const auto row = _pressedRow; // a reload may have moved it away from the finger
     setPressedRow(std::nullopt);
     if (!drag.isTap())
         return;
-    const auto row = rowAt(drag.start());
     if (row)
         selectRow(*row);
     if (_source)

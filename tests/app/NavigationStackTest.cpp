@@ -37,6 +37,7 @@ public:
 TEST_F(NavigationStackTest, TheBackButtonBearsTheTitleOfTheScreenBelow)
 {
     EXPECT_TRUE(back().isHidden());
+    EXPECT_EQ(back().accessibleName(), "");
     for (const char* title : {"A", "B", "C", "D"})
         stack.push(screen(title), true);
     for (const int nowhere : {5, 4, -1})

@@ -1,9 +1,12 @@
 #include "PaneFixture.h"
 
 #include "ActivityIndicator.h"
+#include "BarButton.h"
 #include "NavigationBar.h"
 
 #include <QApplication>
+
+#include <set>
 
 namespace orvex::test {
 namespace {
@@ -119,6 +122,60 @@ TEST_F(OrvexPaneControllerTest, PopsBackToTheLastScreenWhosePathIsLeft)
         if (!test.display.isNull()) {
             EXPECT_EQ(shownAt(paneAt(*stack, 0), 0), "Z=new");
         }
+    }
+}
+
+TEST_F(OrvexPaneControllerTest, AReloadKeepsTheHighlightOnTheRowOfTheSameName)
+{
+    const Value branch = rows({});
+    const struct {
+        const char* name;
+        Tree tree;
+        std::optional<int> row; // of B
+    } cases[] = {
+        {"moved down", Tree(rows({{"New", branch}, {"A", branch}, {"B", branch}})), 2},
+        {"moved up", Tree(rows({{"B", branch}})), 0},
+        {"gone", Tree(rows({{"A", branch}, {"C", branch}})), std::nullopt},
+    };
+    for (const auto& test : cases) {
+        for (const bool isPressed : {false, true}) {
+            SCOPED_TRACE(std::string(test.name) + (isPressed ? ", pressed" : ", selected"));
+            show(Tree(rows({{"A", branch}, {"B", branch}})));
+            TableList& list = top().tableList();
+            if (isPressed)
+                QTest::mousePress(&list, Qt::LeftButton, {}, {60, 66});
+            else
+                list.selectRow(1);
+            reload(test.tree);
+            for (int row = 0; row < list.rowCount(); ++row)
+                EXPECT_EQ(list.cellAtRow(row)->isHighlighted(), row == test.row);
+            if (isPressed) {
+                QTest::mouseRelease(&list, Qt::LeftButton, {}, {60, 66});
+                EXPECT_EQ(top().path(), test.row ? "/B" : "/");
+            }
+        }
+    }
+}
+
+TEST_F(OrvexPaneControllerTest, TabReachesBackButtonListAndToolbar)
+{
+    host.offersSave = true;
+    show(lteTree());
+    const auto reached = [this](Qt::Key tab) {
+        std::set<const QWidget*> widgets;
+        for (int step = 0; step < 8; ++step) {
+            QTest::keyClick(QApplication::focusWidget(), tab);
+            widgets.insert(QApplication::focusWidget());
+        }
+        return widgets;
+    };
+    for (const auto tab : {Qt::Key_Tab, Qt::Key_Backtab}) {
+        const auto save = [this] { return top().toolbarRow()->items().back().widget; };
+        EXPECT_EQ(reached(tab), (std::set<const QWidget*>{&top().tableList(), save()}));
+        tapRow(top().tableList(), 1);
+        EXPECT_EQ(reached(tab),
+            (std::set<const QWidget*>{&stack->navigationBar().backButton(), &top().tableList(), save()}));
+        stack->pop(false);
     }
 }
 
