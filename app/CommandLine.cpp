@@ -128,7 +128,7 @@ std::string CommandLine::usage()
            "  --print-status   Write the status line to standard output whenever it changes,\n"
            "                   after the number of messages decoded so far.\n"
            "  --resources DIR  Take the section templates from this directory.\n"
-           "  --light, --dark  Choose the colours. Default: as the desktop has them.\n"
+           "  --light, --dark  Choose the colours. Default: the desktop's.\n"
            "  --size WxH       Open the window with this size instead of the screen's. 'handset' is\n"
            "                   375x667, or the screen's where that is a handset's.\n"
            "  --until-painted  Print 'painted' after the first frame, then exit.\n"
