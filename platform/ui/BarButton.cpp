@@ -58,7 +58,9 @@ void BarButton::paintEvent(QPaintEvent*)
     painter.setPen(color);
     const QRect place(textLeft(), 0, width() - textLeft() - kPadding, height());
     const auto side = _style == Style::back ? Qt::AlignLeft : Qt::AlignHCenter;
-    const QString fitted = fontMetrics().elidedText(text(), Qt::ElideRight, place.width());
+    // Cutting counts fractions of a pixel, which the size hint rounds off.
+    const bool fits = fontMetrics().horizontalAdvance(text()) <= place.width();
+    const QString fitted = fits ? text() : fontMetrics().elidedText(text(), Qt::ElideRight, place.width());
     painter.drawText(place, static_cast<int>(side | Qt::AlignVCenter) | Qt::TextSingleLine, fitted);
 }
 

@@ -8,6 +8,9 @@ namespace orvex {
 class TextField final : public QLineEdit {
 public:
     explicit TextField(QWidget* parent);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
 };
 
 } // namespace orvex
