@@ -1,6 +1,7 @@
 #include "MRLLogGenerator2.h"
 
 #include "MessageFrame.h"
+#include "StateTemplate.h"
 
 #include "Array.h"
 #include "SystemLog.h"
@@ -24,7 +25,7 @@ const GeneratorEnvironment& announced(const GeneratorEnvironment& environment, c
 MRLLogGenerator2::MRLLogGenerator2(
     const GeneratorEnvironment& environment, std::string pListName, std::unique_ptr<ClassIndex> cIndex)
     : MRLLogGenerator(announced(environment, cIndex.get()))
-    , _template(std::move(pListName))
+    , _pListName(std::move(pListName))
     , _cIndex(std::move(cIndex))
 {
     const long owners = 1; // this generator alone
@@ -74,17 +75,17 @@ Value MRLLogGenerator2::generateLogUsingState(Dictionary& state)
 
 std::string MRLLogGenerator2::templateError(const Dictionary& state) const
 {
-    return _template.errorIn(state, environment().resources);
+    return StateTemplate(_pListName).errorIn(state, environment().resources);
 }
 
 Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
 {
-    const DictionaryRef display = state["Display"].dictionary();
-    if (isBoundToDisplayOf(state))
-        return display;
+    if (isBoundToDisplayOf(state) || StateTemplate::hasForeignDisplay(state))
+        return state["Display"];
 
-    DictionaryRef skeleton = _template.in(state);
-    if (display && skeleton) {
+    const StateTemplate ownTemplate(_pListName);
+    DictionaryRef skeleton = ownTemplate.in(state);
+    if (const DictionaryRef display = state["Display"].dictionary(); display && skeleton) {
         // The session went on with a new generator, after the service came back say: the display stays, and
         // the new sections take over where the old ones stopped writing.
         bindToDisplay(skeleton, display);
@@ -92,7 +93,7 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
         return display;
     }
     if (!skeleton)
-        skeleton = _template.loadInto(state, environment().resources);
+        skeleton = ownTemplate.loadInto(state, environment().resources);
     if (!skeleton) {
         systemLog(Priority::error, "Cannot load template for display");
         return {};
@@ -103,7 +104,7 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
         _cIndex->status();
     const Value built = processTemplate(skeleton);
     printDict(built);
-    state.set("Display", built);
+    ownTemplate.setDisplay(state, built);
     state.set("ExtraInfo", Dictionary::make());
     _boundDisplay = built.dictionary();
     return {}; // deliberately: only the next call gets it
@@ -139,7 +140,7 @@ Value MRLLogGenerator2::processTemplate(const Value& object)
     systemLog(Priority::error, "Received an object of unknown type");
     systemLog(Priority::warning, "Processing the template");
     throw InvalidTemplateException(
-        text("template %s holds a value of kind %s", _template.name().c_str(), nameOf(object.kind())));
+        text("template %s holds a value of kind %s", _pListName.c_str(), nameOf(object.kind())));
 }
 
 void MRLLogGenerator2::bindToDisplay(const Value& templateObject, const Value& display)

@@ -2,7 +2,6 @@
 
 #include "ClassIndex.h"
 #include "MRLLogGenerator.h"
-#include "StateTemplate.h"
 
 #include <stdexcept>
 
@@ -20,7 +19,7 @@ public:
 //
 // The template is a dictionary of texts, arrays and dictionaries. The entry under a section's name becomes
 // the section's own; what it holds is shown until the first packet. Besides the common keys the state holds
-// "Template" and "TemplateName", the resource it came from.
+// "Template" and "TemplateName", see StateTemplate.
 class MRLLogGenerator2 : public MRLLogGenerator {
 public:
     // `pListName` is the base name of the template resource.
@@ -46,7 +45,7 @@ public:
 
     // The state's display. The call that has to build it first returns null; the next one returns it. A
     // display that a predecessor built from the same template is taken over, one of another technology is
-    // replaced.
+    // replaced, and one that no generator made is returned as it is.
     Value getDisplayFromState(Dictionary& state);
 
 protected:
@@ -63,8 +62,8 @@ private:
     void bindToDisplay(const Value& templateObject, const Value& display);
     void bindSection(std::string_view name, const Value& container);
 
-    StateTemplate _template{""};
-    std::unique_ptr<ClassIndex> _cIndex; // null in a generator that was never set up
+    std::string _pListName;              // empty in a generator that was never set up
+    std::unique_ptr<ClassIndex> _cIndex; // null then
     Bound<Dictionary> _boundDisplay;     // whose entries the sections write into
 };
 

@@ -4,6 +4,7 @@ namespace orvex {
 
 namespace {
 constexpr const char* kTemplate = "Template";
+constexpr const char* kDisplay = "Display";
 constexpr const char* kTemplateName = "TemplateName";
 } // namespace
 
@@ -17,22 +18,25 @@ DictionaryRef StateTemplate::in(const Dictionary& state) const
 DictionaryRef StateTemplate::loadInto(Dictionary& state, const Resources& resources) const
 {
     auto skeleton = _name.empty() ? nullptr : resources.dictionaryNamed(_name).dictionary;
-    if (skeleton) {
+    if (skeleton)
         state.set(kTemplate, skeleton);
-        state.set(kTemplateName, _name);
-    }
     return skeleton;
 }
 
 std::string StateTemplate::errorIn(const Dictionary& state, const Resources& resources) const
 {
-    return in(state) ? "" : resources.dictionaryNamed(_name).error;
+    return in(state) || hasForeignDisplay(state) ? "" : resources.dictionaryNamed(_name).error;
 }
 
-void StateTemplate::removeFrom(Dictionary& state)
+void StateTemplate::setDisplay(Dictionary& state, const Value& display) const
 {
-    state.remove(kTemplate);
-    state.remove(kTemplateName);
+    state.set(kDisplay, display);
+    state.set(kTemplateName, _name);
+}
+
+bool StateTemplate::hasForeignDisplay(const Dictionary& state)
+{
+    return !state[kDisplay].isNull() && state[kTemplateName].isNull();
 }
 
 } // namespace orvex

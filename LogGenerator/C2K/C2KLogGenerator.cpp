@@ -68,7 +68,7 @@ void C2KLogGenerator::updateState(Dictionary& state, ByteView data)
 
 Value C2KLogGenerator::generateLogUsingState(Dictionary& state)
 {
-    const auto display = getDisplayFromState(state, environment().resources);
+    Value display = getDisplayFromState(state, environment().resources);
     handOverBinData(state);
     updateHistoryInState(state, environment().clock);
     return display;
@@ -98,22 +98,22 @@ void C2KLogGenerator::processTemplate(
     systemLog(Priority::warning, "Processing the template");
 }
 
-DictionaryRef C2KLogGenerator::getDisplayFromState(Dictionary& state, const Resources& resources)
+Value C2KLogGenerator::getDisplayFromState(Dictionary& state, const Resources& resources)
 {
     auto skeleton = ownTemplate().in(state);
-    auto display = state["Display"].dictionary();
-    if (display && skeleton)
-        return display;
+    const Value& found = state["Display"];
+    if (StateTemplate::hasForeignDisplay(state) || (skeleton && !found.isNull()))
+        return found;
     if (!skeleton)
         skeleton = ownTemplate().loadInto(state, resources);
     if (!skeleton) {
         systemLog(Priority::error, "Cannot load C2K template for display");
-        return nullptr;
+        return {};
     }
-    display = Dictionary::make();
+    const auto display = Dictionary::make();
     const auto lookup = Dictionary::make();
     processTemplate(*skeleton, display, *lookup);
-    state.set("Display", display);
+    ownTemplate().setDisplay(state, display);
     state.set("Lookup", lookup);
     state.set("ExtraInfo", Dictionary::make());
     return display;

@@ -25,9 +25,9 @@ public:
     static void processTemplate(const Dictionary& skeleton, const DictionaryRef& storeDisplayIntoDict,
         Dictionary& storeLookupIntoDict);
 
-    // The state's display, laid out first when it has none of this technology. Null, with a log line, when
-    // there is no template.
-    static DictionaryRef getDisplayFromState(Dictionary& state, const Resources& resources);
+    // The state's display, laid out first when it has none or one of another technology. Null, with a log
+    // line, when there is no template.
+    static Value getDisplayFromState(Dictionary& state, const Resources& resources);
 
     // Decodes one message, framed as MessageFrame says, and keeps its packet when its code is one of ours.
     void updateFromLog(ByteView message, const DictionaryRef& usingLookup, Dictionary& usingState);

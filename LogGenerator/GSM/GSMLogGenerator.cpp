@@ -49,10 +49,8 @@ void GSMLogGenerator::updateState(Dictionary& state, ByteView data)
     }
     const Value display = processObject(*list.value);
     state.set("DisplayState", *list.value);
-    state.set("Display", display);
+    StateTemplate("IFX").setDisplay(state, display);
     state.set("ExtraInfo", Dictionary::make());
-    // Of a technology that the session spoke before: its template no longer is the display's.
-    StateTemplate::removeFrom(state);
 }
 
 Value GSMLogGenerator::generateLogUsingState(Dictionary& state)

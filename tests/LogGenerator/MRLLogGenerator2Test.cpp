@@ -147,7 +147,6 @@ TEST_F(MRLLogGenerator2Test, TemplateEntryUnderAnotherKeyThanATextIsReported)
 
 TEST_F(MRLLogGenerator2Test, SuccessorsShareTheDisplayOfTheirTemplate)
 {
-    state.set("Display", Dictionary::make({{"Foreign", "x"}})); // without a template it is nobody's
     displayAfter("Probe", packet(0x4116, Bytes()));
     const auto first = state["Display"].dictionary();
     EXPECT_EQ(displayAfter("Probe", packet(0x4116, Bytes(2))),

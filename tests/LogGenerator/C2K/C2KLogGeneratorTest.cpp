@@ -167,5 +167,30 @@ TEST_F(C2KLogGeneratorTest, TechnologiesTakeTurnsOnOneState)
     }
 }
 
+TEST_F(C2KLogGeneratorTest, DisplayThatNoGeneratorMadeIsShownAsItIs)
+{
+    for (const Value& foreign :
+        {Value(Dictionary::make({{"Identity", Dictionary::make()}})), Value("text")}) {
+        MRLLogGenerator2 other(environment(), "Other", std::make_unique<ClassIndex>());
+        const std::unique_ptr<C2KLogGenerator> own = makeGenerator();
+        for (LogGenerator* generator :
+            {static_cast<LogGenerator*>(own.get()), static_cast<LogGenerator*>(&other)}) {
+            clearState();
+            state.set("Display", foreign);
+            generator->updateState(state, identity(7));
+            EXPECT_EQ(generator->generateLogUsingState(state), foreign);
+            EXPECT_EQ(generator->templateError(state), "");
+            EXPECT_TRUE(state["Template"].isNull() && state["ExtraInfo"].isNull());
+        }
+    }
+    // A template that is there already makes a display like any other, known as one's own from then on.
+    clearState();
+    state.set("Template", Dictionary::make({{"Row", "kSystemId"}}));
+    makeGenerator()->updateState(state, identity(7));
+    EXPECT_EQ(display(), "Row=258");
+    MRLLogGenerator2(environment(), "Other", std::make_unique<ClassIndex>()).updateState(state, identity(7));
+    EXPECT_EQ(display(), "Section=text");
+}
+
 } // namespace
 } // namespace orvex::test
