@@ -24,8 +24,8 @@ void Base::updateLogCodeDict(CodeDictionary& codeDict)
 
 void Base::updateSectionRef(const Value& container)
 {
-    _dictionary = container.dictionary();
-    _array = container.array();
+    _sectionRef.dictionary = container.dictionary();
+    _sectionRef.array = container.array();
     systemLogText(Priority::warning, getSectionName());
 }
 

@@ -50,9 +50,9 @@ protected:
         CodeDictionary& codeDict);
 
     // The bound dictionary, to write into; a writer over nothing while none is bound.
-    Rows rows() const { return Rows(_dictionary.get()); }
+    Rows rows() const { return Rows(_sectionRef.dictionary.get()); }
     // The bound array; null while none is bound.
-    Array* array() const { return _array.get(); }
+    Array* array() const { return _sectionRef.array.get(); }
     // The two array operations on the bound array, if there is one.
     void clearSection() const;
     void replaceSection(const Array& with) const;
@@ -94,8 +94,10 @@ private:
 
     std::string _sectionName;
     std::vector<LogCode> _logCodes;
-    Bound<Dictionary> _dictionary;
-    Bound<Array> _array;
+    struct {
+        Bound<Dictionary> dictionary;
+        Bound<Array> array;
+    } _sectionRef; // one of the two, or neither
 };
 
 } // namespace orvex

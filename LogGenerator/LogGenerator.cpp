@@ -42,7 +42,7 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
     using Maker = std::unique_ptr<LogGenerator> (*)(const GeneratorEnvironment&);
     struct Choice {
         const char* technology;
-        Maker generator; // null while this build does not decode the technology
+        Maker generator;
     };
     static constexpr Choice kChoices[] = {
         {telephony::kTechnologyIFX, &GSMLogGenerator::generator},
@@ -53,7 +53,7 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
     };
     for (const Choice& choice : kChoices) {
         if (technology == Value(choice.technology))
-            return choice.generator ? choice.generator(environment) : nullptr;
+            return choice.generator(environment);
     }
     return nullptr;
 }

@@ -15,18 +15,19 @@ namespace orvex {
 
 namespace {
 // Says that a generator comes into being before the generators below it say so themselves.
-const GeneratorEnvironment& announced(const GeneratorEnvironment& environment, const ClassIndex* cIndex)
+const GeneratorEnvironment& announced(const GeneratorEnvironment& environment, const ClassIndex* cIndexObj)
 {
-    systemLog(Priority::error, "Creating MRLLogGenerator2 object with %p", static_cast<const void*>(cIndex));
+    systemLog(
+        Priority::error, "Creating MRLLogGenerator2 object with %p", static_cast<const void*>(cIndexObj));
     return environment;
 }
 } // namespace
 
 MRLLogGenerator2::MRLLogGenerator2(
-    const GeneratorEnvironment& environment, std::string pListName, std::unique_ptr<ClassIndex> cIndex)
-    : MRLLogGenerator(announced(environment, cIndex.get()))
+    const GeneratorEnvironment& environment, std::string pListName, std::unique_ptr<ClassIndex> cIndexObj)
+    : MRLLogGenerator(announced(environment, cIndexObj.get()))
     , _pListName(std::move(pListName))
-    , _cIndex(std::move(cIndex))
+    , _cIndex(std::move(cIndexObj))
 {
     const long owners = 1; // this generator alone
     systemLog(Priority::error, "Class Index: %ld", owners);

@@ -23,8 +23,8 @@ public:
 class MRLLogGenerator2 : public MRLLogGenerator {
 public:
     // `pListName` is the base name of the template resource.
-    MRLLogGenerator2(
-        const GeneratorEnvironment& environment, std::string pListName, std::unique_ptr<ClassIndex> cIndex);
+    MRLLogGenerator2(const GeneratorEnvironment& environment, std::string pListName,
+        std::unique_ptr<ClassIndex> cIndexObj);
     ~MRLLogGenerator2() override;
 
     DictionaryRef getStartCommand() const override;
