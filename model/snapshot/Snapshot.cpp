@@ -1,15 +1,12 @@
 #include "Snapshot.h"
 
 #include "PropertyList.h"
+#include "RegularFile.h"
 #include "TextFormat.h"
 
 #include <algorithm>
-#include <cerrno>
 #include <cmath>
-#include <cstring>
-#include <filesystem>
 #include <fstream>
-#include <iterator>
 
 namespace orvex {
 
@@ -67,13 +64,9 @@ bool writeSnapshot(const Snapshot& snapshot, const std::string& path)
 
 SnapshotResult readSnapshot(const std::string& path)
 {
-    std::ifstream file(path, std::ios::binary);
-    if (!file)
-        return failure(path, std::strerror(errno));
-    std::error_code ignored;
-    if (std::filesystem::is_directory(path, ignored))
-        return failure(path, std::strerror(EISDIR));
-    const Bytes bytes((std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());
+    const auto [bytes, error] = readFile(path, PropertyListLimits().maximumBytes);
+    if (!error.empty())
+        return failure(path, error);
     const auto list = propertyListFromData(bytes);
     if (!list.value)
         return failure(path, "not a snapshot: " + list.error);

@@ -1,14 +1,11 @@
 #include "FileResources.h"
 
 #include "PropertyList.h"
+#include "RegularFile.h"
 
 #include <algorithm>
-#include <cerrno>
 #include <cstdlib>
-#include <cstring>
 #include <filesystem>
-#include <fstream>
-#include <iterator>
 
 namespace orvex {
 
@@ -59,13 +56,9 @@ std::vector<std::string> FileResources::propertyListPaths() const
 DictionaryResult FileResources::dictionaryNamed(const std::string& baseName) const
 {
     const std::string path = fs::path(_directory) / (baseName + ".plist");
-    std::error_code error;
-    if (fs::is_directory(path, error))
-        return refuse(path, "it is a directory");
-    std::ifstream file(path, std::ios::binary);
-    if (!file)
-        return refuse(path, std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
-    const Bytes data{std::istreambuf_iterator<char>(file), {}};
+    const auto [data, error] = readFile(path, PropertyListLimits().maximumBytes);
+    if (!error.empty())
+        return refuse(path, error);
     const auto list = propertyListFromData(data);
     if (!list.value)
         return refuse(path, list.error);

@@ -5,9 +5,6 @@
 
 #include <algorithm>
 #include <array>
-#include <cerrno>
-#include <cstring>
-#include <fstream>
 
 namespace orvex {
 
@@ -39,16 +36,14 @@ bool isPcapMagic(const std::array<unsigned char, 4>& bytes)
 
 std::unique_ptr<CaptureReader> CaptureReader::open(const std::string& path)
 {
-    std::ifstream file(path, std::ios::binary);
-    if (!file)
-        return std::make_unique<NoCapture>(path, std::strerror(errno));
+    auto file = std::make_unique<RegularFile>(path);
     std::array<unsigned char, 4> magic{};
-    file.read(reinterpret_cast<char*>(magic.data()), magic.size());
-    if (file.bad()) // a directory opens, and fails at the first read
-        return std::make_unique<NoCapture>(path, std::strerror(errno));
-    if (file && isPcapMagic(magic))
-        return std::make_unique<PcapReader>(path);
-    return std::make_unique<DlfReader>(path);
+    file->readAt(0, magic);
+    if (!file->error().empty())
+        return std::make_unique<NoCapture>(path, file->error());
+    if (isPcapMagic(magic))
+        return std::make_unique<PcapReader>(path, *file);
+    return std::make_unique<DlfReader>(path, std::move(file));
 }
 
 } // namespace orvex

@@ -2,40 +2,64 @@
 
 #include "TextFormat.h"
 
-#include <cerrno>
-#include <cstring>
-#include <fstream>
-#include <iterator>
-
 namespace orvex {
 
 namespace {
+constexpr std::size_t kWindow = std::size_t{1} << 20;
 constexpr std::uint8_t kLogTypeBaseband = 1;
 constexpr std::uint64_t kLargestTime = INT64_MAX;
 } // namespace
 
-DlfReader::DlfReader(const std::string& path)
+DlfReader::DlfReader(const std::string& path, std::unique_ptr<RegularFile> file)
     : CaptureReader(path)
+    , _file(std::move(file))
 {
-    std::ifstream file(path, std::ios::binary);
-    if (!file) {
-        breakOff(std::strerror(errno));
+    if (!isDlf()) {
+        breakOff("neither a pcap nor a DLF file");
         return;
     }
-    _file.assign(std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>());
-    DlfRecords records(_file);
-    if (records.beginsWithRecords())
-        _records = records;
-    else
-        breakOff("neither a pcap nor a DLF file");
+    _records.emplace(ByteView(), false);
+    readOn();
+}
+
+bool DlfReader::isDlf()
+{
+    Bytes window(kWindow);
+    std::uint64_t start = 0;
+    std::size_t length = 0;
+    return DlfRecords::makeUp(_file->size(), [&](std::uint64_t place) {
+        if (place < start || place + DlfRecords::kHeaderLength > start + length) {
+            start = place;
+            length = _file->readAt(place, window);
+        }
+        return ByteView(window).first(length).subspan(static_cast<std::size_t>(place - start));
+    });
+}
+
+void DlfReader::readOn()
+{
+    const std::size_t done = _records->doneBytes();
+    _window.erase(_window.begin(), _window.begin() + static_cast<std::ptrdiff_t>(done));
+    const std::size_t kept = _window.size();
+    _window.resize(kept + kWindow);
+    const std::size_t length = _file->readAt(_windowEnd, std::span(_window).subspan(kept));
+    _windowEnd += length;
+    _window.resize(kept + length);
+    _records->moveOn(_window, length < kWindow);
 }
 
 CaptureReader::Status DlfReader::next()
 {
     if (!_records)
         return Status::broken;
-    const auto record = _records->next();
+    auto record = _records->next();
+    while (!record && _records->wantsMore()) {
+        readOn();
+        record = _records->next();
+    }
     if (!record) {
+        if (!_file->error().empty())
+            return breakOff(_file->error());
         const std::size_t skipped = _records->skippedBytes();
         return skipped == 0 ? Status::end
                             : breakOff(text("%zu bytes that make no record were skipped", skipped));

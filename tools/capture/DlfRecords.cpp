@@ -8,7 +8,6 @@ namespace orvex {
 
 namespace {
 
-constexpr std::size_t kHeaderLength = 12;
 constexpr std::size_t kCodeOffset = 2;
 constexpr std::size_t kTimeOffset = 4;
 constexpr std::uint8_t kPrefixMark = 0x81;
@@ -24,6 +23,27 @@ constexpr int kEndsTheFile = 4; // with a time that is near it earns what more r
 constexpr std::uint64_t kNear = std::uint64_t{1} << 40;
 constexpr int kFoundAgain = kFits + kTimeIsNear; // after lost bytes
 
+// No decision on a record looks further ahead.
+constexpr std::size_t kLookAhead = (kDepth + 1) * (UINT16_MAX + kPrefixLength + 1);
+// So many records with times that are near make a DLF, whatever follows.
+constexpr std::size_t kEnoughRecords = 4096;
+
+std::uint64_t timeIn(PacketReader header)
+{
+    return header.u32(kTimeOffset) | static_cast<std::uint64_t>(header.u32(kTimeOffset + 4)) << 32;
+}
+
+bool areNear(std::uint64_t one, std::uint64_t other)
+{
+    const auto [earlier, later] = std::minmax(one, other);
+    return later - earlier < kNear;
+}
+
+bool isVersionReport(PacketReader header)
+{
+    return header.u16(0) == kMTLDLFVersionReportLength && header.u16(kCodeOffset) == kVersionReportCode;
+}
+
 bool isLogType(std::uint8_t byte)
 {
     return byte == 1 || byte == 255;
@@ -37,11 +57,28 @@ const std::array<DlfRecords::Form, 4> DlfRecords::kFormsInSnapshots = {
 const std::array<DlfRecords::Form, 4> DlfRecords::kForms = {
     {{0, false}, {0, true}, {kPrefixLength, true}, {kPrefixLength - 1, true}}};
 
-DlfRecords::DlfRecords(ByteView bytes)
-    : _bytes(bytes)
-    , _isSnapshotDLF(
-          _bytes.u16(0) == kMTLDLFVersionReportLength && _bytes.u16(kCodeOffset) == kVersionReportCode)
+DlfRecords::DlfRecords(ByteView window, bool isWhole)
+    : _bytes(window)
+    , _reachesTheEnd(isWhole)
+    , _isSnapshotDLF(isVersionReport(_bytes))
 {
+}
+
+void DlfRecords::moveOn(ByteView window, bool reachesTheEnd)
+{
+    const std::size_t done = doneBytes();
+    if (_bytes.size() == 0)
+        _isSnapshotDLF = isVersionReport(PacketReader(window));
+    _bytes = PacketReader(window);
+    _reachesTheEnd = reachesTheEnd;
+    _place -= done;
+    if (_last)
+        *_last -= done;
+}
+
+bool DlfRecords::wantsMore() const
+{
+    return !_reachesTheEnd && _bytes.size() - _place < kLookAhead;
 }
 
 bool DlfRecords::fits(std::size_t start) const
@@ -59,16 +96,9 @@ std::optional<DlfRecords::Reading> DlfRecords::readingAt(std::size_t place, cons
     return Reading{place + form.prefix + (form.hasLogType ? 1 : 0), form.hasLogType};
 }
 
-std::uint64_t DlfRecords::timeOf(std::size_t start) const
-{
-    return _bytes.u32(start + kTimeOffset)
-        | static_cast<std::uint64_t>(_bytes.u32(start + kTimeOffset + 4)) << 32;
-}
-
 bool DlfRecords::timesAreNear(std::size_t one, std::size_t other) const
 {
-    const auto [earlier, later] = std::minmax({timeOf(one), timeOf(other)});
-    return later - earlier < kNear;
+    return areNear(timeIn(_bytes.from(one)), timeIn(_bytes.from(other)));
 }
 
 int DlfRecords::scoreOf(const Reading& reading, std::optional<std::size_t> before, int depth) const
@@ -95,25 +125,41 @@ int DlfRecords::bestScoreAt(std::size_t place, std::size_t before, int depth) co
 
 bool DlfRecords::beginsWithRecords() const
 {
+    return makeUp(_bytes.size(),
+        [this](std::uint64_t place) { return _bytes.from(static_cast<std::size_t>(place)).bytes(); });
+}
+
+bool DlfRecords::makeUp(std::uint64_t size, const std::function<ByteView(std::uint64_t place)>& headerAt)
+{
     // Two bytes that could be a length stand at the beginning of many a file, and again where they lead to.
     // But such lengths hardly lead to the very end, nor from one time to another that is near.
-    std::size_t end = 0;
+    std::uint64_t end = 0;
     std::size_t neighbours = 0;
     std::size_t nearOnes = 0;
-    for (std::size_t place = 0; fits(place); place = end) {
-        end = endOf(place);
-        if (fits(end)) {
+    std::uint64_t timeBefore = 0;
+    const auto isMostlyNear = [&] { return neighbours > 0 && nearOnes * 2 >= neighbours; };
+    while (end < size) {
+        const PacketReader header(headerAt(end));
+        const std::size_t length = header.u16(0);
+        if (length < kHeaderLength || length > size - end)
+            break;
+        if (end == 0 && isVersionReport(header))
+            return true;
+        if (end > 0) {
             ++neighbours;
-            nearOnes += timesAreNear(place, end) ? 1U : 0U;
+            nearOnes += areNear(timeBefore, timeIn(header)) ? 1U : 0U;
         }
+        if (neighbours == kEnoughRecords && isMostlyNear())
+            return true;
+        timeBefore = timeIn(header);
+        end += length;
     }
-    const bool makesSense = end == _bytes.size() || (neighbours > 0 && nearOnes * 2 >= neighbours);
-    return end > 0 && (_isSnapshotDLF || makesSense);
+    return end > 0 && (end == size || isMostlyNear());
 }
 
 std::optional<DlfRecords::Record> DlfRecords::next()
 {
-    for (; _place < _bytes.size(); ++_place, ++_skipped) {
+    for (; _place < _bytes.size() && !wantsMore(); ++_place, ++_skipped) {
         std::optional<Reading> best;
         int bestScore = _isLost ? kFoundAgain : 0;
         for (const Form& form : forms()) {
@@ -131,7 +177,7 @@ std::optional<DlfRecords::Record> DlfRecords::next()
         _last = best->start;
         _place = endOf(best->start);
         return Record{best->start, logType, _bytes.bytes().subspan(best->start, _place - best->start),
-            timeOf(best->start)};
+            timeIn(_bytes.from(best->start))};
     }
     return std::nullopt;
 }

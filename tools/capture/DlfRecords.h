@@ -4,7 +4,9 @@
 
 #include "PacketReader.h"
 
+#include <algorithm>
 #include <array>
+#include <functional>
 #include <optional>
 
 namespace orvex {
@@ -26,20 +28,37 @@ namespace orvex {
 // by times that are near to each other. Bytes under which nothing fits are skipped.
 class DlfRecords {
 public:
-    explicit DlfRecords(ByteView bytes);
+    static constexpr std::size_t kHeaderLength = 12;
+
+    // Of a whole file.
+    explicit DlfRecords(ByteView bytes)
+        : DlfRecords(bytes, true)
+    {
+    }
+    // Of the beginning of a file, unless it is whole.
+    DlfRecords(ByteView window, bool isWhole);
+
+    // Goes on in a later window of the file, which begins behind the bytes that are done.
+    void moveOn(ByteView window, bool reachesTheEnd);
+    // How many bytes at the front of the window are needed no more.
+    std::size_t doneBytes() const { return _last ? std::min(*_last, _place) : _place; }
+    // True when next() needs to see more of the file.
+    bool wantsMore() const;
 
     struct Record {
-        std::size_t start;                   // of the record itself
+        std::size_t start;                   // of the record itself, in the window
         std::optional<std::uint8_t> logType; // when it stands in front
         ByteView bytes;
         std::uint64_t time;
     };
-    // None at the end. Every call goes on by a byte at least.
+    // None at the end, or when more is wanted. Every other call goes on by a byte at least.
     std::optional<Record> next();
 
     std::size_t skippedBytes() const { return _skipped; }
     // Whether the first bytes make records that belong together: otherwise this is something else than a DLF.
     bool beginsWithRecords() const;
+    // The same for a file of any size, whose header at a place, or what there is of it, the function returns.
+    static bool makeUp(std::uint64_t size, const std::function<ByteView(std::uint64_t place)>& headerAt);
 
 private:
     // What may stand before a record: so many bytes of a prefix, and a log type.
@@ -61,10 +80,10 @@ private:
     std::optional<Reading> readingAt(std::size_t place, const Form& form) const;
     int scoreOf(const Reading& reading, std::optional<std::size_t> before, int depth) const;
     int bestScoreAt(std::size_t place, std::size_t before, int depth) const;
-    std::uint64_t timeOf(std::size_t start) const;
     bool timesAreNear(std::size_t one, std::size_t other) const;
 
     PacketReader _bytes;
+    bool _reachesTheEnd; // of the file
     bool _isSnapshotDLF; // begins with the version report that this system writes
     std::size_t _place = 0;
     std::optional<std::size_t> _last; // start of the record before

@@ -5,8 +5,6 @@
 #include <pcap/pcap.h>
 
 #include <array>
-#include <cerrno>
-#include <cstring>
 
 namespace orvex {
 
@@ -22,20 +20,19 @@ struct PcapReader::Pcap {
     pcap_t* handle;
 };
 
-PcapReader::PcapReader(const std::string& path)
+PcapReader::PcapReader(const std::string& path, RegularFile& file)
     : CaptureReader(path)
 {
-    // Opened here, since libpcap takes "-" for the standard input and says less of what went wrong.
-    std::FILE* file = std::fopen(path.c_str(), "rbe");
-    if (!file) {
-        breakOff(std::strerror(errno));
+    std::FILE* stream = file.openStream();
+    if (!stream) {
+        breakOff(file.error());
         return;
     }
     std::array<char, PCAP_ERRBUF_SIZE> reason{};
     pcap_t* opened =
-        pcap_fopen_offline_with_tstamp_precision(file, PCAP_TSTAMP_PRECISION_MICRO, reason.data());
+        pcap_fopen_offline_with_tstamp_precision(stream, PCAP_TSTAMP_PRECISION_MICRO, reason.data());
     if (!opened) {
-        std::fclose(file);
+        std::fclose(stream);
         breakOff(std::string("not a pcap file: ") + reason.data());
         return;
     }

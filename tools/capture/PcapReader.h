@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CaptureReader.h"
+#include "RegularFile.h"
 
 namespace orvex {
 
@@ -8,7 +9,7 @@ namespace orvex {
 // packet, exactly as it stands on the log channel.
 class PcapReader final : public CaptureReader {
 public:
-    explicit PcapReader(const std::string& path);
+    PcapReader(const std::string& path, RegularFile& file);
     ~PcapReader() override;
 
     Status next() override;

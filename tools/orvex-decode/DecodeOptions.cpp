@@ -1,11 +1,12 @@
 #include "DecodeOptions.h"
 
+#include "RegularFile.h"
 #include "TelephonyConstants.h"
 
 #include <QCommandLineParser>
 
 #include <algorithm>
-#include <fstream>
+#include <array>
 
 namespace orvex {
 
@@ -29,9 +30,9 @@ bool isSnapshotFile(const std::string& path)
 {
     if (path.ends_with(".orvex"))
         return true;
-    std::string beginning(6, '\0');
-    std::ifstream(path, std::ios::binary)
-        .read(beginning.data(), static_cast<std::streamsize>(beginning.size()));
+    std::array<std::uint8_t, 6> bytes{};
+    RegularFile(path).readAt(0, bytes);
+    const std::string beginning(bytes.begin(), bytes.end());
     return beginning.starts_with("<?xml") || beginning.starts_with("<plist") || beginning == "bplist";
 }
 

@@ -1,3 +1,4 @@
+#include "DlfRecords.h"
 #include "ReadAhead.h"
 
 #include "DlfBytes.h"
@@ -5,6 +6,10 @@
 #include "TemporaryFile.h"
 
 #include <gtest/gtest.h>
+
+#include <filesystem>
+
+#include <sys/stat.h>
 
 namespace orvex {
 namespace {
@@ -77,6 +82,35 @@ TEST(CaptureReader, GivesWhatIsWholeAndSaysWhatIsNot)
     Bytes message{1}; // a record behind its log type
     EXPECT_EQ(Bytes(reader->message().begin(), reader->message().end()), message += dlfRecord(20, 1));
     EXPECT_EQ(contentOf("/no/such/capture"), "; No such file or directory");
+    EXPECT_EQ(contentOf("/"), "; Is a directory");
+    EXPECT_EQ(contentOf("/dev/zero"), "; not a regular file");
+    std::filesystem::remove(file.path);
+    ASSERT_EQ(mkfifo(file.path.c_str(), 0600), 0);
+    EXPECT_EQ(contentOf(file.path), "; not a regular file") << "nobody waits for a writer";
+}
+
+// Read window by window it gives the records that it gives as a whole.
+TEST(CaptureReader, LongDlfIsReadAsAStream)
+{
+    Bytes dlf;
+    for (std::size_t i = 0; dlf.size() < std::size_t{3} << 20; ++i) {
+        dlf += dlfRecord(i % 97 == 0 ? 65'535 : 12 + i % 1'000, static_cast<std::uint8_t>(i), 0);
+        if (i % 50 == 0)
+            dlf += Bytes(i); // makes no record
+    }
+    dlf += Bytes(std::size_t{2} << 20); // longer than a window
+    dlf += dlfRecord(40, 1);
+    dlf += dlfRecord(50, 2);
+    std::string expected = "0 us:";
+    DlfRecords records(dlf);
+    while (const auto record = records.next())
+        expected += ' ' + std::to_string(record->bytes.size() + 1);
+    expected += "; " + std::to_string(records.skippedBytes()) + " bytes that make no record were skipped";
+    const TemporaryFile file;
+    std::string content = contentOf(writeFile(file.path, dlf));
+    content.replace(0, content.find(':'), "0 us");
+    EXPECT_TRUE(content == expected) << content.size() << ' ' << expected.size();
+    EXPECT_GT(expected.size(), 5'000U);
 }
 
 TEST(ReadAhead, KeepsLongCapturesInOrderAndMayBeLeft)

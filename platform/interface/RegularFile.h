@@ -1,0 +1,47 @@
+#pragma once
+
+#include "Value.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <cstdio>
+#include <span>
+#include <string>
+
+namespace orvex {
+
+// A regular file, open for reading. Anything else is refused: a pipe may never have a writer, and a device
+// may never end.
+class RegularFile {
+public:
+    explicit RegularFile(const std::string& path);
+    ~RegularFile();
+    RegularFile(const RegularFile&) = delete;
+    RegularFile& operator=(const RegularFile&) = delete;
+
+    // Why the file cannot be read, without its path; empty while all is well.
+    const std::string& error() const { return _error; }
+    std::uint64_t size() const { return _size; }
+    // Fills the buffer from this place in the file on. Returns the number of bytes: less than the buffer
+    // holds only at the end of the file or after an error.
+    std::size_t readAt(std::uint64_t place, std::span<std::uint8_t> buffer);
+    // A stream of the whole file, for the caller to close; null after an error.
+    std::FILE* openStream();
+
+private:
+    void fail();
+
+    int _descriptor;
+    std::uint64_t _size = 0;
+    std::string _error;
+};
+
+struct FileContent {
+    Bytes bytes;
+    std::string error; // as that of RegularFile; empty when all of the file was read
+};
+
+// The whole file, when it is no longer than the limit. No more than that is ever read.
+FileContent readFile(const std::string& path, std::size_t limit);
+
+} // namespace orvex
