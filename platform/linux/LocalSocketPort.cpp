@@ -2,13 +2,14 @@
 
 #include "SystemLog.h"
 
-#include <QLocalServer>
 #include <QLocalSocket>
 #include <QPointer>
+#include <QTimer>
 
 #include <algorithm>
 #include <cerrno>
 #include <cstring>
+#include <tuple>
 
 #include <sys/socket.h>
 #include <sys/stat.h>
@@ -18,17 +19,51 @@
 namespace orvex {
 
 namespace {
-constexpr std::size_t kMostConnections = 64;
+using namespace std::chrono_literals;
+
+constexpr std::size_t kMostConnections = 16;
+constexpr std::size_t kMostPartialBytes = std::size_t{64} << 20;
+constexpr auto kIdle = 1s; // without a message, a peer may have to leave
+constexpr int kBacklog = 64;
+constexpr int kPeersPerTurn = 64;
+constexpr auto kPause = 500ms; // when the process has no descriptor left for a peer
+
+int makeSocket()
+{
+    return socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0);
+}
+
+sockaddr_un addressOf(const std::string& path)
+{
+    sockaddr_un address{};
+    address.sun_family = AF_UNIX;
+    path.copy(address.sun_path, sizeof address.sun_path - 1);
+    return address;
+}
+
+// A socket that listens under the path; -1 with errno when there can be none.
+int listenAt(const std::string& path)
+{
+    const int listener = makeSocket();
+    if (listener < 0)
+        return -1;
+    const sockaddr_un address = addressOf(path);
+    if (bind(listener, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0
+        && listen(listener, kBacklog) == 0)
+        return listener;
+    const int error = errno;
+    close(listener);
+    errno = error;
+    return -1;
+}
 
 // The error of a connection attempt to the socket; 0 when somebody listens there.
 int connectionError(const std::string& path)
 {
-    const int probe = socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0);
+    const int probe = makeSocket();
     if (probe < 0)
         return errno;
-    sockaddr_un address{};
-    address.sun_family = AF_UNIX;
-    path.copy(address.sun_path, sizeof address.sun_path - 1);
+    const sockaddr_un address = addressOf(path);
     const auto* generic = reinterpret_cast<const sockaddr*>(&address);
     const int error = connect(probe, generic, sizeof address) == 0 ? 0 : errno;
     close(probe);
@@ -68,25 +103,50 @@ LocalSocketPort::ListenResult LocalSocketPort::listen()
     if (error == ECONNREFUSED && isSocketFile(*path))
         unlink(path->c_str());
 
-    auto server = std::make_unique<QLocalServer>();
-    if (!server->listen(QString::fromStdString(*path))) {
-        systemLog(Priority::error, "Message port %s: %s", _name.c_str(), qPrintable(server->errorString()));
+    const int listener = listenAt(*path);
+    if (listener < 0) {
+        systemLog(Priority::error, "Message port %s: %s", _name.c_str(), std::strerror(errno));
         return ListenResult::failed;
     }
-    _server = std::move(server);
-    QObject::connect(_server.get(), &QLocalServer::newConnection, _server.get(), [this] { acceptPeers(); });
+    _listener = std::make_unique<QSocketNotifier>(listener, QSocketNotifier::Read);
+    QObject::connect(
+        _listener.get(), &QSocketNotifier::activated, _listener.get(), [this] { acceptPeers(); });
     return ListenResult::listening;
 }
 
 void LocalSocketPort::acceptPeers()
 {
-    while (QLocalSocket* peer = _server->nextPendingConnection()) {
-        std::unique_ptr<QLocalSocket> socket(peer);
-        socket->setParent(nullptr); // it is ours, not the server's
+    for (int i = 0; i < kPeersPerTurn; ++i) {
+        const int peer =
+            accept4(static_cast<int>(_listener->socket()), nullptr, nullptr, SOCK_CLOEXEC | SOCK_NONBLOCK);
+        if (peer < 0) {
+            if (errno == EMFILE || errno == ENFILE || errno == ENOMEM || errno == ENOBUFS)
+                pauseListening(errno);
+            return; // else there are no more, or this one has gone
+        }
+        auto socket = std::make_unique<QLocalSocket>();
+        if (!socket->setSocketDescriptor(peer)) {
+            ::close(peer);
+            continue;
+        }
         if (isWelcome(*socket) && makeRoom())
-            _connections.push_back(std::make_unique<PortConnection>(_name, std::move(socket), _receiver,
-                [this](PortConnection* connection) { remove(connection); }));
+            _connections.push_back(std::make_unique<PortConnection>(
+                _name, std::move(socket), _receiver,
+                [this](PortConnection* connection) { remove(connection); },
+                [this] { boundPartialMessages(); }));
     }
+}
+
+void LocalSocketPort::pauseListening(int error)
+{
+    // The peer goes on waiting. Without a pause the event loop would do nothing but try.
+    systemLog(Priority::error, "Message port %s: a peer has to wait: %s", _name.c_str(),
+        std::strerror(error)); // NOLINT(concurrency-mt-unsafe)
+    _listener->setEnabled(false);
+    QTimer::singleShot(kPause, _listener.get(), [this] {
+        systemLog(Priority::warning, "Message port %s: listening again", _name.c_str());
+        _listener->setEnabled(true);
+    });
 }
 
 bool LocalSocketPort::isWelcome(const QLocalSocket& socket) const
@@ -109,16 +169,39 @@ bool LocalSocketPort::makeRoom()
 {
     if (_connections.size() < kMostConnections)
         return true;
-    const auto idle = std::ranges::find_if(_connections, &PortConnection::isIdle);
-    if (idle == _connections.end()) {
+    // First those that never said anything, then the others; of both the one that is idle for longest.
+    const auto rank = [](const auto& connection) {
+        return std::tuple(!connection->isHandling(), !connection->hasSpoken(), connection->idleTime());
+    };
+    const auto idle = std::ranges::max_element(_connections, {}, rank);
+    const bool isIdle = !(*idle)->hasSpoken() || (*idle)->idleTime() >= kIdle;
+    if ((*idle)->isHandling() || !isIdle) {
         systemLog(Priority::error, "Message port %s: a peer was refused, %zu are connected", _name.c_str(),
             _connections.size());
         return false;
     }
-    systemLog(Priority::warning, "Message port %s: a silent peer was closed, %zu are connected",
-        _name.c_str(), _connections.size());
+    systemLog(Priority::warning, "Message port %s: an idle peer was closed, %zu are connected", _name.c_str(),
+        _connections.size());
     _connections.erase(idle);
     return true;
+}
+
+void LocalSocketPort::boundPartialMessages()
+{
+    std::size_t total = 0;
+    for (const auto& connection : _connections)
+        total += connection->partialBytes();
+    while (total > kMostPartialBytes) {
+        const auto rank = [](const auto& connection) {
+            const bool mayGo = connection->partialBytes() > 0 && !connection->isHandling();
+            return std::pair(mayGo, connection->idleTime());
+        };
+        const auto slowest = std::ranges::max_element(_connections, {}, rank);
+        systemLog(Priority::error, "Message port %s: a peer inside a message was closed, %zu bytes wait",
+            _name.c_str(), total);
+        total -= (*slowest)->partialBytes();
+        _connections.erase(slowest);
+    }
 }
 
 void LocalSocketPort::remove(PortConnection* connection)
@@ -156,12 +239,15 @@ void LocalSocketPort::setInvalidationCallback(std::function<void()> callback)
 
 void LocalSocketPort::close()
 {
-    if (!_server)
+    if (!_listener)
         return;
     // A starter that comes between the closing and the removal would lose its fresh file.
     const auto lock = _directory.lock();
-    _server->close(); // removes the file
-    _server.reset();
+    const int listener = static_cast<int>(_listener->socket());
+    _listener.reset();
+    ::close(listener);
+    if (const auto path = _directory.socketPath(_name))
+        unlink(path->c_str());
     _connections.clear();
 }
 

@@ -16,14 +16,16 @@ constexpr qint64 kUnhandledBytes = qint64{1} << 20; // read from the socket ahea
 constexpr qint64 kUnreadReplyBytes = qint64{1} << 20;
 } // namespace
 
-PortConnection::PortConnection(
-    std::string portName, std::unique_ptr<QLocalSocket> socket, Receiver receiver, EndHandler onEnd)
+PortConnection::PortConnection(std::string portName, std::unique_ptr<QLocalSocket> socket, Receiver receiver,
+    EndHandler onEnd, PartialHandler onPartial)
     : _portName(std::move(portName))
     , _socket(std::move(socket))
     , _reader(std::make_shared<FrameReader>())
     , _receiver(std::move(receiver))
     , _onEnd(std::move(onEnd))
+    , _onPartial(std::move(onPartial))
 {
+    _idle.start();
     _socket->setReadBufferSize(kUnhandledBytes);
     connect(_socket.get(), &QLocalSocket::readyRead, this, [this] { wake(); });
     connect(_socket.get(), &QLocalSocket::disconnected, this, [this] { wake(); });
@@ -84,6 +86,8 @@ bool PortConnection::handleMessages()
             reply(*message, *answer);
     }
     _isHandling = false;
+    if (handled > 0)
+        _idle.start();
     if (handled == kMessagesPerTurn) {
         wake();
         return true;
@@ -95,9 +99,11 @@ bool PortConnection::handleMessages()
     if (reader->fault())
         systemLog(
             Priority::error, "Message port %s: connection closed, %s", _portName.c_str(), reader->fault());
-    else if (_socket->state() == QLocalSocket::ConnectedState)
+    else if (_socket->state() == QLocalSocket::ConnectedState) {
+        if (reader->isInsideFrame())
+            _onPartial();
         return handled > 0;
-    else if (reader->isInsideFrame())
+    } else if (reader->isInsideFrame())
         systemLog(Priority::warning, "Message port %s: a peer left inside a message", _portName.c_str());
     _onEnd(this); // destroys this
     return handled > 0;

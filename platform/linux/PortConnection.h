@@ -4,8 +4,10 @@
 #include "PortFrame.h"
 
 #include <QBasicTimer>
+#include <QElapsedTimer>
 #include <QObject>
 
+#include <chrono>
 #include <functional>
 #include <memory>
 #include <string>
@@ -24,17 +26,24 @@ public:
     using Receiver = std::shared_ptr<const MessagePorts::Receiver>;
     // Tells the owner to destroy the connection, which has ended.
     using EndHandler = std::function<void(PortConnection*)>;
+    // Called when a frame stays incomplete. May destroy the connection.
+    using PartialHandler = std::function<void()>;
 
-    PortConnection(
-        std::string portName, std::unique_ptr<QLocalSocket> socket, Receiver receiver, EndHandler onEnd);
+    PortConnection(std::string portName, std::unique_ptr<QLocalSocket> socket, Receiver receiver,
+        EndHandler onEnd, PartialHandler onPartial);
     ~PortConnection() override;
 
     // Handles what has come so far without the event loop. A peer that goes on sending does not hold it up
     // for ever.
     void handleWaiting();
 
-    // True when it can be given up for another: it has never sent a whole message.
-    bool isIdle() const { return !_hasSpoken && !_isHandling; }
+    // True when a message is being handled, so that the connection has to stay.
+    bool isHandling() const { return _isHandling; }
+    // True when it has sent a whole message.
+    bool hasSpoken() const { return _hasSpoken; }
+    // Since its last whole message, or since it connected.
+    std::chrono::milliseconds idleTime() const { return std::chrono::milliseconds(_idle.elapsed()); }
+    std::size_t partialBytes() const { return _reader->partialBytes(); }
 
 private:
     void timerEvent(QTimerEvent*) noexcept override;
@@ -49,6 +58,8 @@ private:
     std::shared_ptr<FrameReader> _reader; // shared with the call that is at work in it
     Receiver _receiver;
     EndHandler _onEnd;
+    PartialHandler _onPartial;
+    QElapsedTimer _idle;
     QBasicTimer _turn;
     bool _isHandling = false;
     bool _hasSpoken = false;

@@ -42,17 +42,23 @@ void FrameReader::append(ByteView bytes)
 {
     // The one move of what is left, an incomplete frame as a rule, per read.
     _bytes.erase(_bytes.begin(), _bytes.begin() + static_cast<std::ptrdiff_t>(std::exchange(_taken, 0)));
-    constexpr std::size_t kKeptCapacity = std::size_t{1} << 20;
-    if (_bytes.empty() && _bytes.capacity() > kKeptCapacity)
-        _bytes.shrink_to_fit(); // after an exceptionally long frame
+    if (_bytes.size() >= kFrameHeaderSize) // room for the frame, not for twice as much
+        _bytes.reserve(
+            kFrameHeaderSize + std::min<std::size_t>(u32(_bytes, 0), kLargestPayload) + bytes.size());
     _bytes.insert(_bytes.end(), bytes.begin(), bytes.end());
 }
 
 std::optional<Frame> FrameReader::take()
 {
     const ByteView rest = ByteView(_bytes).subspan(_taken);
-    if (_fault || rest.size() < kFrameHeaderSize)
+    if (_fault || rest.size() < kFrameHeaderSize) {
+        constexpr std::size_t kKeptCapacity = std::size_t{1} << 20;
+        if (rest.empty() && _bytes.capacity() > kKeptCapacity) {
+            Bytes().swap(_bytes); // after an exceptionally long frame
+            _taken = 0;
+        }
         return std::nullopt;
+    }
     const std::size_t length = u32(rest, 0);
     const std::uint32_t kind = u32(rest, 8);
     if (length > kLargestPayload)

@@ -33,7 +33,7 @@ Bytes encodedFrame(const Frame& frame);
 // Cuts a byte stream into frames.
 class FrameReader {
 public:
-    // Takes bytes in the order of the stream. Payloads handed out before are gone.
+    // Takes bytes in the order of the stream. Payloads handed out before are gone, here and in take().
     void append(ByteView bytes);
 
     // The next whole frame; none when it is not complete yet or the stream is broken.
@@ -42,7 +42,9 @@ public:
     // Why nothing more can be read, as a header made no sense; null while all is well.
     const char* fault() const { return _fault; }
     // True when the stream ends inside a frame.
-    bool isInsideFrame() const { return _taken < _bytes.size(); }
+    bool isInsideFrame() const { return partialBytes() > 0; }
+    // Bytes that wait for the rest of their frame.
+    std::size_t partialBytes() const { return _bytes.size() - _taken; }
 
 private:
     Bytes _bytes;

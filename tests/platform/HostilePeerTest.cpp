@@ -4,6 +4,7 @@
 #include <deque>
 
 #include <sys/fsuid.h>
+#include <sys/resource.h>
 
 namespace orvex {
 namespace {
@@ -57,17 +58,67 @@ TEST_F(HostilePeerTest, NumberOfPeersIsBounded)
         peers.emplace_back(pathOf("a")).say(1, word);
         turnFor(1ms);
     };
-    for (int i = 0; i < 64; ++i)
+    for (int i = 0; i < 16; ++i)
         connect("x");
-    EXPECT_TRUE(waitUntil([&] { return received.size() == 256; }));
+    EXPECT_TRUE(waitUntil([&] { return received.size() == 64; }));
     received.clear();
     connect("one too many");
     EXPECT_TRUE(waitUntil([&] { return peers.back().isClosedByOther(); }));
-    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("a peer was refused, 64 are connected")));
+    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("a peer was refused, 16 are connected")));
     peers.pop_front();
     turnFor(20ms);
     connect("next");
     EXPECT_TRUE(waitUntil([&] { return received == "1:next "; })) << "the place of the one that left is free";
+
+    turnFor(1100ms);
+    peers.back().say(1, "on");
+    turnFor(10ms);
+    log.take();
+    connect("late");
+    EXPECT_TRUE(waitUntil([&] { return received.ends_with("1:late "); })) << received;
+    EXPECT_TRUE(peers.front().isClosedByOther()) << "it has been idle for longest";
+    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("an idle peer was closed, 16 are connected")));
+}
+
+TEST_F(HostilePeerTest, PartialMessagesAreBoundedAsAWhole)
+{
+    const auto local = ports.createLocalPort("a", collector());
+    const Bytes most = encodedFrame({1, FrameKind::oneWay, 0, Bytes(kLargestPayload)});
+    std::deque<RawPeer> peers;
+    for (int i = 0; i < 4; ++i) {
+        peers.emplace_back(pathOf("a")).write(ByteView(most).first(most.size() - 100));
+        turnFor(20ms);
+    }
+    EXPECT_TRUE(log.take().empty());
+    RawPeer honest(pathOf("a"));
+    honest.write(most);
+    EXPECT_TRUE(waitUntil([&] { return received.size() == kLargestPayload + 3; })) << received.size();
+    EXPECT_TRUE(peers[0].isClosedByOther());
+    EXPECT_FALSE(peers[1].isClosedByOther());
+    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("a peer inside a message was closed")));
+}
+
+TEST_F(HostilePeerTest, PortListensAgainWhenThereAreDescriptors)
+{
+    const auto local = ports.createLocalPort("a", collector());
+    std::deque<int> descriptors;
+    rlimit limit{};
+    getrlimit(RLIMIT_NOFILE, &limit);
+    const rlimit few{200, limit.rlim_max};
+    setrlimit(RLIMIT_NOFILE, &few);
+    for (int i = dup(0); i >= 0; i = dup(0))
+        descriptors.push_back(i);
+    close(descriptors.back()); // for the peer's own end
+    descriptors.pop_back();
+    const RawPeer peer(pathOf("a"));
+    peer.say(1, "here");
+    EXPECT_TRUE(waitUntil([&] { return !log.lines.empty(); }));
+    turnFor(100ms);
+    for (const int descriptor : descriptors)
+        close(descriptor);
+    setrlimit(RLIMIT_NOFILE, &limit);
+    EXPECT_TRUE(waitUntil([&] { return received == "1:here "; }));
+    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("Too many open files"), HasSubstr("listening again")));
 }
 
 TEST_F(HostilePeerTest, SilentPeersDoNotKeepOthersOut)
@@ -94,7 +145,7 @@ TEST_F(HostilePeerTest, SilentPeersDoNotKeepOthersOut)
     late.say(3, "late");
     EXPECT_TRUE(waitUntil([&] { return received.ends_with("3:late "); })) << received;
     EXPECT_EQ(received.size(), 7U + 10 * 5 + 7);
-    EXPECT_THAT(log.take(), testing::Each(HasSubstr("a silent peer was closed, 64 are connected")));
+    EXPECT_THAT(log.take(), testing::Each(HasSubstr("an idle peer was closed, 16 are connected")));
 }
 
 TEST_F(HostilePeerTest, FloodLeavesTheEventLoopItsTurns)
