@@ -31,12 +31,15 @@ std::string FileResources::defaultDirectory()
         return chosen;
     std::error_code error;
     const fs::path program = fs::read_symlink("/proc/self/exe", error);
-    // An installed program lies elsewhere and knows nothing of the source tree.
-    if (!error && isInside(program, ORVEX_BUILD_DIRECTORY)) {
-        const fs::path sources = fs::path(ORVEX_SOURCE_DIRECTORY) / "resources";
-        if (fs::is_directory(sources, error))
-            return sources.string();
-    }
+    if (error)
+        return ORVEX_DATA_DIRECTORY;
+    const fs::path besideProgram = (program.parent_path() / ORVEX_DATA_FROM_PROGRAM).lexically_normal();
+    if (fs::is_directory(besideProgram, error))
+        return besideProgram.string();
+    // An installed program knows nothing of the source tree.
+    const fs::path sources = fs::path(ORVEX_SOURCE_DIRECTORY) / "resources";
+    if (isInside(program, ORVEX_BUILD_DIRECTORY) && fs::is_directory(sources, error))
+        return sources.string();
     return ORVEX_DATA_DIRECTORY;
 }
 

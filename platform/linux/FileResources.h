@@ -14,8 +14,9 @@ public:
     {
     }
 
-    // $ORVEX_RESOURCES; else, for a program that runs from the build tree, the source tree's resources; else
-    // the installed data directory.
+    // $ORVEX_RESOURCES; else the data directory of the installation that the program is part of, wherever
+    // that lies now; else, for a program that runs from the build tree, the source tree's resources; else the
+    // data directory chosen at configuration.
     static std::string defaultDirectory();
 
     std::vector<std::string> propertyListPaths() const override;
