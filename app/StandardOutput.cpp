@@ -1,22 +1,39 @@
 #include "StandardOutput.h"
 
 #include <cerrno>
+#include <poll.h>
 #include <sys/ioctl.h>
 #include <unistd.h>
 #include <utility>
 
 namespace orvex {
 
+StandardOutput::StandardOutput(std::function<void(int error)> onClosed)
+    : _onClosed(std::move(onClosed))
+    , _readerGone(STDOUT_FILENO, QSocketNotifier::Exception)
+{
+    QObject::connect(&_readerGone, &QSocketNotifier::activated, &_readerGone, [this] {
+        pollfd output{.fd = STDOUT_FILENO, .events = 0, .revents = 0};
+        if (::poll(&output, 1, 0) > 0 && (output.revents & POLLERR) != 0)
+            close(EPIPE);
+    });
+}
+
+void StandardOutput::close(int error)
+{
+    _readerGone.setEnabled(false);
+    if (const auto closed = std::exchange(_onClosed, nullptr))
+        closed(error);
+}
+
 void StandardOutput::write(std::string_view text)
 {
-    while (!text.empty()) {
+    while (!text.empty() && _onClosed) {
         const ssize_t written = ::write(STDOUT_FILENO, text.data(), text.size());
         if (written >= 0) {
             text.remove_prefix(static_cast<std::size_t>(written));
         } else if (errno != EINTR) {
-            if (const auto closed = std::exchange(_onClosed, nullptr))
-                closed();
-            return;
+            return close(errno);
         }
     }
 }

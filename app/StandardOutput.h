@@ -2,6 +2,8 @@
 
 #include "ConsoleOutput.h"
 
+#include <QSocketNotifier>
+
 #include <functional>
 
 namespace orvex {
@@ -9,17 +11,18 @@ namespace orvex {
 // The process's standard output.
 class StandardOutput final : public ConsoleOutput {
 public:
-    // The callback is called once, when nobody reads any more.
-    explicit StandardOutput(std::function<void()> onClosed)
-        : _onClosed(std::move(onClosed))
-    {
-    }
+    // The callback is called once, when nothing can be written any more, with the error: EPIPE when nobody
+    // reads, which is noticed without writing.
+    explicit StandardOutput(std::function<void(int error)> onClosed);
 
     void write(std::string_view text) override;
     std::optional<TerminalSize> terminalSize() const override;
 
 private:
-    std::function<void()> _onClosed;
+    void close(int error);
+
+    std::function<void(int error)> _onClosed;
+    QSocketNotifier _readerGone;
 };
 
 } // namespace orvex

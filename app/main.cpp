@@ -19,6 +19,7 @@
 #include "LinuxSystemLog.h"
 #include "QtRunLoop.h"
 #include "SocketMessagePorts.h"
+#include "StandardStreams.h"
 #include "SystemClock.h"
 #include "TerminationSignals.h"
 
@@ -28,12 +29,15 @@
 
 #include <QApplication>
 #include <QScreen>
+#include <QTimer>
 
 #include <algorithm>
+#include <cerrno>
 #include <clocale>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
+#include <cstring>
 #include <filesystem>
 #include <functional>
 #include <optional>
@@ -123,11 +127,19 @@ int runConsole(int argc, char** argv, const std::string& resourceDirectory)
             writeConsoleToStandardError(line);
     });
     LinuxPlatform platform(resourceDirectory);
-    StandardOutput output([] { QCoreApplication::quit(); });
+    int status = EXIT_SUCCESS;
+    StandardOutput output([&status](int error) {
+        if (error != EPIPE) {
+            std::fprintf(stderr, "orvex: standard output: %s\n", std::strerror(error));
+            status = kExitFailure;
+        }
+        installConsole([](std::string_view) {});        // nobody is left to read about the end
+        QTimer::singleShot(0, &QCoreApplication::quit); // the event loop may not run yet
+    });
     OrvexConsole console(platform.forApp(), output);
     const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
     console.start();
-    const int status = QCoreApplication::exec();
+    QCoreApplication::exec();
     console.applicationWillTerminate();
     return status;
 }
@@ -159,7 +171,7 @@ int runWindow(int argc, char** argv, const std::string& resourceDirectory, const
     return runInWindow(argc, argv, commandLine.theme, [&resourceDirectory, &commandLine] {
         LinuxPlatform platform(resourceDirectory);
         const auto app = OrvexApp::create(platform.forApp(), windowSize(commandLine));
-        StandardOutput output([] {}); // the window stays when nobody reads
+        StandardOutput output([](int) {}); // the window stays when nobody reads
         std::optional<StatusPrinter> statusPrinter;
         if (commandLine.printsStatus) {
             installConsole(writeConsoleToStandardError);
@@ -208,6 +220,7 @@ int showSnapshot(int argc, char** argv, const CommandLine& commandLine)
 
 int main(int argc, char** argv)
 {
+    occupyStandardStreams();
     QStringList arguments;
     for (int i = 0; i < argc; ++i)
         arguments << QString::fromLocal8Bit(argv[i]);

@@ -14,17 +14,29 @@ namespace orvex {
 namespace {
 constexpr std::array kSignals = {SIGINT, SIGTERM, SIGHUP};
 
+constexpr unsigned kSecondsToEnd = 1;
+
 std::atomic<int> theWriteEnd = -1;
+std::atomic<int> theSignal = 0;
 static_assert(std::atomic<int>::is_always_lock_free);
 
 // Writing to a pipe is all a handler may do here; the event loop reads the other end.
-extern "C" void passToEventLoop(int)
+extern "C" void passToEventLoop(int signal)
 {
     const int savedError = errno;
+    if (theSignal.exchange(signal) == 0)
+        ::alarm(kSecondsToEnd); // not put off by further signals
     const char byte = 1;
     [[maybe_unused]] const ssize_t written =
         ::write(theWriteEnd.load(), &byte, 1); // a full pipe is told already
     errno = savedError;
+}
+
+// Interrupts whatever the process is stuck in.
+extern "C" void die(int)
+{
+    std::signal(theSignal, SIG_DFL);
+    std::raise(theSignal);
 }
 
 void setHandler(void (*handler)(int))
@@ -52,6 +64,7 @@ TerminationSignals::TerminationSignals(std::function<void()> onSignal)
             while (::read(_readEnd, &byte, 1) > 0) { }
             handler();
         });
+    std::signal(SIGALRM, die); // stays when the object goes: the process may get stuck later
     setHandler(passToEventLoop);
 }
 

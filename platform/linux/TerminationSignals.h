@@ -9,6 +9,9 @@ namespace orvex {
 
 // Turns SIGINT, SIGTERM and SIGHUP into a call on the event loop. At most one object at a time; when it goes
 // the signals have their former effect again.
+//
+// A process that has not ended one second after a signal, as it waits for a reader, a bus or a service, dies
+// of that signal.
 class TerminationSignals {
 public:
     explicit TerminationSignals(std::function<void()> onSignal);

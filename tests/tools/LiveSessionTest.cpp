@@ -128,6 +128,46 @@ TEST_F(LiveSession, EndsWhenItsWindowWasPaintedIfItIsTo)
     EXPECT_EQ(monitor.output(), "painted\n");
 }
 
+// Each line is run by a shell; the program is $1, and $2 a file. What stands still would do so for ever.
+TEST_F(LiveSession, EndsInTimeWhateverStandsStill)
+{
+    using namespace std::chrono_literals;
+    const struct {
+        const char* name;
+        const char* program;
+        std::string line;
+        int status;
+        const char* errors;
+    } cases[] = {
+        {"reader gone", ORVEX_PATH, "{ $1 --console; echo $? > $2; } | true; exit $(cat $2)", 0, ""},
+        {"no room", ORVEX_PATH, "exec $1 --console > /dev/full", 1,
+            "orvex: standard output: No space left on device\n"},
+        {"no standard output", ORVEX_PATH, "exec $1 --console >&-", 1,
+            "orvex: standard output: Bad file descriptor\n"},
+        {"output stuck", ORVEX_PATH,
+            "mkfifo $2; exec 3<> $2; head -c 65536 /dev/zero >&3; $1 --console >&3 & p=$!; sleep 0.7; "
+            "kill $p; wait $p",
+            128 + SIGTERM, "Terminated\n"},
+        {"log stuck", ORVEX_PATH,
+            "mkfifo $2; exec 3<> $2; head -c 65536 /dev/zero >&3; $1 --console > /dev/null 2>&3 & p=$!; "
+            "sleep 0.7; kill -HUP $p; wait $p",
+            128 + SIGHUP, "Hangup\n"},
+        {"readers of koratd's lines gone", KORATD_PATH,
+            "{ $1 2>&3 & p=$!; sleep 0.5; kill -0 $p && kill -INT $p; wait $p; echo $? > $2; } 3>&1 | true; "
+            "exit $(cat $2)",
+            0, ""},
+    };
+    for (const auto& [name, program, line, status, errors] : cases) {
+        const ProgramFolder own;
+        const auto start = std::chrono::steady_clock::now();
+        Program shell(own, "/bin/sh",
+            {"-c", QString::fromStdString(line), "sh", program, QString::fromStdString(own.path("file"))});
+        EXPECT_EQ(shell.waitForEnd(), status) << name;
+        EXPECT_LT(std::chrono::steady_clock::now() - start, 2700ms) << name;
+        EXPECT_EQ(shell.errors(), errors) << name;
+    }
+}
+
 TEST_F(LiveSession, AFaultIsLoggedAndLeavesTheMonitorConnecting)
 {
     const std::pair<const char*, const char*> cases[] = {

@@ -7,10 +7,12 @@
 #include "LinuxSystemLog.h"
 #include "QtRunLoop.h"
 #include "SocketMessagePorts.h"
+#include "StandardStreams.h"
 #include "TerminationSignals.h"
 
 #include <QCoreApplication>
 
+#include <csignal>
 #include <cstdio>
 
 namespace {
@@ -33,6 +35,8 @@ int serve(const orvex::korat::Options& options)
 
 int main(int argc, char** argv)
 {
+    orvex::occupyStandardStreams();
+    std::signal(SIGPIPE, SIG_IGN); // a reader of its lines that goes does not end the service
     const QCoreApplication application(argc, argv);
     const auto log = orvex::makeLinuxSystemLog("koratd");
     orvex::SystemLog::install(log.get());

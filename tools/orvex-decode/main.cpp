@@ -14,6 +14,7 @@
 #include "FileResources.h"
 #include "FileSystemLog.h"
 #include "NodesByPath.h"
+#include "StandardStreams.h"
 #include "SystemClock.h"
 
 #include "Console.h"
@@ -240,6 +241,7 @@ int decode(const DecodeOptions& options)
 
 int main(int argc, char** argv)
 {
+    occupyStandardStreams();
     const DecodeOptions options = DecodeOptions::parse(argc, argv);
     switch (options.action) {
     case DecodeOptions::Action::help: std::cout << DecodeOptions::usage(); return 0;
