@@ -41,16 +41,6 @@ constexpr Technology kTechnologies[] = {
     {telephony::kTechnologyIFX, "IFX"},
 };
 
-// Without the document type of a property list, which is long and says nothing.
-Bytes shortened(Bytes bytes)
-{
-    constexpr std::string_view kBegin = "<!DOCTYPE";
-    const auto begin = std::search(bytes.begin(), bytes.end(), kBegin.begin(), kBegin.end());
-    const auto end = std::find(begin, bytes.end(), '\n');
-    bytes.erase(begin, end == bytes.end() ? end : end + 1);
-    return bytes;
-}
-
 class SeedWriter {
 public:
     explicit SeedWriter(fs::path folder)
@@ -85,7 +75,7 @@ private:
         while (messages.size() < count) {
             korat::LogMessage message = scenario->next().message;
             if (message.code.value_or(0) < korat::kExtraCodes)
-                messages.push_back(shortened(std::move(message.bytes)));
+                messages.push_back(std::move(message.bytes));
         }
         return messages;
     }
@@ -105,7 +95,7 @@ private:
         for (auto item = scenario->next(); item.due <= kDrive; item = scenario->next()) {
             Bytes& longest = byCode[item.message.code.value_or(0)];
             if (item.message.bytes.size() > longest.size())
-                longest = shortened(std::move(item.message.bytes));
+                longest = std::move(item.message.bytes);
         }
         for (const auto& [code, message] : byCode)
             write(technology.target, text("code-%06x", code), InputMessages::inputOf(Messages{message}));
@@ -124,7 +114,7 @@ private:
         session.display(); // makes a history entry
         const std::string path = _folder / "snapshot";
         writeSnapshot({"2024-03-05 14:07:09 +0000", session.saveContents(), "Seed"}, path);
-        return shortened(takeFile(path));
+        return takeFile(path);
     }
 
     // The beginning of a message of 64 bytes in an input: its length, then log type, length and code.
@@ -198,7 +188,7 @@ private:
             {"data", std::make_shared<Bytes>(Bytes{0, 1, 254, 255})},
             {"nested", Array::make({Dictionary::make(), Array::make({""})})},
         });
-        write("PropertyList", "xml", shortened(propertyListXML(list).value()));
+        write("PropertyList", "xml", propertyListXML(list).value());
         write("PropertyList", "binary", propertyListBinary(list).value());
         const Bytes report = firstMessages(telephony::kTechnologyIFX, 1).front();
         write(

@@ -5,7 +5,9 @@
 #include "TextFormat.h"
 
 #include <algorithm>
+#include <cerrno>
 #include <cmath>
+#include <cstring>
 #include <fstream>
 
 namespace orvex {
@@ -16,9 +18,27 @@ constexpr const char* kTimestamp = "Timestamp";
 constexpr const char* kData = "Data";
 constexpr const char* kDescription = "Description";
 
+// Of a file: five history entries, each with the largest report that a session takes as it came and as it is
+// shown, inside the snapshot's own containers; or 64 MiB of raw messages, twice, in base64.
+constexpr PropertyListLimits kLimits{
+    .maximumBytes = std::size_t{512} << 20, .maximumDepth = 512, .maximumNodes = 24'000'000};
+
 SnapshotResult failure(const std::string& path, const std::string& reason)
 {
     return {std::nullopt, path + ": " + reason};
+}
+
+// What would be refused anyway is not read into memory first.
+bool isLongAndNoPropertyList(const std::string& path)
+{
+    constexpr std::size_t kLong = std::size_t{1} << 20;
+    RegularFile file(path);
+    if (file.size() <= kLong)
+        return false;
+    std::string beginning(64, '\0');
+    file.readAt(0, {reinterpret_cast<std::uint8_t*>(beginning.data()), beginning.size()});
+    const auto first = beginning.find_first_not_of("\xEF\xBB\xBF \t\r\n");
+    return first == std::string::npos || (beginning[first] != '<' && !beginning.starts_with("bplist"));
 }
 
 // Why the property list is no snapshot; null when it is one.
@@ -47,27 +67,29 @@ std::string snapshotPath(const std::string& directory, Date saved)
         static_cast<long>(std::floor(saved.secondsSince1970)));
 }
 
-bool writeSnapshot(const Snapshot& snapshot, const std::string& path)
+std::string writeSnapshot(const Snapshot& snapshot, const std::string& path)
 {
-    const auto list = propertyListXML(Dictionary::make({
+    const Value list = Dictionary::make({
         {kTimestamp, snapshot.timestamp},
         {kData, snapshot.data},
         {kDescription, snapshot.description},
-    }));
-    if (!list)
-        return false;
+    });
+    if (const std::string fault = writePropertyListXML(list, [](std::string_view) {}); !fault.empty())
+        return path + ": " + fault;
     std::ofstream file(path, std::ios::binary);
-    file.write(reinterpret_cast<const char*>(list->data()), static_cast<std::streamsize>(list->size()));
+    writePropertyListXML(list, [&file](std::string_view piece) { file << piece; });
     file.close();
-    return !file.fail();
+    return file.fail() ? path + ": " + std::strerror(errno) : std::string(); // NOLINT(concurrency-mt-unsafe)
 }
 
 SnapshotResult readSnapshot(const std::string& path)
 {
-    const auto [bytes, error] = readFile(path, PropertyListLimits().maximumBytes);
+    if (isLongAndNoPropertyList(path))
+        return failure(path, "not a snapshot: it does not begin like a property list");
+    const auto [bytes, error] = readFile(path, kLimits.maximumBytes);
     if (!error.empty())
         return failure(path, error);
-    const auto list = propertyListFromData(bytes);
+    const auto list = propertyListFromData(bytes, kLimits);
     if (!list.value)
         return failure(path, "not a snapshot: " + list.error);
     if (const char* fault = faultOf(*list.value))

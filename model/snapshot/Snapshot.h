@@ -29,9 +29,10 @@ struct SnapshotResult {
 // DIRECTORY/OrvexSnapshot-SECONDS.orvex, by the moment of the save. Two of one second have one path.
 std::string snapshotPath(const std::string& directory, Date saved);
 
-// Writes the file in place: one that fails in the middle is left as it is. False when it could not be written
-// whole, or when the data holds what no property list can.
-bool writeSnapshot(const Snapshot& snapshot, const std::string& path);
+// Writes the file in place: one that fails in the middle is left as it is. Data that no property list can
+// hold leaves the file untouched. Returns why the snapshot could not be written, one line with the path, or
+// an empty text.
+std::string writeSnapshot(const Snapshot& snapshot, const std::string& path);
 
 // Takes the binary form too. A file that is cut or holds values of other kinds gives no snapshot.
 SnapshotResult readSnapshot(const std::string& path);

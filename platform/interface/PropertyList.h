@@ -3,9 +3,11 @@
 #include "Value.h"
 
 #include <cstddef>
+#include <functional>
 #include <optional>
 #include <span>
 #include <string>
+#include <string_view>
 
 namespace orvex {
 
@@ -25,9 +27,17 @@ struct PropertyListResult {
 PropertyListResult propertyListFromData(
     std::span<const std::uint8_t> data, const PropertyListLimits& limits = {});
 
-// The XML form. None when the value holds null, which has no form, or exceeds the limits.
-std::optional<Bytes> propertyListXML(const Value& value, const PropertyListLimits& limits = {});
-// The binary form of the same; none when there is no XML form.
-std::optional<Bytes> propertyListBinary(const Value& value, const PropertyListLimits& limits = {});
+// Takes a text piece by piece.
+using TextSink = std::function<void(std::string_view piece)>;
+
+// Writes the XML form, of any size. XML has no UIDs, which become what others write for them, a dictionary
+// with the one key CF$UID, and no sets, which become arrays. Returns one line that names the value without a
+// form: null, a date outside of the years 1 to 9999, a container that holds itself. Empty when there is none;
+// else the sink has got the text up to that value.
+std::string writePropertyListXML(const Value& value, const TextSink& sink);
+// The same in memory; none when a value has no form.
+std::optional<Bytes> propertyListXML(const Value& value);
+// The binary form. None when the value holds null or a container holds itself.
+std::optional<Bytes> propertyListBinary(const Value& value);
 
 } // namespace orvex

@@ -1,34 +1,204 @@
-// Writing binary property lists.
+// Writing binary property lists; BinaryPropertyListReader.h has the layout.
 
 #include "PropertyList.h"
 
-#include "DecimalPoint.h"
-#include "PropertyListNode.h"
+#include "PropertyListEpoch.h"
+#include "XMLText.h"
 
-#include <plist/plist.h>
+#include "Array.h"
+#include "Dictionary.h"
+
+#include <QString>
+#include <QStringDecoder>
+
+#include <algorithm>
+#include <bit>
+#include <unordered_map>
 
 namespace orvex {
 
-// By way of the text: libplist writes a negative number as one only when it has read it, and what has no form
-// or exceeds the limits is found on the way.
-std::optional<Bytes> propertyListBinary(const Value& value, const PropertyListLimits& limits)
+namespace {
+void append(Bytes& bytes, std::uint64_t number, std::size_t width)
 {
-    const auto xml = propertyListXML(value, limits);
-    if (!xml)
-        return std::nullopt;
-    const DecimalPoint decimalPoint;
-    plist_t parsed = nullptr;
-    plist_from_xml(
-        reinterpret_cast<const char*>(xml->data()), static_cast<std::uint32_t>(xml->size()), &parsed);
-    const PropertyListNode root(parsed);
-    char* list = nullptr;
-    std::uint32_t length = 0;
-    plist_to_bin(root.get(), &list, &length);
-    std::optional<Bytes> result;
-    if (list)
-        result.emplace(list, list + length);
-    plist_to_bin_free(list);
-    return result;
+    for (std::size_t i = width; i-- > 0;)
+        bytes.push_back(static_cast<std::uint8_t>(number >> (8 * i)));
+}
+
+std::size_t widthOf(std::uint64_t number)
+{
+    return number < 0x100 ? 1 : number < 0x10000 ? 2 : number < 0x1'0000'0000 ? 4 : 8;
+}
+
+void appendInteger(Bytes& bytes, std::uint64_t number)
+{
+    const std::size_t width = widthOf(number);
+    bytes.push_back(static_cast<std::uint8_t>(0x10 | std::countr_zero(width)));
+    append(bytes, number, width);
+}
+
+// Of an object of this many elements, characters or bytes.
+void appendMarker(Bytes& bytes, unsigned kind, std::size_t size)
+{
+    bytes.push_back(static_cast<std::uint8_t>(kind << 4 | std::min<std::size_t>(size, 0xF)));
+    if (size >= 0xF)
+        appendInteger(bytes, size);
+}
+
+// Recursive: what is written is no deeper than what can be read.
+class Writer {
+public:
+    // The object of the value; none when it has no form.
+    std::optional<std::size_t> add(const Value& value)
+    {
+        if (const std::string* text = value.string())
+            return addText(*text);
+        const std::size_t object = _objects.size();
+        _objects.emplace_back();
+        return fill(object, value) ? std::optional(object) : std::nullopt;
+    }
+
+    Bytes list() const
+    {
+        const std::size_t referenceWidth = widthOf(_objects.size());
+        Bytes list{'b', 'p', 'l', 'i', 's', 't', '0', '0'};
+        std::vector<std::size_t> offsets;
+        for (const Object& object : _objects) {
+            offsets.push_back(list.size());
+            list.insert(list.end(), object.bytes.begin(), object.bytes.end());
+            for (const std::size_t reference : object.references)
+                append(list, reference, referenceWidth);
+        }
+        const std::size_t table = list.size();
+        const std::size_t offsetWidth = widthOf(table);
+        for (const std::size_t offset : offsets)
+            append(list, offset, offsetWidth);
+        append(list, 0, 6);
+        list.push_back(static_cast<std::uint8_t>(offsetWidth));
+        list.push_back(static_cast<std::uint8_t>(referenceWidth));
+        append(list, _objects.size(), 8);
+        append(list, 0, 8); // the root comes first
+        append(list, table, 8);
+        return list;
+    }
+
+private:
+    struct Object {
+        Bytes bytes;                         // marker and content
+        std::vector<std::size_t> references; // behind them
+    };
+
+    // The object of a text, which equal texts share.
+    std::size_t addText(const std::string& text)
+    {
+        const auto [known, isNew] = _texts.try_emplace(text, _objects.size());
+        if (isNew)
+            appendText(_objects.emplace_back().bytes, text);
+        return known->second;
+    }
+
+    static void appendText(Bytes& bytes, const std::string& text)
+    {
+        const auto isASCII = [](char character) { return static_cast<unsigned char>(character) < 0x80; };
+        const std::string characters = xmlText(text);
+        if (std::ranges::all_of(characters, isASCII)) {
+            appendMarker(bytes, 0x5, characters.size());
+            bytes.insert(bytes.end(), characters.begin(), characters.end());
+            return;
+        }
+        QStringDecoder decoder(QStringDecoder::Utf8, QStringDecoder::Flag::ConvertInitialBom);
+        const QString wide = decoder(QByteArrayView(characters));
+        appendMarker(bytes, 0x6, static_cast<std::size_t>(wide.size()));
+        for (const QChar character : wide)
+            append(bytes, character.unicode(), 2);
+    }
+
+    bool fill(std::size_t object, const Value& value)
+    {
+        Bytes& bytes = _objects[object].bytes;
+        switch (value.kind()) {
+        case Value::Kind::null:
+        case Value::Kind::string: return false; // texts have objects already
+        case Value::Kind::boolean: bytes = {static_cast<std::uint8_t>(*value.boolean() ? 0x09 : 0x08)}; break;
+        case Value::Kind::integer: appendInteger(bytes, static_cast<std::uint64_t>(*value.integer())); break;
+        case Value::Kind::real:
+            bytes = {0x23};
+            append(bytes, std::bit_cast<std::uint64_t>(*value.real()), 8);
+            break;
+        case Value::Kind::date:
+            bytes = {0x33};
+            append(
+                bytes, std::bit_cast<std::uint64_t>(value.date()->secondsSince1970 - kPropertyListEpoch), 8);
+            break;
+        case Value::Kind::data:
+            appendMarker(bytes, 0x4, value.data()->size());
+            bytes.insert(bytes.end(), value.data()->begin(), value.data()->end());
+            break;
+        case Value::Kind::uid: {
+            const std::size_t width = widthOf(value.uid()->number);
+            bytes = {static_cast<std::uint8_t>(0x80 | (width - 1))};
+            append(bytes, value.uid()->number, width);
+            break;
+        }
+        case Value::Kind::array: return fillArray(object, 0xA, *value.heldArray());
+        case Value::Kind::set: return fillArray(object, 0xC, *value.set()->elements);
+        case Value::Kind::dictionary: return fillDictionary(object, *value.heldDictionary());
+        }
+        return true;
+    }
+
+    bool fillArray(std::size_t object, unsigned kind, const Array& array)
+    {
+        appendMarker(_objects[object].bytes, kind, array.size());
+        return inside(&array, [&] {
+            return std::ranges::all_of(array, [&](const Value& element) { return refer(object, element); });
+        });
+    }
+
+    bool fillDictionary(std::size_t object, const Dictionary& dictionary)
+    {
+        appendMarker(_objects[object].bytes, 0xD, dictionary.size());
+        std::vector<std::size_t> keys;
+        const bool isGood = inside(&dictionary, [&] {
+            return std::ranges::all_of(dictionary, [&](const Dictionary::Entry& entry) {
+                keys.push_back(addText(entry.key));
+                return refer(object, entry.value);
+            });
+        });
+        auto& references = _objects[object].references;
+        references.insert(references.begin(), keys.begin(), keys.end());
+        return isGood;
+    }
+
+    bool refer(std::size_t container, const Value& element)
+    {
+        const auto object = add(element);
+        if (object)
+            _objects[container].references.push_back(*object);
+        return object.has_value();
+    }
+
+    // False when the container holds itself.
+    template <typename Step>
+    bool inside(const void* container, Step step)
+    {
+        if (std::ranges::find(_open, container) != _open.end())
+            return false;
+        _open.push_back(container);
+        const bool isGood = step();
+        _open.pop_back();
+        return isGood;
+    }
+
+    std::vector<Object> _objects;
+    std::unordered_map<std::string, std::size_t> _texts;
+    std::vector<const void*> _open;
+};
+} // namespace
+
+std::optional<Bytes> propertyListBinary(const Value& value)
+{
+    Writer writer;
+    return writer.add(value) ? std::optional(writer.list()) : std::nullopt;
 }
 
 } // namespace orvex

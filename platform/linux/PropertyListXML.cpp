@@ -1,145 +1,261 @@
-// Writing property lists, the second half of PropertyList.h.
+// Writing XML property lists.
 
 #include "PropertyList.h"
 
-#include "DecimalPoint.h"
-#include "PropertyListEpoch.h"
-#include "PropertyListNode.h"
 #include "XMLText.h"
 
 #include "Array.h"
 #include "Dictionary.h"
 
-#include <plist/plist.h>
-
+#include <algorithm>
+#include <array>
+#include <charconv>
 #include <cmath>
-#include <limits>
+#include <span>
+#include <utility>
+#include <vector>
 
 namespace orvex {
 
 namespace {
-// Makes libplist's tree of a value. Values may share containers, even hold themselves: depth and number of
-// nodes are counted as they are written.
+constexpr std::size_t kPiece = std::size_t{64} << 10; // what the sink gets at a time, at least
+
+// The dictionary itself, unless keys of it are the same in XML: of those the first has the value of the last.
+DictionaryRef withKeysOfXML(const DictionaryRef& dictionary)
+{
+    const auto isSame = [](const Dictionary::Entry& entry) { return xmlText(entry.key) == entry.key; };
+    if (std::all_of(dictionary->begin(), dictionary->end(), isSame))
+        return dictionary;
+    auto result = Dictionary::make();
+    for (const auto& [key, value] : *dictionary)
+        result->set(xmlText(key), value);
+    return result;
+}
+
+std::string dateOf(Date date)
+{
+    std::string text = dateText(date); // 2024-03-05 14:07:09 +0000
+    text[text.find(' ')] = 'T';
+    text.replace(text.find(' '), std::string::npos, "Z");
+    return text;
+}
+
+// Goes through the value without recursion: a list may be nested to any depth.
 class Writer {
 public:
-    explicit Writer(const PropertyListLimits& limits)
-        : _limits(limits)
+    explicit Writer(const TextSink& sink)
+        : _sink(sink)
     {
     }
 
-    // Null when the value has no form or exceeds the limits. Depth is the number of containers around it.
-    PropertyListNode nodeOf(const Value& value, std::size_t depth)
+    std::string run(const Value& root)
     {
-        if (!count(0))
-            return nullptr;
-        switch (value.kind()) {
-        case Value::Kind::null: return nullptr;
-        case Value::Kind::string: return textNode(*value.string());
-        case Value::Kind::integer:
-            // Without sign by name only: the text has one.
-            return own(plist_new_uint(static_cast<std::uint64_t>(*value.integer())));
-        case Value::Kind::real: return own(plist_new_real(*value.real()));
-        case Value::Kind::boolean: return own(plist_new_bool(*value.boolean() ? 1 : 0));
-        case Value::Kind::date: return dateNode(*value.date());
-        case Value::Kind::data: return dataNode(*value.data());
-        case Value::Kind::uid: return uidNode(*value.uid());
-        case Value::Kind::set:
-            return depth < _limits.maximumDepth ? arrayNode(*value.set()->elements, depth) : nullptr;
-        case Value::Kind::array:
-            return depth < _limits.maximumDepth ? arrayNode(*value.array(), depth) : nullptr;
-        case Value::Kind::dictionary:
-            return depth < _limits.maximumDepth ? dictionaryNode(*value.dictionary(), depth) : nullptr;
-        }
-        return nullptr;
+        put("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<plist version=\"1.0\">\n");
+        write(root);
+        while (!_open.empty() && _fault.empty())
+            writeNext();
+        if (_fault.empty())
+            put("</plist>\n");
+        flush();
+        return _fault;
     }
 
 private:
-    static PropertyListNode own(plist_t node) { return PropertyListNode(node); }
+    // A container whose elements are being written.
+    struct Open {
+        const void* identity;    // of the container in the value
+        const Array* array;      // or
+        DictionaryRef entries;   // this
+        std::size_t written = 0; // elements, the one that is being written included
 
-    bool count(std::size_t bytes)
-    {
-        _bytes += bytes;
-        return ++_nodes <= _limits.maximumNodes && _bytes <= _limits.maximumBytes;
-    }
-
-    PropertyListNode textNode(const std::string& text)
-    {
-        _bytes += text.size();
-        return _bytes <= _limits.maximumBytes ? own(plist_new_string(xmlText(text).c_str())) : nullptr;
-    }
-
-    PropertyListNode dataNode(const Bytes& data)
-    {
-        _bytes += data.size();
-        if (_bytes > _limits.maximumBytes)
-            return nullptr;
-        return own(plist_new_data(reinterpret_cast<const char*>(data.data()), data.size()));
-    }
-
-    // Whole seconds, as the XML form has no others. libplist counts them in 32 bits: 1932 to 2069.
-    static PropertyListNode dateNode(Date date)
-    {
-        const double seconds = std::floor(date.secondsSince1970 - kPropertyListEpoch);
-        using Range = std::numeric_limits<std::int32_t>;
-        if (!(seconds >= Range::min() && seconds <= Range::max()))
-            return nullptr;
-        return own(plist_new_date(static_cast<std::int32_t>(seconds), 0));
-    }
-
-    // XML has no UIDs; this is what others write for one.
-    static PropertyListNode uidNode(UID uid)
-    {
-        auto node = own(plist_new_dict());
-        plist_dict_set_item(node.get(), "CF$UID", plist_new_uint(uid.number));
-        return node;
-    }
-
-    PropertyListNode arrayNode(const Array& array, std::size_t depth)
-    {
-        auto node = own(plist_new_array());
-        for (const Value& element : array) {
-            auto item = nodeOf(element, depth + 1);
-            if (!item)
-                return nullptr;
-            plist_array_append_item(node.get(), item.release());
+        std::size_t size() const { return entries ? entries->size() : array->size(); }
+        const Dictionary::Entry& entry(std::size_t i) const
+        {
+            return entries->begin()[static_cast<std::ptrdiff_t>(i)];
         }
-        return node;
-    }
+    };
 
-    PropertyListNode dictionaryNode(const Dictionary& dictionary, std::size_t depth)
+    void writeNext()
     {
-        auto node = own(plist_new_dict());
-        for (const Dictionary::Entry& entry : dictionary) {
-            if (!count(entry.key.size()))
-                return nullptr;
-            auto item = nodeOf(entry.value, depth + 1);
-            if (!item)
-                return nullptr;
-            plist_dict_set_item(node.get(), xmlText(entry.key).c_str(), item.release());
+        Open& container = _open.back();
+        if (container.written == container.size()) {
+            const char* end = container.entries ? "</dict>\n" : "</array>\n";
+            _open.pop_back();
+            indent();
+            put(end);
+            return;
         }
-        return node;
+        const std::size_t i = container.written++;
+        if (!container.entries)
+            return write((*container.array)[i]);
+        const Dictionary::Entry& entry = container.entry(i);
+        putElement("key", entry.key);
+        write(entry.value);
     }
 
-    const PropertyListLimits& _limits;
-    std::size_t _nodes = 0;
-    std::size_t _bytes = 0;
+    void write(const Value& value)
+    {
+        switch (value.kind()) {
+        case Value::Kind::null: return fail("is null");
+        case Value::Kind::string: return putElement("string", *value.string());
+        case Value::Kind::integer: return putElement("integer", std::to_string(*value.integer()));
+        case Value::Kind::real: return putReal(*value.real());
+        case Value::Kind::boolean: return putLine(*value.boolean() ? "<true/>\n" : "<false/>\n");
+        case Value::Kind::date: return putDate(*value.date());
+        case Value::Kind::data: return putData(*value.data());
+        case Value::Kind::array: return open(value.heldArray(), value.heldArray(), nullptr);
+        case Value::Kind::dictionary:
+            return open(value.heldDictionary(), nullptr, withKeysOfXML(value.dictionary()));
+        case Value::Kind::uid: return putUID(*value.uid());
+        case Value::Kind::set: return open(value.set()->elements.get(), value.set()->elements.get(), nullptr);
+        }
+    }
+
+    void open(const void* identity, const Array* array, DictionaryRef entries)
+    {
+        if (std::ranges::find(_open, identity, &Open::identity) != _open.end())
+            return fail("holds itself");
+        Open container{identity, array, std::move(entries)};
+        const bool isDictionary = container.entries != nullptr;
+        if (container.size() == 0)
+            return putLine(isDictionary ? "<dict/>\n" : "<array/>\n");
+        putLine(isDictionary ? "<dict>\n" : "<array>\n");
+        _open.push_back(std::move(container));
+    }
+
+    void putReal(double number)
+    {
+        if (number == 0)
+            return putElement("real", "0.0");
+        if (!std::isfinite(number)) {
+            const char* infinity = number > 0 ? "+infinity" : "-infinity";
+            return putElement("real", std::isnan(number) ? "nan" : infinity);
+        }
+        constexpr int kEnough = 17; // digits that tell any two apart
+        std::array<char, 32> digits;
+        const auto end =
+            std::to_chars(digits.begin(), digits.end(), number, std::chars_format::general, kEnough).ptr;
+        putElement("real", {digits.begin(), end});
+    }
+
+    void putDate(Date date)
+    {
+        constexpr double kFirst = -62'135'596'800; // 0001-01-01
+        constexpr double kEnd = 253'402'300'800;   // 10000-01-01
+        if (!(date.secondsSince1970 >= kFirst && date.secondsSince1970 < kEnd))
+            return fail("is a date outside of the years 1 to 9999");
+        putElement("date", dateOf(date));
+    }
+
+    // Beyond the largest integer it is read as a real, so it is written as one.
+    void putUID(UID uid)
+    {
+        const bool isInteger = std::in_range<std::int64_t>(uid.number);
+        const Value number = isInteger ? Value(uid.number) : Value(static_cast<double>(uid.number));
+        open(&uid, nullptr, Dictionary::make({{"CF$UID", number}}));
+    }
+
+    void putData(const Bytes& data)
+    {
+        static constexpr std::size_t kMostTabs = 8;
+        static constexpr std::size_t kWidth = 76; // with a tab as wide as eight characters
+        const std::size_t tabs = std::min(_open.size(), kMostTabs);
+        const std::size_t bytesALine = (kWidth - tabs * 8) / 4 * 3;
+        putLine("<data>\n");
+        for (std::span<const std::uint8_t> rest(data); !rest.empty();) {
+            const auto line = rest.first(std::min(bytesALine, rest.size()));
+            rest = rest.subspan(line.size());
+            _buffer.append(tabs, '\t');
+            appendBase64(line);
+            put("\n");
+        }
+        putLine("</data>\n");
+    }
+
+    void appendBase64(std::span<const std::uint8_t> bytes)
+    {
+        static constexpr char kDigits[] = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
+        for (std::size_t i = 0; i < bytes.size(); i += 3) {
+            const std::size_t count = std::min<std::size_t>(3, bytes.size() - i);
+            std::uint32_t group = 0;
+            for (std::size_t j = 0; j < 3; ++j)
+                group = group << 8 | (j < count ? bytes[i + j] : 0U);
+            for (std::size_t j = 0; j < 4; ++j)
+                _buffer += j <= count ? kDigits[group >> (18 - 6 * j) & 0x3F] : '=';
+        }
+    }
+
+    void putElement(std::string_view name, std::string_view content)
+    {
+        indent();
+        (_buffer += '<') += name;
+        _buffer += '>';
+        const std::string text = xmlText(content);
+        for (std::string_view rest = text; !rest.empty();) {
+            const std::size_t plain = std::min(rest.find_first_of("&<>"), rest.size());
+            put(rest.substr(0, plain));
+            rest.remove_prefix(plain);
+            if (rest.empty())
+                break;
+            put(rest.front() == '&' ? "&amp;" : rest.front() == '<' ? "&lt;" : "&gt;");
+            rest.remove_prefix(1);
+        }
+        (_buffer += "</") += name;
+        put(">\n");
+    }
+
+    void indent() { _buffer.append(_open.size(), '\t'); }
+    void putLine(std::string_view line)
+    {
+        indent();
+        put(line);
+    }
+    void put(std::string_view text)
+    {
+        if (_buffer.size() + text.size() >= kPiece)
+            flush();
+        if (text.size() >= kPiece)
+            _sink(text);
+        else
+            _buffer += text;
+    }
+    void flush()
+    {
+        _sink(_buffer);
+        _buffer.clear();
+    }
+
+    void fail(const char* what)
+    {
+        std::string path;
+        for (const Open& container : _open) {
+            const std::size_t i = container.written - 1;
+            path += '/';
+            path += container.entries ? container.entry(i).key : std::to_string(i);
+        }
+        const auto isControl = [](unsigned char character) { return character < 0x20 || character == 0x7F; };
+        std::ranges::replace_if(path, isControl, '?'); // one line, whatever the keys hold
+        _fault = "the value at " + (path.empty() ? "/" : path) + ' ' + what;
+    }
+
+    const TextSink& _sink;
+    std::string _buffer;
+    std::vector<Open> _open;
+    std::string _fault;
 };
 } // namespace
 
-std::optional<Bytes> propertyListXML(const Value& value, const PropertyListLimits& limits)
+std::string writePropertyListXML(const Value& value, const TextSink& sink)
 {
-    const DecimalPoint decimalPoint;
-    const PropertyListNode root = Writer(limits).nodeOf(value, 0);
-    if (!root)
-        return std::nullopt;
-    char* xml = nullptr;
-    std::uint32_t length = 0;
-    plist_to_xml(root.get(), &xml, &length);
-    std::optional<Bytes> result;
-    if (xml && length <= limits.maximumBytes)
-        result.emplace(xml, xml + length);
-    plist_to_xml_free(xml);
-    return result;
+    return Writer(sink).run(value);
+}
+
+std::optional<Bytes> propertyListXML(const Value& value)
+{
+    Bytes xml;
+    const std::string fault = writePropertyListXML(
+        value, [&xml](std::string_view piece) { xml.insert(xml.end(), piece.begin(), piece.end()); });
+    return fault.empty() ? std::optional(std::move(xml)) : std::nullopt;
 }
 
 } // namespace orvex

@@ -41,7 +41,7 @@ TEST_F(SnapshotTest, IsReadAsItWasWritten)
     EXPECT_EQ(path, directory + "/OrvexSnapshot-1709647629.orvex");
     const Snapshot written = someSnapshot();
     std::ofstream(path) << std::string(100'000, 'x'); // a longer one, which it takes the place of
-    ASSERT_TRUE(writeSnapshot(written, path));
+    ASSERT_EQ(writeSnapshot(written, path), "");
     const auto [read, error] = readSnapshot(path);
     ASSERT_TRUE(read) << error;
     EXPECT_EQ(read->timestamp, written.timestamp);
@@ -52,6 +52,23 @@ TEST_F(SnapshotTest, IsReadAsItWasWritten)
     const std::string reason = readSnapshot(path).error;
     EXPECT_TRUE(reason.starts_with(path + ": not a snapshot: ")) << reason;
     EXPECT_EQ(reason.find('\n'), std::string::npos);
+}
+
+// A session takes property lists of 64 MiB, nested in 256 containers, and raw messages without end.
+TEST_F(SnapshotTest, LargeAndDeepOnesAreReadAsTheyWereWritten)
+{
+    Value deepest = UID{7};
+    for (int i = 0; i < 256; ++i)
+        deepest = Array::make({deepest});
+    Snapshot written = someSnapshot();
+    written.data->append(Dictionary::make({{"DisplayState", deepest}}));
+    written.description.resize(std::size_t{65} << 20, 'x');
+    const std::string path = directory + "/large.orvex";
+    ASSERT_EQ(writeSnapshot(written, path), "");
+    const auto [read, error] = readSnapshot(path);
+    ASSERT_TRUE(read) << error;
+    EXPECT_EQ(read->data->size(), 2U);
+    EXPECT_TRUE(read->description == written.description);
 }
 
 TEST_F(SnapshotTest, SaysWhyAFileIsNone)
@@ -78,10 +95,13 @@ TEST_F(SnapshotTest, TellsWhenItCouldNotBeWritten)
 {
     Snapshot unwritable = someSnapshot();
     unwritable.data->append(Dictionary::make({{"Display", Value()}}));
-    EXPECT_FALSE(writeSnapshot(unwritable, directory + "/null.orvex"));
-    EXPECT_FALSE(std::filesystem::exists(directory + "/null.orvex"));
-    EXPECT_FALSE(writeSnapshot(someSnapshot(), directory + "/gone/x.orvex"));
-    EXPECT_FALSE(writeSnapshot(someSnapshot(), "/dev/full"));
+    std::ofstream(directory + "/old.orvex") << "kept";
+    EXPECT_EQ(writeSnapshot(unwritable, directory + "/old.orvex"),
+        directory + "/old.orvex: the value at /Data/1/Display is null");
+    EXPECT_EQ(std::filesystem::file_size(directory + "/old.orvex"), 4U);
+    EXPECT_EQ(writeSnapshot(someSnapshot(), directory + "/gone/x.orvex"),
+        directory + "/gone/x.orvex: No such file or directory");
+    EXPECT_EQ(writeSnapshot(someSnapshot(), "/dev/full"), "/dev/full: No space left on device");
 }
 
 TEST_F(SnapshotTest, AWriterKilledInTheMiddleLeavesAFileThatTheReaderCopesWith)
@@ -107,7 +127,7 @@ TEST_F(SnapshotTest, AWriterKilledInTheMiddleLeavesAFileThatTheReaderCopesWith)
             EXPECT_EQ(error.find('\n'), std::string::npos);
         }
     }
-    EXPECT_TRUE(writeSnapshot(large, path)) << "the next one takes its place";
+    EXPECT_EQ(writeSnapshot(large, path), "") << "the next one takes its place";
     EXPECT_TRUE(readSnapshot(path).snapshot);
 }
 

@@ -104,7 +104,19 @@ TEST(PropertyList, WritesEachKindAsXML)
         {true, "<true/>"},
         {Date{1794808471.9}, "<date>2026-11-16T05:54:31Z</date>"},
         {Date{-1.5}, "<date>1969-12-31T23:59:58Z</date>"},
+        {Date{-62'135'596'800}, "<date>0001-01-01T00:00:00Z</date>"},
+        {Date{253'402'300'799.5}, "<date>9999-12-31T23:59:59Z</date>"},
+        {1e-5, "<real>1.0000000000000001e-05</real>"},
+        {-0.0, "<real>0.0</real>"},
+        {-std::numeric_limits<double>::infinity(), "<real>-infinity</real>"},
+        {std::nan(""), "<real>nan</real>"},
+        {Dictionary::make({{"a\x02", 1}, {"b", 2}, {"a\x03", 3}}),
+            "<dict>\n\t<key>a\uFFFD</key>\n\t<integer>3</integer>\n\t<key>b</key>"},
         {Dictionary::make({{"k\x02", Array::make()}}), "<key>k\uFFFD</key>\n\t<array/>"},
+        {Array::make({data(Bytes(52, 0)), data({})}),
+            "\t<data>\n\tAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAA\n\tAA==\n\t</"
+            "data>\n"
+            "\t<data>\n\t</data>\n"},
         {data({0, 1, 255, 126}), "AAH/fg=="},
         {UID{7}, "<dict>\n\t<key>CF$UID</key>\n\t<integer>7</integer>\n</dict>"},
         {Set{Array::make({"a"})}, "<array>\n\t<string>a</string>\n</array>"},
@@ -121,39 +133,67 @@ TEST(PropertyList, WritesEachKindAsXML)
 
 TEST(PropertyList, WritesBinaryListsThatAreReadAsTheyWere)
 {
-    const auto list = Dictionary::make({{"z", Array::make({"a<b>&", "\u00e4", "", Array::make()})},
-        {"a", Array::make({kLowest, -1, 255, kHighest, -0.25, true, Date{1794808471}, data({0, 255})})}});
+    const auto list = Dictionary::make({{"z", Array::make({"a<b>&", "\uFEFF\u00e4", "", Array::make()})},
+        {"a",
+            Array::make({kLowest, -1, 255, 70'000, kHighest, -0.25, true, Date{1794808471.5}, data({0, 255}),
+                Set{Array::make({false})}, UID{300}, std::string(300, 'x'), Date{1e300}})}});
     const Bytes binary = propertyListBinary(list).value();
-    EXPECT_TRUE(std::string(binary.begin(), binary.end()).starts_with("bplist00"));
     const auto read = propertyListFromData(binary);
     EXPECT_TRUE(read.value == Value(list)) << read.error;
     EXPECT_EQ(read.value->dictionary()->begin()->key, "z");
     EXPECT_FALSE(propertyListBinary(Array::make({Value()})));
+    Bytes longText{0x5F, 0x11, 0x01, 0x2C};
+    longText.resize(4 + 300, 'x');
+    EXPECT_EQ(propertyListBinary(
+                  Dictionary::make({{"b", Array::make({"b", UID{7}, true, std::string(300, 'x')})}})),
+        binaryList({{0xD1, 1, 2}, {0x51, 'b'}, {0xA4, 1, 3, 4, 5}, {0x80, 7}, {0x09}, longText}))
+        << "equal texts are one object";
 }
 
-TEST(PropertyList, RefusesToWriteWhatHasNoFormOrIsTooLarge)
+TEST(PropertyList, NamesTheValueThatHasNoXMLForm)
+{
+    const auto holder = Dictionary::make();
+    const auto inSet = Array::make();
+    holder->set("a", Array::make({1, Set{Array::make({inSet})}}));
+    inSet->append(holder);
+    const char* date = "is a date outside of the years 1 to 9999";
+    const struct {
+        Value value;
+        std::string fault;
+    } cases[] = {
+        {Value(), "the value at / is null"},
+        {Array::make({1, Dictionary::make({{"a\n", Value()}})}), "the value at /1/a? is null"},
+        {holder, "the value at /a/1/0/0 holds itself"},
+        {Array::make({Date{253'402'300'800}}), std::string("the value at /0 ") + date},
+        {Array::make({Date{-62'135'596'801}}), std::string("the value at /0 ") + date},
+        {Array::make({Date{std::nan("")}}), std::string("the value at /0 ") + date},
+    };
+    for (const auto& [value, fault] : cases) {
+        EXPECT_EQ(writePropertyListXML(value, [](std::string_view) {}), fault);
+        EXPECT_FALSE(propertyListXML(value)) << fault;
+    }
+    EXPECT_FALSE(propertyListBinary(holder));
+    inSet->removeAll(); // so that it goes
+}
+
+TEST(PropertyList, WritesWithoutBounds)
 {
     Value deepest = Array::make();
-    for (int i = 1; i < 256; ++i)
+    for (int i = 1; i < 1000; ++i)
         deepest = Array::make({deepest});
-    Value doubling = Array::make();
-    for (int i = 0; i < 60; ++i)
-        doubling = Array::make({doubling, doubling});
     const auto megabyte = std::make_shared<Bytes>(1 << 20);
-    const auto gigabyte = Array::make();
-    for (int i = 0; i < 1024; ++i)
-        gigabyte->append(megabyte);
-    const std::pair<const char*, Value> cases[] = {
-        {"null inside", Array::make({1, Dictionary::make({{"a", Value()}})})},
-        {"too deep", Array::make({deepest})},
-        {"doubles sixty times", doubling},
-        {"one buffer a thousand times", gigabyte},
-        {"date too far", Date{5e9}},
-        {"no date", Date{std::nan("")}},
-    };
-    for (const auto& [name, value] : cases)
-        EXPECT_FALSE(propertyListXML(value)) << name;
-    EXPECT_EQ(propertyListFromData(propertyListXML(deepest).value()).error, "");
+    const auto list = Array::make({deepest});
+    for (int i = 0; i < 64; ++i)
+        list->append(megabyte);
+    std::size_t size = 0;
+    std::size_t largestPiece = 0;
+    const std::string fault = writePropertyListXML(list, [&](std::string_view piece) {
+        size += piece.size();
+        largestPiece = std::max(largestPiece, piece.size());
+    });
+    EXPECT_EQ(fault, "");
+    EXPECT_GT(size, (std::size_t{64} << 20) / 3 * 4);
+    EXPECT_LT(largestPiece, std::size_t{1} << 20);
 }
 
 // Searching directly would take minutes.

@@ -27,8 +27,12 @@ std::size_t feed(OfflineSession& session, const Value& kept)
         return messages.rest();
     }
     // A technology whose messages are property lists keeps the last one as what it says.
-    if (const auto message = propertyListXML(kept))
-        session.take(*message);
+    const auto message = propertyListXML(kept);
+    if (!message)
+        return 0;
+    if (message->size() > PropertyListLimits().maximumBytes) // no session takes it
+        return message->size();
+    session.take(*message);
     return 0;
 }
 

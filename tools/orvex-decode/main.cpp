@@ -133,8 +133,8 @@ bool hasTemplate(const LogGenerator& generator)
 bool save(const OfflineSession& session, Date begun, const DecodeOptions& options)
 {
     const Snapshot snapshot{dateText(begun), session.saveContents(), options.description};
-    return writeSnapshot(snapshot, *options.snapshotFile)
-        || complain(*options.snapshotFile + ": the snapshot could not be written");
+    const std::string fault = writeSnapshot(snapshot, *options.snapshotFile);
+    return fault.empty() || complain(fault);
 }
 
 int decodeCaptures(const DecodeOptions& options)

@@ -3,6 +3,8 @@
 #include "scenarios/ScenarioTable.h"
 
 #include "DecodeProgram.h"
+#include "PacketText.h"
+#include "PropertyListForms.h"
 
 #include <nlohmann/json.hpp>
 
@@ -72,6 +74,22 @@ TEST_F(SnapshotDecodeTest, SaysInOneLineWhyASnapshotCannotBeRead)
     EXPECT_EQ(result.output, "");
     EXPECT_THAT(result.errors, testing::StartsWith("orvex-decode: " + path("broken.orvex") + ": "));
     EXPECT_EQ(std::count(result.errors.begin(), result.errors.end(), '\n'), 1) << result.errors;
+}
+
+TEST_F(SnapshotDecodeTest, NamesTheValueThatCannotBeSaved)
+{
+    Bytes key{0x5E}; // 14 characters
+    const Bytes name14 = bytesOf("kSimFile_ICCID");
+    key.insert(key.end(), name14.begin(), name14.end());
+    const Bytes files = binaryList({{0xD1, 1, 2}, key, {0x33, 0x7F, 0xF0, 0, 0, 0, 0, 0, 0}});
+    Bytes message = packetHeader(0xFF0000);
+    message.insert(message.end(), files.begin(), files.end());
+    const Result result = decode({"--technology", "MRL_LTE", "--resources", ORVEX_RESOURCES, "--snapshot",
+        name("saved.orvex"), write("sim.pcap", PcapFile().add(message).bytes())});
+    EXPECT_EQ(result.status, 1);
+    EXPECT_EQ(result.errors,
+        "orvex-decode: " + path("saved.orvex")
+            + ": the value at /Data/0/Display/SIM Info/EF-ICCID is a date outside of the years 1 to 9999\n");
 }
 
 } // namespace
