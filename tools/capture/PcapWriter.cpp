@@ -8,12 +8,6 @@
 
 namespace orvex {
 
-namespace {
-// Readers refuse a file with a longer packet. What a message has beyond it is left out, and its true length
-// says so.
-constexpr std::size_t kLongestPacket = 262'144;
-} // namespace
-
 struct PcapWriter::Dump {
     explicit Dump(std::FILE* file)
         : handle(pcap_open_dead(DLT_USER0, kLongestPacket))

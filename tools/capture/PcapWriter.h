@@ -12,6 +12,10 @@ namespace orvex {
 // After the first failure nothing more is written.
 class PcapWriter {
 public:
+    // Readers refuse a file with a longer packet. Of a longer message the beginning is written, and its true
+    // length; readers leave it out.
+    static constexpr std::size_t kLongestPacket = 262'144;
+
     // An existing file is overwritten.
     explicit PcapWriter(const std::string& path);
     ~PcapWriter();

@@ -84,6 +84,8 @@ void KoratService::reportSent() const
 {
     const std::uint64_t sent = _sentBefore + (_channel ? _channel->sent() : 0);
     report("sent %zu messages", sent);
+    if (_recorder)
+        _recorder->reportCut();
     if (const std::size_t pending = _channel ? _channel->pendingBytes() : 0; pending > 0)
         report("the client has not taken the last %zu bytes", pending);
 }

@@ -23,8 +23,17 @@ void Recorder::write(ByteView message, Microseconds time)
 {
     if (!_file)
         return;
+    if (message.size() > PcapWriter::kLongestPacket && ++_cut == 1)
+        report("a message of %zu bytes is too long for the recording, which has the first %zu",
+            message.size(), PcapWriter::kLongestPacket);
     _file->write(message, time);
     stopAfterError();
+}
+
+void Recorder::reportCut() const
+{
+    if (_cut > 0)
+        report("recorded only the beginning of %zu messages; a replay leaves them out", _cut);
 }
 
 void Recorder::flush()
