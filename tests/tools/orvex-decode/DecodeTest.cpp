@@ -135,7 +135,7 @@ TEST_F(DecodeTest, WritesNoFileThatItReadsOrWritesAlready)
     fs::create_symlink("new", path("dangling"));
     fs::create_directory(path("folder"));
     fs::create_symlink("folder/../dangling", path("further"));
-    write("T.plist", Bytes());
+    fs::copy_file(ORVEX_RESOURCES "/LTE.plist", path("LTE.plist"));
     const struct {
         QStringList arguments;
         const char* conflict; // empty: none
@@ -148,7 +148,7 @@ TEST_F(DecodeTest, WritesNoFileThatItReadsOrWritesAlready)
         {{"--output", name("new"), "--log", name("further")}, "--log %1/further and --output %1/new"},
         {{"--log", name("dangling"), "--snapshot", name("further")},
             "--snapshot %1/further and --log %1/dangling"},
-        {{"--output", name("T.plist")}, "--output %1/T.plist and the template T.plist"},
+        {{"--output", name("LTE.plist")}, "--output %1/LTE.plist and the template LTE.plist"},
         {{"--output", "/dev/null", "--log", "/dev/null"}, ""},
     };
     const QString folder = name(".").chopped(2);
