@@ -77,6 +77,7 @@ Value GSMLogGenerator::processObject(const Value& object)
     }
     if (const auto array = object.array()) {
         auto result = Array::make();
+        result->reserve(array->size());
         for (std::size_t i = 1; i < array->size(); ++i) // from the second element on, deliberately
             result->append(collapsed(processObject((*array)[i])));
         return result;

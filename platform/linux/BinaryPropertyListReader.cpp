@@ -25,6 +25,14 @@ constexpr std::string_view kHeader = "bplist00";
 constexpr std::size_t kTrailerSize = 32;
 constexpr std::uint8_t kSizeFollows = 0xF; // in the low half of a marker: an integer object with the size
 
+// What a list may take in memory: so much for each of its bytes, whatever it shares, and some for small
+// lists, which may share nearly everything. A report is held some five times: as it came, as it is shown,
+// twice in the history, as nodes of the display tree.
+constexpr std::size_t kMemoryForEachByte = 24;
+constexpr std::size_t kMemoryOfAnyList = 256 << 10;
+constexpr std::size_t kMemoryOfValue = 48;
+constexpr std::size_t kMemoryOfContainer = 80;
+
 enum Kind : std::uint8_t {
     kSimple = 0x0,
     kInteger = 0x1,
@@ -62,7 +70,11 @@ public:
             throw Fault("the offset table lies outside");
     }
 
-    Value run() { return valueOf(_root, 0); }
+    Value run()
+    {
+        count(_root, 0);
+        return valueOf(_root);
+    }
 
 private:
     struct Object {
@@ -71,10 +83,45 @@ private:
         std::size_t content = 0;
     };
 
-    // Recursive: the depth, which is the number of containers around the object, has its limit.
-    Value valueOf(std::uint64_t reference, std::size_t depth)
+    // What the object becomes, before memory is spent on it. Recursive: the depth, which is the number of
+    // containers around the object, has its limit.
+    void count(std::uint64_t reference, std::size_t depth)
     {
         _count.addNode();
+        if (++_values > _list.size())
+            throw Fault("shared containers make more values than the list has bytes");
+        const Object object = objectAt(reference);
+        std::size_t memory = kMemoryOfValue;
+        switch (object.kind) {
+        case kData:
+        case kASCII:
+        case kUTF16: {
+            const std::size_t bytes = bytesOf(object).size();
+            _count.addBytes(bytes);
+            memory += bytes;
+            break;
+        }
+        case kArray:
+        case kSet:
+        case kDictionary: {
+            _count.enterContainer(depth);
+            const std::size_t referencesEach = object.kind == kDictionary ? 2 : 1;
+            requireBytes(object.content, object.size, referencesEach * _referenceSize);
+            for (std::uint64_t i = 0; i < referencesEach * object.size; ++i)
+                count(referenceAt(object, i), depth + 1);
+            memory += kMemoryOfContainer;
+            break;
+        }
+        default: break;
+        }
+        _memory += memory;
+        if (_memory > kMemoryOfAnyList + kMemoryForEachByte * _list.size())
+            throw Fault("shared objects make more of the list than it has room for");
+    }
+
+    // The caller has counted what the object becomes.
+    Value valueOf(std::uint64_t reference)
+    {
         const Object object = objectAt(reference);
         switch (object.kind) {
         case kSimple: return flagOf(object);
@@ -88,31 +135,28 @@ private:
             require(object.size < 8);
             requireBytes(object.content, 1, object.size + 1);
             return UID{number(object.content, object.size + 1)};
-        case kArray: return arrayOf(object, depth);
-        case kSet: return Set{arrayOf(object, depth)};
-        case kDictionary: return dictionaryOf(object, depth);
+        case kArray: return arrayOf(object);
+        case kSet: return Set{arrayOf(object)};
+        case kDictionary: return dictionaryOf(object);
         default: throw Fault("an object of unknown kind");
         }
     }
 
-    ArrayRef arrayOf(const Object& object, std::size_t depth)
+    ArrayRef arrayOf(const Object& object)
     {
-        _count.enterContainer(depth);
-        requireBytes(object.content, object.size, _referenceSize);
         auto array = Array::make();
+        array->reserve(object.size);
         for (std::uint64_t i = 0; i < object.size; ++i)
-            array->append(valueOf(referenceAt(object, i), depth + 1));
+            array->append(valueOf(referenceAt(object, i)));
         return array;
     }
 
-    DictionaryRef dictionaryOf(const Object& object, std::size_t depth)
+    DictionaryRef dictionaryOf(const Object& object)
     {
-        _count.enterContainer(depth);
-        requireBytes(object.content, object.size, 2 * _referenceSize);
         auto dictionary = Dictionary::make();
         for (std::uint64_t i = 0; i < object.size; ++i) {
-            const Value key = valueOf(referenceAt(object, i), depth + 1);
-            Value value = valueOf(referenceAt(object, object.size + i), depth + 1);
+            const Value key = valueOf(referenceAt(object, i));
+            Value value = valueOf(referenceAt(object, object.size + i));
             if (const std::string* name = key.string())
                 dictionary->set(*name, std::move(value));
             else
@@ -162,16 +206,16 @@ private:
 
     BytesRef dataOf(const Object& object)
     {
-        const auto bytes = bytesOf(object, 1);
+        const auto bytes = bytesOf(object);
         return std::make_shared<Bytes>(bytes.begin(), bytes.end());
     }
 
     // A text has no zero in the other form either, and none where it is shown.
     std::string textOf(const Object& object)
     {
-        const bool isWide = object.kind == kUTF16;
-        const auto bytes = bytesOf(object, isWide ? 2 : 1);
-        std::string text = isWide ? textOfUTF16(bytes) : std::string(bytes.begin(), bytes.end());
+        const auto bytes = bytesOf(object);
+        std::string text =
+            object.kind == kUTF16 ? textOfUTF16(bytes) : std::string(bytes.begin(), bytes.end());
         if (text.find('\0') != std::string::npos)
             throw Fault("a zero character in a text");
         return text;
@@ -188,12 +232,12 @@ private:
         return text;
     }
 
-    std::span<const std::uint8_t> bytesOf(const Object& object, std::size_t bytesEach)
+    // Of a text or data.
+    std::span<const std::uint8_t> bytesOf(const Object& object) const
     {
+        const std::size_t bytesEach = object.kind == kUTF16 ? 2 : 1;
         requireBytes(object.content, object.size, bytesEach);
-        const std::size_t bytes = object.size * bytesEach;
-        _count.addBytes(bytes);
-        return _list.subspan(object.content, bytes);
+        return _list.subspan(object.content, object.size * bytesEach);
     }
 
     // The caller has made sure that it is there.
@@ -248,6 +292,8 @@ private:
 
     std::span<const std::uint8_t> _list;
     PropertyListCount _count;
+    std::size_t _values = 0;
+    std::size_t _memory = 0;
     std::size_t _offsetSize = 0;
     std::size_t _referenceSize = 0;
     std::uint64_t _objectCount = 0;

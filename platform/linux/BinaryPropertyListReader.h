@@ -9,7 +9,9 @@ namespace orvex {
 
 // Reads a property list in its binary form. Throws PropertyListFault unless every object that the root
 // reaches lies inside the list and the tree keeps the limits. An object may be referred to many times; each
-// becomes a value of its own and counts as one, as the bytes of texts and data do.
+// time it becomes a value of its own and counts as one, as the bytes of texts and data do. Before memory is
+// spent, a list is refused whose values outnumber its bytes, which takes shared containers, or would take far
+// more memory than bytes.
 //
 //    0              "bplist00", of which the last two are the version
 //    8              objects: a marker byte (kind in the high half, size in the low one) and content

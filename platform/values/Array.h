@@ -31,6 +31,8 @@ public:
     Value& appendSlot();
     // Removes the elements from the index on, and sets them aside for appendSlot().
     void setAsideFrom(std::size_t index);
+    // Room for so many elements, made at once.
+    void reserve(std::size_t count) { _elements.reserve(count); }
     void append(Value value) { _elements.push_back(std::move(value)); }
     void appendAll(const Array& other);
     void removeAll() { _elements.clear(); }

@@ -74,15 +74,21 @@ TEST(HostilePropertyList, BinaryIsRefusedWithTheReason)
     shared[1].resize(3 + 255, 2);
     shared[2].resize(4 + 4096, 'x');
 
+    std::vector<Bytes> nested; // in a circle, as references have one byte here
+    for (std::uint8_t next = 1; next != 0; ++next)
+        nested.push_back({0xA1, next});
+    nested.push_back({0xA1, 0});
+
     const struct {
         const char* name;
         Bytes list;
         const char* reason;
     } cases[] = {
         {"another version", bytesOf("bplist15" + std::string(40, '\0')), "unknown version"},
-        {"cycle", binaryList({{0xA1, 0}}), "nested deeper"},
-        {"shared arrays multiply", binaryList(laughs), "more than 2000000 values"},
-        {"shared text multiplies", binaryList(shared), "shared texts"},
+        {"cycle", binaryList({{0xA1, 0}}), "more values than the list has bytes"},
+        {"shared arrays multiply", binaryList(laughs), "more values than the list has bytes"},
+        {"shared text multiplies", binaryList(shared), "more of the list than it has room for"},
+        {"deeper than the limit", binaryList(nested), "nested deeper than 256"},
         {"root not there", binaryList({}), "not there"},
         {"reference not there", binaryList({{0xA1, 9}}), "not there"},
         {"array longer than the list",
