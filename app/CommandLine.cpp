@@ -82,11 +82,8 @@ CommandLine CommandLine::parse(const QStringList& arguments)
                                   .arg(QLatin1String(option), QLatin1String(other)));
     }
     for (const auto& option : {resources, open, size}) {
-        QStringList values = parser.values(option);
-        values.removeDuplicates();
-        if (values.size() > 1)
-            return wrongUsage(
-                QStringLiteral("--%1 is given with different values.").arg(option.names().first()));
+        if (parser.values(option).size() > 1)
+            return wrongUsage(QStringLiteral("--%1 is given more than once.").arg(option.names().first()));
     }
 
     if (parser.isSet(size)) {

@@ -34,6 +34,7 @@ TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
         {"MRL_LTE has no scenario \"sea\"; known are: town", {"--scenario", "sea"}},
         {"--rate", {"--rate", "0"}},
         {"--count", {"--count", "-1"}},
+        {"--count is given more than once", {"--count", "1", "--count", "2"}},
         {"--seed", {"--seed", ""}},
         {"--replay and --scenario exclude each other", {"--replay", "a", "--scenario", "town"}},
         {"--replay and --seed exclude each other", {"--seed", "2", "--replay", "a"}},

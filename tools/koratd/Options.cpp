@@ -117,6 +117,10 @@ std::string conflictOf(const Options& options)
 // The options as they stand; the error is empty when all of them make sense.
 std::string read(const QCommandLineParser& parser, Options& options)
 {
+    for (const char* option : {"technology", "scenario", "replay", "record", "rate", "count", "seed"}) {
+        if (parser.values(option).size() > 1)
+            return std::string("--") + option + " is given more than once";
+    }
     const std::string technology = options.technology = parser.value("technology").toStdString();
     const std::string scenario = parser.value("scenario").toStdString();
     options.scenario = findScenario(technology, scenario);

@@ -73,8 +73,9 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
     const QCommandLineOption dlf = withValue("dlf");
     const QCommandLineOption jobs = withValue("jobs");
     QCommandLineParser parser;
-    parser.addOptions({help, version, technology, format, refreshEvery, resources, output, log, snapshot,
-        description, dlf, jobs});
+    const QList<QCommandLineOption> once{
+        technology, format, refreshEvery, resources, output, log, snapshot, description, dlf, jobs};
+    parser.addOptions(once + QList{help, version});
 
     QStringList list;
     for (int i = 0; i < count; ++i)
@@ -87,6 +88,10 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
     if (parser.isSet(help) || parser.isSet(version)) {
         result.action = parser.isSet(help) ? Action::help : Action::version;
         return result;
+    }
+    for (const QCommandLineOption& option : once) {
+        if (parser.values(option).size() > 1)
+            return wrongUsage(QStringLiteral("--%1 is given more than once.").arg(option.names().first()));
     }
     result.technology = parser.value(technology).toStdString();
     for (const QString& capture : parser.positionalArguments())
@@ -120,6 +125,8 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
     result.dlfFile = valueOf(parser, dlf);
     if (result.snapshotFile && result.areSnapshots)
         return wrongUsage(QStringLiteral("--snapshot saves what captures hold, not another snapshot."));
+    if (parser.isSet(refreshEvery) && result.areSnapshots)
+        return wrongUsage(QStringLiteral("--refresh-every goes with captures."));
     if (parser.isSet(description) && !result.snapshotFile)
         return wrongUsage(QStringLiteral("--description goes with --snapshot."));
     if (result.jobs > 0 && result.areSnapshots)

@@ -200,6 +200,8 @@ TEST_F(DecodeTest, WrongUsageIsAnsweredWithTheRightOne)
         "--technology MRL_LTE --jobs 0 x.pcap",
         "--technology MRL_LTE --jobs 2 x.orvex",
         "--technology MRL_LTE --jobs 2 --snapshot y x.pcap",
+        "--technology MRL_LTE --output y --output z x.pcap",
+        "--refresh-every 5 x.orvex",
     };
     for (const QString arguments : cases) {
         const Result result = decode(arguments.split(' ', Qt::SkipEmptyParts));
