@@ -7,10 +7,15 @@
 #include "FileResources.h"
 #include "NodesByPath.h"
 #include "Snapshot.h"
+#include "SnapshotTree.h"
 #include "SystemLog.h"
 #include "TelephonyConstants.h"
+#include "TreeJson.h"
+
+#include <nlohmann/json.hpp>
 
 #include <map>
+#include <sstream>
 
 namespace orvex::fuzz {
 
@@ -61,6 +66,24 @@ test::FixedResources resourcesOf(const std::string& technology, const Dictionary
     return resources;
 }
 
+void requireJson(const OrvexModelNode& tree)
+{
+    std::ostringstream text;
+    JsonWriter json(text);
+    writeTreeJson(json, tree);
+    require(nlohmann::json::accept(text.str()), "the JSON text of a tree is JSON");
+}
+
+void requireSnapshot(const std::string& path)
+{
+    const auto [snapshot, error] = readSnapshot(path);
+    // A session may be deeper than a list that is read.
+    require(snapshot || error.find("nested deeper") != std::string::npos,
+        "a snapshot that was written can be read");
+    if (snapshot)
+        snapshotTree(*snapshot);
+}
+
 } // namespace
 
 FuzzSession::FuzzSession(const std::string& technology)
@@ -76,20 +99,34 @@ FuzzSession::FuzzSession(const std::string& technology, const DictionaryRef& ske
 
 void FuzzSession::run(InputMessages messages)
 {
-    const bool isAlive = survives([&] {
-        while (const auto message = messages.next())
-            _session.take(*message);
-    });
-    if (isAlive && survives([this] { _session.display(); })) // what builds the display shows none yet
-        survives([this] { finish(); });
+    while (const auto message = messages.next()) {
+        if (!take(*message))
+            return;
+    }
+    if (refresh()) // what builds the display shows none yet
+        finish();
+}
+
+bool FuzzSession::take(ByteView message)
+{
+    return survives([&] { _session.take(message); });
+}
+
+bool FuzzSession::refresh()
+{
+    return survives([this] { _session.display(); });
 }
 
 void FuzzSession::finish()
 {
-    NodesByPath paths;
-    OrvexModelNode::makeTreeFromObject(_session.display(), paths);
-    const MemoryFile file;
-    writeSnapshot({"2024-03-05 14:07:09 +0000", _session.saveContents(), "Fuzz"}, file.path());
+    survives([this] {
+        NodesByPath paths;
+        const auto tree = OrvexModelNode::makeTreeFromObject(_session.display(), paths);
+        requireJson(*tree);
+        const MemoryFile file;
+        if (writeSnapshot({"2024-03-05 14:07:09 +0000", _session.saveContents(), "Fuzz"}, file.path()))
+            requireSnapshot(file.path());
+    });
 }
 
 } // namespace orvex::fuzz

@@ -9,8 +9,8 @@
 
 namespace orvex::fuzz {
 
-// A session as it is lived: messages of any content, a refresh now and then, at the end the tree of the
-// screens and a snapshot. All log lines are made, and dropped.
+// A session as it is lived: messages of any content, a refresh now and then, at the end all that is made of
+// it. All log lines are made, and dropped.
 class FuzzSession {
 public:
     // Over the technology's own template.
@@ -21,9 +21,14 @@ public:
     // Returns at the end, or where the process would have ended by design.
     void run(InputMessages messages);
 
-private:
+    // The steps of a session that is not one run. False where the process would have ended by design: no
+    // other step may follow.
+    bool take(ByteView message);
+    bool refresh();
+    // The tree of the screens, its JSON text, and a snapshot that is written and read again.
     void finish();
 
+private:
     test::FixedClock _clock;
     test::FixedResources _resources;
     OfflineSession _session;

@@ -56,6 +56,7 @@ public:
         }
         const Messages drive = firstMessages(telephony::kTechnologyMRL_LTE, 6);
         writeFrames(drive);
+        writeSessions();
         writeCaptures(drive);
         writePropertyLists();
         writeTemplates();
@@ -151,6 +152,25 @@ private:
         write("Frame", "request",
             InputMessages::inputOf(Messages{encodedFrame({1, FrameKind::request, 7, list}),
                 encodedFrame({1, FrameKind::reply, 7, list})}));
+    }
+
+    // The technology's number and its frames, a refresh after every other one; see SessionTarget.
+    void writeSessions() const
+    {
+        constexpr std::size_t kMessages = 6;
+        for (std::size_t i = 0; i < std::size(kTechnologies); ++i) {
+            const auto& [identifier, target] = kTechnologies[i];
+            const auto scenario = scenarioOf(identifier);
+            Messages pieces;
+            for (std::size_t message = 0; message < kMessages; ++message) {
+                pieces.push_back(encodedFrame({.payload = shortened(scenario->next().message.bytes)}));
+                if (message % 2 != 0)
+                    pieces.emplace_back();
+            }
+            Bytes input = InputMessages::inputOf(pieces);
+            input.insert(input.begin(), static_cast<std::uint8_t>(i));
+            write("Session", target, input);
+        }
     }
 
     void writeCaptures(const Messages& messages) const

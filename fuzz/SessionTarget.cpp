@@ -1,0 +1,46 @@
+// A whole session: the first byte chooses the technology, the messages of the input are the pieces in which a
+// stream of frames arrives on the log channel. An empty piece is a refresh.
+
+#include "FuzzSession.h"
+#include "FuzzTarget.h"
+
+#include "PortFrame.h"
+#include "TelephonyConstants.h"
+
+namespace {
+
+using namespace orvex;
+
+// In the order of the seeds.
+constexpr const char* kTechnologies[] = {telephony::kTechnologyMRL_GSM, telephony::kTechnologyMRL_CDMA,
+    telephony::kTechnologyMRL_LTE, telephony::kTechnologyMRL_UTRAN2, telephony::kTechnologyIFX};
+
+constexpr std::int32_t kLogChannelMessageId = 0;
+
+bool takeAll(FrameReader& reader, fuzz::FuzzSession& session)
+{
+    while (const auto frame = reader.take()) {
+        if (frame->messageId == kLogChannelMessageId && !session.take(frame->payload))
+            return false;
+    }
+    return true;
+}
+
+} // namespace
+
+int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
+{
+    if (size == 0)
+        return 0;
+    fuzz::FuzzSession session(kTechnologies[data[0] % std::size(kTechnologies)]);
+    FrameReader reader;
+    fuzz::InputMessages pieces({data + 1, size - 1});
+    while (const auto piece = pieces.next()) {
+        reader.append(*piece);
+        if (!(piece->empty() ? session.refresh() : takeAll(reader, session)))
+            return 0;
+    }
+    if (session.refresh())
+        session.finish();
+    return 0;
+}
