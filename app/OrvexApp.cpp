@@ -16,9 +16,12 @@ namespace {
 // A handset has it; elsewhere it is made. When that fails, so will the save, and say it.
 std::string reportDirectory()
 {
+    namespace fs = std::filesystem;
     std::string directory = paths::diagnosticReports();
     std::error_code ignored;
-    std::filesystem::create_directories(directory, ignored);
+    fs::create_directories(fs::path(directory).parent_path(), ignored);
+    if (fs::create_directory(directory, ignored))
+        fs::permissions(directory, fs::perms::owner_all, ignored);
     return directory;
 }
 } // namespace

@@ -1,5 +1,6 @@
 #include "Snapshot.h"
 
+#include "OutputFile.h"
 #include "PropertyList.h"
 #include "RegularFile.h"
 #include "TextFormat.h"
@@ -8,7 +9,6 @@
 #include <cerrno>
 #include <cmath>
 #include <cstring>
-#include <fstream>
 
 namespace orvex {
 
@@ -76,10 +76,13 @@ std::string writeSnapshot(const Snapshot& snapshot, const std::string& path)
     });
     if (const std::string fault = writePropertyListXML(list, [](std::string_view) {}); !fault.empty())
         return path + ": " + fault;
-    std::ofstream file(path, std::ios::binary);
-    writePropertyListXML(list, [&file](std::string_view piece) { file << piece; });
-    file.close();
-    return file.fail() ? path + ": " + std::strerror(errno) : std::string(); // NOLINT(concurrency-mt-unsafe)
+    const auto [file, error] = openOutputFile(path);
+    if (!file)
+        return path + ": " + error;
+    writePropertyListXML(
+        list, [&file = *file](std::string_view piece) { std::fwrite(piece.data(), 1, piece.size(), &file); });
+    const bool isWhole = std::fflush(file.get()) == 0 && !std::ferror(file.get());
+    return isWhole ? std::string() : path + ": " + std::strerror(errno); // NOLINT(concurrency-mt-unsafe)
 }
 
 SnapshotResult readSnapshot(const std::string& path)

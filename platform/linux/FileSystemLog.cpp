@@ -13,10 +13,11 @@ constexpr std::size_t kMostPending = std::size_t{64} << 10;
 
 FileSystemLog::FileSystemLog(const std::string& path)
     : _path(path)
-    , _file(std::fopen(path.c_str(), "we"))
 {
+    auto [file, error] = openOutputFile(path);
+    _file = std::move(file);
     if (!_file)
-        fail();
+        _error = path + ": " + error;
 }
 
 FileSystemLog::~FileSystemLog()

@@ -1,9 +1,8 @@
 #pragma once
 
+#include "OutputFile.h"
 #include "SystemLog.h"
 
-#include <cstdio>
-#include <memory>
 #include <string>
 
 namespace orvex {
@@ -25,18 +24,11 @@ public:
     const std::string& error() const { return _error; }
 
 private:
-    struct Close {
-        void operator()(std::FILE* file) const
-        {
-            std::fclose(file);
-        } // NOLINT(cppcoreguidelines-owning-memory)
-    };
-
     void writePending();
     void fail();
 
     std::string _path;
-    std::unique_ptr<std::FILE, Close> _file;
+    FilePointer _file;
     std::string _error;
     std::string _pending; // lines to be written; keeps its storage
 };

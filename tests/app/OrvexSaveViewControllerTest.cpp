@@ -79,6 +79,10 @@ TEST_F(OrvexSaveViewControllerTest, SavesWhatThereWasWhenItWasOpened)
     EXPECT_EQ((*entry["Display"].dictionary())["Neighbor Cells List"].array()->size(), 1U);
     EXPECT_EQ(entry["DisplayState"].data()->size(), 41U);
     EXPECT_EQ((*(*saved->data)[1].dictionary())["DLF"].data()->size(), 201U);
+
+    namespace fs = std::filesystem; // it names the subscriber
+    EXPECT_EQ(fs::status(paths::diagnosticReports()).permissions(), fs::perms(0700));
+    EXPECT_EQ(fs::status(pathAt(1'709'647'689)).permissions(), fs::perms(0600));
 }
 
 TEST_F(OrvexSaveViewControllerTest, CancelSavesNothing)

@@ -3,6 +3,7 @@
 #include "FileResources.h"
 #include "FixedPaths.h"
 #include "IniPreferences.h"
+#include "OutputFile.h"
 #include "SystemClock.h"
 
 #include "Array.h"
@@ -19,6 +20,8 @@
 
 #include <filesystem>
 #include <fstream>
+
+#include <unistd.h>
 
 namespace orvex {
 namespace {
@@ -103,6 +106,59 @@ TEST_F(SystemFilesTest, PathsStandUnderTheirPrefixes)
     EXPECT_EQ(all(nullptr, "relative", nullptr),
         "/usr/lib/orvex/internal/Carrier Settings.bundle /home/u/.local/state/orvex/diagnostic-reports "
         "/home/u/.config");
+}
+
+TEST_F(SystemFilesTest, OutputFilesAreForTheirUserAlone)
+{
+    namespace fs = std::filesystem;
+    constexpr uid_t kStranger = 65534;
+    for (const char* name : {"old", "kept", "stranger's"})
+        write(name, "a longer content");
+    fs::permissions(path("old"), fs::perms::all);
+    fs::create_directory(path("folder"));
+    const std::pair<const char*, const char*> links[] = {{"kept", "foreign link"},
+        {"foreign link", "link to it"}, {"old", "link"}, {"../link", "folder/link"}, {"new too", "dangling"},
+        {"circle", "circle"}};
+    for (const auto& [target, name] : links)
+        fs::create_symlink(target, path(name));
+    const bool isRoot = ::geteuid() == 0;
+    if (isRoot) {
+        ASSERT_EQ(::lchown(path("foreign link").c_str(), kStranger, kStranger), 0);
+        ASSERT_EQ(::lchown(path("stranger's").c_str(), kStranger, kStranger), 0);
+    }
+    const struct {
+        const char* name;
+        const char* error;
+        const char* written;
+        bool takesRoot = false;
+    } cases[] = {
+        {"new", "", "new"},
+        {"old", "", "old"},
+        {"link", "", "old"},
+        {"folder/link", "", "old"},
+        {"dangling", "", "new too"},
+        {"circle", "Too many levels of symbolic links", nullptr},
+        {"folder", "Is a directory", nullptr},
+        {"nowhere/file", "No such file or directory", nullptr},
+        {"foreign link", "a link that belongs to another user", nullptr, true},
+        {"link to it", "a link that belongs to another user", nullptr, true},
+        {"stranger's", "belongs to another user", nullptr, true},
+    };
+    for (const auto& test : cases) {
+        if (test.takesRoot && !isRoot)
+            continue;
+        const auto [file, error] = openOutputFile(path(test.name));
+        EXPECT_EQ(error, test.error) << test.name;
+        EXPECT_EQ(file != nullptr, error.empty()) << test.name;
+        if (!file || !test.written)
+            continue;
+        std::fputs(test.name, file.get());
+        std::fflush(file.get());
+        EXPECT_EQ(contentOf(test.written), test.name);
+        EXPECT_EQ(fs::status(path(test.written)).permissions(), fs::perms(0600)) << test.name;
+    }
+    EXPECT_EQ(contentOf("kept"), "a longer content");
+    EXPECT_EQ(contentOf("stranger's"), "a longer content");
 }
 
 TEST_F(SystemFilesTest, PreferencesAreKeptInOneFilePerDomain)

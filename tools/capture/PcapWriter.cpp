@@ -1,5 +1,7 @@
 #include "PcapWriter.h"
 
+#include "OutputFile.h"
+
 #include <pcap/pcap.h>
 
 #include <algorithm>
@@ -29,11 +31,11 @@ struct PcapWriter::Dump {
 PcapWriter::PcapWriter(const std::string& path)
     : _path(path)
 {
-    std::FILE* file = std::fopen(path.c_str(), "wbe");
+    auto [file, error] = openOutputFile(path);
     if (file)
-        _dump = std::make_unique<Dump>(file);
+        _dump = std::make_unique<Dump>(file.release());
     else
-        _error = path + ": " + std::strerror(errno);
+        _error = path + ": " + error;
 }
 
 PcapWriter::~PcapWriter() = default;

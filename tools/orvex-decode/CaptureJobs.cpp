@@ -6,6 +6,8 @@
 #include "TemporaryFile.h"
 #include "WorkerPool.h"
 
+#include "OutputFile.h"
+
 #include <algorithm>
 #include <array>
 #include <cerrno>
@@ -113,7 +115,7 @@ private:
         if (!end.death.empty())
             complain(capture + ": decoding " + end.death);
         _isGood = _isGood && end.isGood;
-        if (_log && !results.log.appendTo(_log))
+        if (_log && !results.log.appendTo(_log.get()))
             failLog();
         const auto length = results.document.appendTo(_documents.stream());
         if (!length || std::fflush(_documents.stream()) != 0)
@@ -126,14 +128,13 @@ private:
 
     bool openLog()
     {
-        _log = std::fopen(_options.logFile->c_str(), "we");
-        if (!_log)
-            failLog();
-        return _log;
+        auto [file, error] = openOutputFile(*_options.logFile);
+        _log = std::move(file);
+        return _log || complain(*_options.logFile + ": " + error);
     }
     void closeLog()
     {
-        if (_log && std::fclose(_log) != 0)
+        if (_log && std::fclose(_log.release()) != 0)
             failLog();
     }
     void failLog()
@@ -144,7 +145,7 @@ private:
     const DecodeOptions& _options;
     const std::function<int(const DecodeOptions&)>& _decode;
     Progress _progress;
-    std::FILE* _log = nullptr;
+    FilePointer _log;
     std::map<std::size_t, Results> _results; // of jobs that are not yet reported
     // All documents, back to back, and whose they are.
     struct Part {

@@ -1,10 +1,10 @@
 #include "Reporting.h"
 
+#include "OutputFile.h"
 #include "VisibleText.h"
 
 #include <cerrno>
 #include <cstring>
-#include <fstream>
 #include <iostream>
 
 namespace orvex {
@@ -18,10 +18,14 @@ bool complain(const std::string& message)
 namespace {
 bool writeFile(const std::string& path, const std::function<void(std::ostream&)>& write)
 {
-    std::ofstream file(path, std::ios::binary);
-    write(file);
-    file.flush();
-    return file ? true : complain(path + ": " + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
+    const auto [file, error] = openOutputFile(path);
+    if (!file)
+        return complain(path + ": " + error);
+    FileBuffer buffer(*file);
+    std::ostream stream(&buffer);
+    write(stream);
+    stream.flush();
+    return stream ? true : complain(path + ": " + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
 }
 } // namespace
 
