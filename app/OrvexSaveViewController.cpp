@@ -57,7 +57,7 @@ void OrvexSaveViewController::savePressed()
 {
     const Snapshot snapshot{dateText(_timeStamp), _saveHistory, saveDescription().text().toStdString()};
     const std::string path = snapshotPath(_reportDirectory, _clock.now());
-    if (!writeSnapshot(snapshot, path).empty()) {
+    if (_reportDirectory.empty() || !writeSnapshot(snapshot, path).empty()) {
         systemLog(Priority::error, "Unable to write snapshot to %s", path.c_str());
         Alert::show(*this, QStringLiteral("File Error"), QStringLiteral("Unable to write file to disk"),
             QStringLiteral("Close"));

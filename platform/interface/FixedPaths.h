@@ -10,10 +10,11 @@ namespace orvex::paths {
 std::string internalBuildMarker();
 
 // Where snapshots and other reports are collected: $XDG_STATE_HOME/orvex/diagnostic-reports, by default
-// below ~/.local/state.
+// below ~/.local/state. Empty when $HOME is not set either.
 std::string diagnosticReports();
 
-// Where the preferences of applications are kept: $XDG_CONFIG_HOME, by default ~/.config.
+// Where the preferences of applications are kept: $XDG_CONFIG_HOME, by default ~/.config. Empty when $HOME is
+// not set either.
 std::string preferences();
 
 } // namespace orvex::paths

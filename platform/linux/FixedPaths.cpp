@@ -16,12 +16,15 @@ std::string root()
     return variable("ORVEX_ROOT");
 }
 
-// The directory that the variable names, which counts only when it is absolute, or the usual one below the
-// home directory.
-std::string userDirectory(const char* name, const char* usual)
+// A directory below the one that the variable names, which counts only when it is absolute, or below the
+// usual one in the home directory. Empty without either.
+std::string userDirectory(const char* name, const char* usual, const char* below = "")
 {
     const auto chosen = variable(name);
-    return root() + (chosen.starts_with('/') ? chosen : variable("HOME") + usual);
+    const auto home = variable("HOME");
+    if (chosen.starts_with('/'))
+        return root() + chosen + below;
+    return home.starts_with('/') ? root() + home + usual + below : "";
 }
 } // namespace
 
@@ -32,7 +35,7 @@ std::string internalBuildMarker()
 
 std::string diagnosticReports()
 {
-    return userDirectory("XDG_STATE_HOME", "/.local/state") + "/orvex/diagnostic-reports";
+    return userDirectory("XDG_STATE_HOME", "/.local/state", "/orvex/diagnostic-reports");
 }
 
 std::string preferences()

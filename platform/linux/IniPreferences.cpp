@@ -48,11 +48,15 @@ QSettings* IniPreferences::settingsOf(const std::string& domain)
         systemLog(Priority::error, "\"%s\" cannot be the name of a preferences domain", domain.c_str());
         return nullptr;
     }
-    auto& settings = _settings[domain];
-    if (!settings)
-        settings = std::make_unique<QSettings>(
-            QString::fromStdString(paths::preferences() + '/' + domain + ".ini"), QSettings::IniFormat);
-    return settings.get();
+    const auto [settings, isNew] = _settings.try_emplace(domain);
+    if (isNew) {
+        if (const std::string directory = paths::preferences(); !directory.empty())
+            settings->second = std::make_unique<QSettings>(
+                QString::fromStdString(directory + '/' + domain + ".ini"), QSettings::IniFormat);
+        else
+            systemLog(Priority::error, "Preferences of %s are not kept: $HOME is not set", domain.c_str());
+    }
+    return settings->second.get();
 }
 
 void IniPreferences::setValue(const std::string& domain, const std::string& key, const Value& value)

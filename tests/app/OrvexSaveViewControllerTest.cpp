@@ -156,6 +156,12 @@ TEST_F(OrvexSaveViewControllerTest, WithoutContentsSavesAnEmptyListAndNoWords)
     ASSERT_TRUE(saved) << error;
     EXPECT_TRUE(saved->data->isEmpty());
     EXPECT_EQ(saved->description, "");
+
+    const std::string atRoot = snapshotPath("", clock.now());
+    OrvexSaveViewController nowhere(nullptr, clock, "", [] {});
+    nowhere.savePressed();
+    EXPECT_EQ(log.lines.back(), "<3>Unable to write snapshot to " + atRoot);
+    EXPECT_FALSE(std::filesystem::exists(atRoot));
 }
 
 } // namespace

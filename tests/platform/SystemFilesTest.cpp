@@ -108,6 +108,17 @@ TEST_F(SystemFilesTest, PathsStandUnderTheirPrefixes)
         "/home/u/.config");
 }
 
+TEST_F(SystemFilesTest, WithoutAHomeNothingIsKeptAtTheRoot)
+{
+    for (const char* name : {"HOME", "ORVEX_ROOT", "XDG_STATE_HOME", "XDG_CONFIG_HOME"})
+        setEnvironment(name, nullptr);
+    EXPECT_EQ(paths::diagnosticReports(), "");
+    IniPreferences preferences;
+    preferences.setValue("org.orvex.Home", "key", 1);
+    preferences.synchronize("org.orvex.Home");
+    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("org.orvex.Home are not kept: $HOME is not set")));
+}
+
 TEST_F(SystemFilesTest, OutputFilesAreForTheirUserAlone)
 {
     namespace fs = std::filesystem;
