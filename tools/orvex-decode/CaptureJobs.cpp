@@ -161,7 +161,12 @@ private:
 
 int decodeInJobs(const DecodeOptions& options, const std::function<int(const DecodeOptions&)>& decode)
 {
-    return CaptureJobs(options, decode).run();
+    try {
+        return CaptureJobs(options, decode).run();
+    } catch (const TemporaryFile::Failure& failure) {
+        complain(failure.what());
+        return EXIT_FAILURE;
+    }
 }
 
 } // namespace orvex

@@ -2,8 +2,10 @@
 
 #include <array>
 #include <cerrno>
-#include <system_error>
+#include <cstdlib>
+#include <cstring>
 
+#include <fcntl.h>
 #include <unistd.h>
 
 namespace orvex {
@@ -13,10 +15,18 @@ using Chunk = std::array<char, 65536>;
 } // namespace
 
 TemporaryFile::TemporaryFile()
-    : _file(std::tmpfile())
 {
+    const char* const chosen = std::getenv("TMPDIR");
+    const std::string directory = chosen && *chosen ? chosen : "/tmp";
+    std::string name = directory + "/orvex-decode-XXXXXX";
+    const int descriptor = ::mkostemp(name.data(), O_CLOEXEC);
+    if (descriptor >= 0) {
+        ::unlink(name.c_str());
+        _file.reset(::fdopen(descriptor, "w+b"));
+    }
     if (!_file)
-        throw std::system_error(errno, std::generic_category(), "temporary file");
+        throw Failure("no temporary file in " + directory + ": "
+            + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
 }
 
 void TemporaryFile::takePlaceOf(int descriptor) const

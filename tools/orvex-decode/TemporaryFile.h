@@ -1,8 +1,9 @@
 #pragma once
 
-#include <cstdio>
-#include <memory>
+#include "OutputFile.h"
+
 #include <optional>
+#include <stdexcept>
 #include <string>
 
 namespace orvex {
@@ -11,6 +12,11 @@ namespace orvex {
 // parent reads afterwards.
 class TemporaryFile {
 public:
+    struct Failure : std::runtime_error {
+        using std::runtime_error::runtime_error;
+    };
+
+    // In $TMPDIR, else in /tmp. Throws Failure, with one line for the user.
     TemporaryFile();
 
     // Makes it what the descriptor, of standard output say, leads to.
@@ -24,14 +30,7 @@ public:
     std::FILE* stream() const { return _file.get(); }
 
 private:
-    struct Close {
-        void operator()(std::FILE* file) const
-        {
-            std::fclose(file);
-        } // NOLINT(cppcoreguidelines-owning-memory)
-    };
-
-    std::unique_ptr<std::FILE, Close> _file;
+    FilePointer _file;
 };
 
 } // namespace orvex

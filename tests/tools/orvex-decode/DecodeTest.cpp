@@ -1,4 +1,5 @@
 #include "DecodeProgram.h"
+#include "Environment.h"
 #include "PacketText.h"
 
 #include "TextFormat.h"
@@ -123,6 +124,31 @@ TEST_F(DecodeTest, WritesDocumentAndLogIntoFiles)
     const Result unwritable = decodeCaptures({PcapFile().bytes()}, {"--output", "/no/such/folder/file"});
     EXPECT_EQ(unwritable.status, 1);
     EXPECT_EQ(unwritable.errors, "orvex-decode: /no/such/folder/file: No such file or directory\n");
+}
+
+TEST_F(DecodeTest, SaysInOneLineWhatCouldNotBeWritten)
+{
+    const struct {
+        QStringList arguments;
+        const char* error;
+        const char* temporary = nullptr;
+    } cases[] = {
+        {{"--output", "/dev/full"}, "/dev/full: No space left on device"},
+        {{"--log", "/dev/full"}, "/dev/full: No space left on device"},
+        {{"--snapshot", "/dev/full"}, "/dev/full: the snapshot could not be written"},
+        {{"--jobs", "2", "--output", "/dev/full"}, "/dev/full: No space left on device"},
+        {{"--jobs", "2", "--log", "/dev/full"}, "/dev/full: No space left on device"},
+        {{"--jobs", "2"}, "no temporary file in /nowhere: No such file or directory", "/nowhere"},
+    };
+    for (const auto& [arguments, error, temporary] : cases) {
+        setEnvironment("TMPDIR", temporary);
+        const QStringList common{
+            "--technology", "MRL_LTE", write("x.pcap", PcapFile().add(antennas(4)).bytes())};
+        const Result result = decode(arguments + common);
+        EXPECT_EQ(result.status, 1);
+        EXPECT_EQ(result.errors, std::string("orvex-decode: ") + error + "\n");
+    }
+    setEnvironment("TMPDIR", nullptr);
 }
 
 TEST_F(DecodeTest, WritesNoFileThatItReadsOrWritesAlready)
