@@ -1,5 +1,7 @@
 #include "CommandLine.h"
 
+#include "ArgumentBytes.h"
+
 #include <QCommandLineParser>
 #include <QRegularExpression>
 
@@ -32,7 +34,7 @@ CommandLine wrongUsage(const QString& error)
 {
     CommandLine result;
     result.action = CommandLine::Action::wrongUsage;
-    result.error = error.toStdString();
+    result.error = argumentBytes(error);
     return result;
 }
 
@@ -101,9 +103,9 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     if (parser.isSet(dark))
         result.theme = Theme::Mode::dark;
     if (parser.isSet(resources))
-        result.resources = parser.value(resources).toStdString();
+        result.resources = argumentBytes(parser.value(resources));
     if (parser.isSet(open))
-        result.snapshot = parser.value(open).toLocal8Bit().toStdString();
+        result.snapshot = argumentBytes(parser.value(open));
     return result;
 }
 

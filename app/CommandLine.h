@@ -24,7 +24,7 @@ struct CommandLine {
     bool fillsHandset = false;            // the size is for larger screens only
     std::string error;                    // with wrongUsage: one line
 
-    // The arguments as the program got them, its own name first.
+    // The arguments as argumentTexts() gives them, the name of the program first.
     static CommandLine parse(const QStringList& arguments);
     // The size the window opens with on such a screen; none is the screen's.
     std::optional<QSize> windowSizeOn(const QSize& screen) const;

@@ -12,6 +12,7 @@
 #include "SnapshotTree.h"
 
 #include "Accessibility.h"
+#include "ArgumentBytes.h"
 #include "FatalErrors.h"
 #include "FileResources.h"
 #include "IniPreferences.h"
@@ -221,13 +222,10 @@ int showSnapshot(int argc, char** argv, const CommandLine& commandLine)
 int main(int argc, char** argv)
 {
     occupyStandardStreams();
-    QStringList arguments;
-    for (int i = 0; i < argc; ++i)
-        arguments << QString::fromLocal8Bit(argv[i]);
-    const CommandLine commandLine = CommandLine::parse(arguments);
+    const CommandLine commandLine = CommandLine::parse(argumentTexts(argc, argv));
     switch (commandLine.action) {
     case CommandLine::Action::wrongUsage:
-        std::fprintf(stderr, "orvex: %s Try 'orvex --help'.\n", commandLine.error.c_str());
+        complain(commandLine.error + " Try 'orvex --help'.");
         return kExitWrongUsage;
     case CommandLine::Action::help: std::fputs(CommandLine::usage().c_str(), stdout); return EXIT_SUCCESS;
     case CommandLine::Action::version: std::puts("orvex " ORVEX_VERSION); return EXIT_SUCCESS;

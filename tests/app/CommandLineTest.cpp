@@ -19,6 +19,7 @@ TEST(CommandLine, UnderstandsItsOptionsAndNothingElse)
         {{"-h"}, Action::help},
         {{"--version", "--console"}, Action::version},
         {{"--resources", "/a b", "--dark"}, Action::window, Mode::dark, "/a b"},
+        {{"--resources", "/\u00ff"}, Action::window, Mode::system, "/\xff"},
         {{"--light"}, Action::window, Mode::light},
         {{"--print-status", "--console"}, Action::wrongUsage},
         {{"--print-status", "--open", "a"}, Action::wrongUsage},

@@ -1,5 +1,6 @@
 // The whole road with real programs: koratd, the monitor, and captures of what went between them.
 
+#include "Environment.h"
 #include "KoratClient.h"
 #include "KoratProgram.h"
 
@@ -8,6 +9,7 @@
 #include <gmock/gmock.h>
 
 #include <algorithm>
+#include <filesystem>
 
 namespace orvex::test {
 namespace {
@@ -119,6 +121,46 @@ TEST_F(LiveSession, FullDiskEndsTheRecordingOnly)
     EXPECT_EQ(korat.terminate(), 0);
     EXPECT_EQ(QString::fromStdString(korat.errors()).count("recording ends"), 1) << korat.errors();
     EXPECT_GT(countIn("capture"), 10U);
+}
+
+TEST_F(LiveSession, FileNamesAreBytes)
+{
+    const std::string root = folder.path(".");
+    const std::string odd = root + "/\xff\xe4"; // in no locale's encoding
+    std::filesystem::create_directory(odd);
+    const std::pair<const char*, const char*> variables[] = {{"FOLDER", root.c_str()},
+        {"KORATD", KORATD_PATH}, {"ORVEX", ORVEX_PATH}, {"DECODE", ORVEX_DECODE},
+        {"RESOURCES", ORVEX_RESOURCES}};
+    for (const auto& [name, value] : variables)
+        setEnvironment(name, value);
+    const struct {
+        const char* script;
+        int status;
+        const char* said;
+    } cases[] = {
+        {"rm -f $ODD/*; $KORATD --record $ODD/capture & while [ ! -s $ODD/capture ]; do sleep .1; done; kill "
+         "$!; wait $!",
+            0, "koratd: sent 0 messages"},
+        {"cp $RESOURCES/LTE.plist $ODD; $DECODE --technology MRL_LTE --resources $ODD --output $ODD/tree"
+         " --log $ODD/log --snapshot $ODD/snapshot $ODD/capture && cat $ODD/tree && test -s $ODD/log",
+            0, "Orvex: (unknown)"},
+        {"$DECODE --technology MRL_LTE --jobs 2 --resources $ODD $ODD/capture", 0, "Orvex: (unknown)"},
+        {"$DECODE --dlf $ODD/dlf $ODD/snapshot && test -s $ODD/dlf", 0, "DLF binary (161 bytes)"},
+        {"$ORVEX --console --open $ODD/snapshot", 0, "Saved "},
+        {"$ORVEX --console $ODD", 2, R"(\xff\xe4'.)"},
+        {"$KORATD --replay $ODD/log", 1, R"(\xff\xe4/log: neither a pcap nor a DLF file)"},
+    };
+    for (const char* locale : {"C", "C.UTF-8"}) {
+        setEnvironment("LC_ALL", locale);
+        for (const auto& [script, status, said] : cases) {
+            Program shell(
+                folder, "/bin/sh", {"-c", QString(R"(ODD=$(printf "$FOLDER/\377\344"); )") + script});
+            EXPECT_EQ(shell.waitForEnd(), status) << locale << ' ' << script << '\n' << shell.errors();
+            EXPECT_THAT(shell.output() + shell.errors(), testing::HasSubstr(said)) << locale << ' ' << script;
+        }
+    }
+    setEnvironment("LC_ALL", nullptr);
+    std::filesystem::remove_all(odd); // Qt cannot
 }
 
 TEST_F(LiveSession, EndsWhenItsWindowWasPaintedIfItIsTo)

@@ -1,5 +1,6 @@
 #include "Options.h"
 
+#include "ArgumentBytes.h"
 #include "FileConflict.h"
 
 #include <QCommandLineParser>
@@ -76,17 +77,9 @@ bool readFault(const QString& text, Faults& faults)
     return false;
 }
 
-QStringList list(const std::vector<std::string>& arguments)
-{
-    QStringList result;
-    for (const std::string& argument : arguments)
-        result.append(QString::fromStdString(argument));
-    return result;
-}
-
 std::optional<std::string> file(const QCommandLineParser& parser, const char* option)
 {
-    return parser.isSet(option) ? std::optional(parser.value(option).toStdString()) : std::nullopt;
+    return parser.isSet(option) ? std::optional(argumentBytes(parser.value(option))) : std::nullopt;
 }
 
 // Reads what is played and recorded; why it makes no sense, or nothing.
@@ -121,8 +114,8 @@ std::string read(const QCommandLineParser& parser, Options& options)
         if (parser.values(option).size() > 1)
             return std::string("--") + option + " is given more than once";
     }
-    const std::string technology = options.technology = parser.value("technology").toStdString();
-    const std::string scenario = parser.value("scenario").toStdString();
+    const std::string technology = options.technology = argumentBytes(parser.value("technology"));
+    const std::string scenario = argumentBytes(parser.value("scenario"));
     options.scenario = findScenario(technology, scenario);
     if (!findScenario(technology, {}))
         return "no scenario for the technology \"" + technology + "\"; known are: " + knownTechnologies();
@@ -146,15 +139,15 @@ std::string read(const QCommandLineParser& parser, Options& options)
     options.seed = *seed;
     for (const QString& fault : parser.values("fault")) {
         if (!readFault(fault, options.faults))
-            return "no such fault: " + fault.toStdString();
+            return "no such fault: " + argumentBytes(fault);
     }
     if (!parser.positionalArguments().isEmpty())
-        return "unexpected argument: " + parser.positionalArguments().first().toStdString();
+        return "unexpected argument: " + argumentBytes(parser.positionalArguments().first());
     return {};
 }
 } // namespace
 
-OptionsResult optionsFromArguments(const std::vector<std::string>& arguments)
+OptionsResult optionsFromArguments(const QStringList& arguments)
 {
     QCommandLineParser parser;
     parser.setApplicationDescription(
@@ -181,8 +174,8 @@ OptionsResult optionsFromArguments(const std::vector<std::string>& arguments)
             "F"},
     });
     OptionsResult result;
-    if (!parser.parse(list(arguments))) {
-        result.error = parser.errorText().toStdString();
+    if (!parser.parse(arguments)) {
+        result.error = argumentBytes(parser.errorText());
     } else if (parser.isSet("help")) {
         result.text = parser.helpText().toStdString();
         return result;

@@ -3,9 +3,10 @@
 #include "scenarios/ScenarioTable.h"
 #include "service/Faults.h"
 
+#include <QStringList>
+
 #include <optional>
 #include <string>
-#include <vector>
 
 namespace orvex::korat {
 
@@ -28,7 +29,7 @@ struct OptionsResult {
     std::string error; // ... or what is wrong; the text is the usage then, unless only a file is at fault
 };
 
-// The arguments, the program's name first.
-OptionsResult optionsFromArguments(const std::vector<std::string>& arguments);
+// The arguments as argumentTexts() gives them, the name of the program first.
+OptionsResult optionsFromArguments(const QStringList& arguments);
 
 } // namespace orvex::korat

@@ -3,6 +3,7 @@
 #include "service/KoratService.h"
 #include "service/Report.h"
 
+#include "ArgumentBytes.h"
 #include "FatalErrors.h"
 #include "LinuxSystemLog.h"
 #include "QtRunLoop.h"
@@ -42,7 +43,7 @@ int main(int argc, char** argv)
     orvex::SystemLog::install(log.get());
     orvex::installFatalErrorHandler();
 
-    const auto result = orvex::korat::optionsFromArguments({argv, argv + argc});
+    const auto result = orvex::korat::optionsFromArguments(orvex::argumentTexts(argc, argv));
     int status = EXIT_SUCCESS;
     if (result.options) {
         status = serve(*result.options);

@@ -1,5 +1,6 @@
 #include "DecodeOptions.h"
 
+#include "ArgumentBytes.h"
 #include "RegularFile.h"
 #include "TelephonyConstants.h"
 
@@ -21,7 +22,7 @@ DecodeOptions wrongUsage(const QString& error)
 {
     DecodeOptions result;
     result.action = DecodeOptions::Action::wrongUsage;
-    result.error = error.toStdString();
+    result.error = argumentBytes(error);
     return result;
 }
 
@@ -40,7 +41,7 @@ std::optional<std::string> valueOf(const QCommandLineParser& parser, const QComm
 {
     if (!parser.isSet(option))
         return std::nullopt;
-    return parser.value(option).toStdString();
+    return argumentBytes(parser.value(option));
 }
 
 // False when the option is there and its value is no number from 1 on.
@@ -77,11 +78,8 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
         technology, format, refreshEvery, resources, output, log, snapshot, description, dlf, jobs};
     parser.addOptions(once + QList{help, version});
 
-    QStringList list;
-    for (int i = 0; i < count; ++i)
-        list.append(QString::fromLocal8Bit(arguments[i]));
     // parse() rather than process(), which would end the program in its own way.
-    if (!parser.parse(list))
+    if (!parser.parse(argumentTexts(count, arguments)))
         return wrongUsage(parser.errorText());
 
     DecodeOptions result;
@@ -93,9 +91,9 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
         if (parser.values(option).size() > 1)
             return wrongUsage(QStringLiteral("--%1 is given more than once.").arg(option.names().first()));
     }
-    result.technology = parser.value(technology).toStdString();
+    result.technology = argumentBytes(parser.value(technology));
     for (const QString& capture : parser.positionalArguments())
-        result.captures.push_back(capture.toLocal8Bit().toStdString());
+        result.captures.push_back(argumentBytes(capture));
     if (result.captures.empty())
         return wrongUsage(QStringLiteral("No capture is named."));
     const auto snapshots = std::ranges::count_if(result.captures, isSnapshotFile);
@@ -121,7 +119,7 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
     result.outputFile = valueOf(parser, output);
     result.logFile = valueOf(parser, log);
     result.snapshotFile = valueOf(parser, snapshot);
-    result.description = parser.value(description).toStdString();
+    result.description = argumentBytes(parser.value(description));
     result.dlfFile = valueOf(parser, dlf);
     if (result.snapshotFile && result.areSnapshots)
         return wrongUsage(QStringLiteral("--snapshot saves what captures hold, not another snapshot."));
