@@ -25,8 +25,10 @@ public:
     // other step may follow.
     bool take(ByteView message);
     bool refresh();
-    // The tree of the screens, its JSON text, and a snapshot that is written and read again.
-    void finish();
+    // Makes the tree of the screens and a snapshot. To read again what was written takes twice as long as all
+    // the rest.
+    enum class Ending { written, readAgain };
+    void finish(Ending ending);
 
 private:
     test::FixedClock _clock;

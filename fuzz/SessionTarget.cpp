@@ -41,6 +41,6 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
             return 0;
     }
     if (session.refresh())
-        session.finish();
+        session.finish(fuzz::FuzzSession::Ending::readAgain);
     return 0;
 }
