@@ -124,7 +124,8 @@ void FuzzSession::finish(Ending ending)
         const auto tree = OrvexModelNode::makeTreeFromObject(_session.display(), paths);
         const MemoryFile file;
         const bool isWritten =
-            writeSnapshot({"2024-03-05 14:07:09 +0000", _session.saveContents(), "Fuzz"}, file.path());
+            writeSnapshot({"2024-03-05 14:07:09 +0000", _session.saveContents(), "Fuzz"}, file.path())
+                .empty();
         if (ending == Ending::written)
             return;
         requireJson(*tree);
