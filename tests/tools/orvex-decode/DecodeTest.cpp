@@ -135,7 +135,7 @@ TEST_F(DecodeTest, SaysInOneLineWhatCouldNotBeWritten)
     } cases[] = {
         {{"--output", "/dev/full"}, "/dev/full: No space left on device"},
         {{"--log", "/dev/full"}, "/dev/full: No space left on device"},
-        {{"--snapshot", "/dev/full"}, "/dev/full: the snapshot could not be written"},
+        {{"--snapshot", "/dev/full"}, "/dev/full: No space left on device"},
         {{"--jobs", "2", "--output", "/dev/full"}, "/dev/full: No space left on device"},
         {{"--jobs", "2", "--log", "/dev/full"}, "/dev/full: No space left on device"},
         {{"--jobs", "2"}, "no temporary file in /nowhere: No such file or directory", "/nowhere"},

@@ -40,10 +40,11 @@ TEST_F(SnapshotDecodeTest, HoldsWhatTheCaptureHeldForEveryTechnology)
     for (const korat::ScenarioEntry& entry : korat::scenarioTable()) {
         SCOPED_TRACE(entry.technology);
         const bool hasDLF = entry.technology != std::string("IFX");
-        const QStringList options{"--technology", entry.technology, "--resources", ORVEX_RESOURCES,
-            "--format", "json", "--refresh-every", "4"};
+        const QStringList options{
+            "--technology", entry.technology, "--resources", ORVEX_RESOURCES, "--format", "json"};
         const Json shown = parsed(decode(options
-            + QStringList{"--snapshot", name("saved.orvex"), "--description", "öst & <west>", drive(entry)}));
+            + QStringList{"--refresh-every", "4", "--snapshot", name("saved.orvex"), "--description",
+                "öst & <west>", drive(entry)}));
 
         const Json document = parsed(decode(options + QStringList{name("saved.orvex")}));
         ASSERT_EQ(document["snapshots"].size(), 1U);
