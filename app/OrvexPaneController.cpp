@@ -7,6 +7,7 @@
 #include "NodesByPath.h"
 #include "TextLabel.h"
 #include "Theme.h"
+#include "VisibleText.h"
 
 #include <algorithm>
 #include <utility>
@@ -48,7 +49,8 @@ OrvexPaneController::OrvexPaneController(PaneHost& host, OrvexModelNodeRef node,
 
 void OrvexPaneController::updateTitle()
 {
-    const QString title = _nodes ? QString::fromStdString(_nodes->displayName()) : QStringLiteral("Orvex");
+    const QString title =
+        _nodes ? QString::fromStdString(visibleText(_nodes->displayName())) : QStringLiteral("Orvex");
     setTitle(title);
     _list->setAccessibleName(title);
 }

@@ -4,14 +4,15 @@
 #include "SnapshotTree.h"
 
 #include "NavigationStack.h"
+#include "VisibleText.h"
 #include "Window.h"
 
 namespace orvex {
 
 SnapshotViewer::SnapshotViewer(
     const Snapshot& snapshot, const std::string& name, const std::optional<QSize>& windowSize)
-    : _window(
-        std::make_unique<Window>(QStringLiteral("%1 – Orvex").arg(QString::fromStdString(name)), windowSize))
+    : _window(std::make_unique<Window>(
+        QStringLiteral("%1 – Orvex").arg(QString::fromStdString(visibleText(name))), windowSize))
 {
     auto root = std::make_unique<OrvexPaneController>(*this, snapshotTree(snapshot), "/");
     root->setStatus(snapshotMessage(snapshot), false); // the screens above take it over
@@ -25,7 +26,7 @@ SnapshotViewer::~SnapshotViewer() = default;
 
 std::string snapshotMessage(const Snapshot& snapshot)
 {
-    return "Saved " + snapshot.timestamp;
+    return "Saved " + visibleText(snapshot.timestamp);
 }
 
 } // namespace orvex
