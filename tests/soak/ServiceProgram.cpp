@@ -34,7 +34,9 @@ long messagesIn(const std::string& capture)
 
 QStringList Scene::arguments() const
 {
-    QStringList result{"--technology", technology, "--seed", QString::number(seed)};
+    QStringList result{"--technology", technology};
+    if (seed)
+        result << "--seed" << QString::number(*seed);
     if (rate)
         result << "--rate" << QString::number(*rate);
     return result + more;

@@ -14,7 +14,7 @@ namespace orvex::soak {
 struct Scene {
     QString technology;
     std::optional<int> rate; // messages a second; none: the scenario's own pace
-    unsigned seed = 1;
+    std::optional<unsigned> seed;
     QStringList more; // options
 
     QStringList arguments() const;

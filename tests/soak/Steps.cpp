@@ -16,6 +16,8 @@ constexpr int kGentleRate = 30;
 constexpr auto kSleep = 2100ms; // a little more than a refresh
 constexpr int kFastRate = 20'000;
 constexpr int kFastMessages = 20'000;
+constexpr int kFullRate = 1'000'000;
+constexpr int kLargeMessages = 1000; // as many as the monitor keeps for a snapshot, or so
 } // namespace
 
 std::vector<Steps::Kind> Steps::round()
@@ -29,6 +31,10 @@ std::vector<Steps::Kind> Steps::round()
         {"rested", &Steps::rested},
         {"asleep", &Steps::asleep},
         {"garbage", &Steps::garbage},
+        {"flat out", &Steps::flatOut},
+        {"bombed", &Steps::bombed},
+        {"broken frames", &Steps::brokenFrames},
+        {"idle peers", &Steps::idlePeers},
         {"absent", &Steps::absent},
         {"refused channel", &Steps::refusedChannel},
         {"null port", &Steps::nullPort},
@@ -131,12 +137,45 @@ void Steps::asleep()
 
 void Steps::garbage()
 {
-    Scene scene = anyScene();
-    while (scene.technology == kPropertyLists)
-        scene.technology = anyTechnology();
+    Scene scene = anyMarlinScene();
     scene.more << "--fault" << QString("garbage=%1").arg(5 + below(91));
     const auto service = stream(scene);
     _watch.watchStream(aWhile());
+    endInOrder(*service);
+}
+
+void Steps::flatOut()
+{
+    const std::string capture = _folder.path("large.pcap");
+    writeLargeMessages(capture);
+    const Scene scene{"MRL_LTE", kFullRate, std::nullopt,
+        {"--replay", QString::fromStdString(capture), "--loop", "--count", QString::number(kLargeMessages)}};
+    const auto service = stream(scene);
+    _watch.awaitDecoded(kLargeMessages);
+    endInOrder(*service);
+}
+
+void Steps::bombed()
+{
+    attackedBy(bombs());
+}
+
+void Steps::brokenFrames()
+{
+    attackedBy(soak::brokenFrames());
+}
+
+void Steps::idlePeers()
+{
+    attackedBy(soak::idlePeers());
+}
+
+void Steps::attackedBy(const std::vector<HostileStream>& streams)
+{
+    const auto service = stream(anyMarlinScene());
+    const HostilePeers peers(_folder, streams);
+    _watch.watchStream(aWhile());
+    _sent += peers.sent();
     endInOrder(*service);
 }
 
@@ -219,6 +258,14 @@ Scene Steps::anyScene()
     scene.technology = anyTechnology();
     scene.rate = kRates[below(std::size(kRates))];
     scene.seed = below(1'000'000);
+    return scene;
+}
+
+Scene Steps::anyMarlinScene()
+{
+    Scene scene = anyScene();
+    while (scene.technology == kPropertyLists)
+        scene.technology = anyTechnology();
     return scene;
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Attack.h"
 #include "MonitorWatch.h"
 #include "ServiceProgram.h"
 
@@ -43,6 +44,11 @@ private:
     void rested();
     void asleep();
     void garbage();
+    // Streams beside which others attack.
+    void flatOut();
+    void bombed();
+    void brokenFrames();
+    void idlePeers();
     // Sessions that do not come about, or only just.
     void absent();
     void refusedChannel();
@@ -55,10 +61,12 @@ private:
     MonitorWatch::Milliseconds aWhile();
     QString anyTechnology();
     Scene anyScene();
+    Scene anyMarlinScene();
     std::unique_ptr<ServiceProgram> serve(const Scene& scene);
     // Serves until the monitor shows messages, after those that were sent in this step before.
     std::unique_ptr<ServiceProgram> stream(const Scene& scene, long sentBefore = 0);
     void endInOrder(ServiceProgram& service);
+    void attackedBy(const std::vector<HostileStream>& streams);
     void unansweredQuery(const char* fault, const char* error);
     void noSession(const Scene& scene, const char* error);
 
