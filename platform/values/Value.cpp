@@ -53,6 +53,8 @@ Value Value::deepCopy() const
         return copyOf(*elements);
     if (const Set* held = set())
         return Set{copyOf(*held->elements)};
+    if (kind() == Kind::data)
+        return *this; // nobody changes a buffer that is in a value
     if (const DictionaryRef entries = dictionary()) {
         auto copy = Dictionary::make();
         for (const auto& [key, value] : *entries)

@@ -101,6 +101,10 @@ TEST_F(HostilePeerTest, PartialMessagesAreBoundedAsAWhole)
 TEST_F(HostilePeerTest, PortListensAgainWhenThereAreDescriptors)
 {
     const auto local = ports.createLocalPort("a", collector());
+    // The sanitizers take a descriptor to look at an object for the first time.
+    RawPeer(pathOf("a")).say(1, "early");
+    ASSERT_TRUE(waitUntil([&] { return received == "1:early "; }));
+    received.clear();
     std::deque<int> descriptors;
     rlimit limit{};
     getrlimit(RLIMIT_NOFILE, &limit);
