@@ -46,6 +46,8 @@ public:
     virtual Value generateLogUsingState(Dictionary& state) = 0;
     // What a snapshot stores: an array of dictionaries, each with a "Description".
     virtual ArrayRef getSaveContentsFromState(const Dictionary& state) const = 0;
+    // Bytes of raw messages that a snapshot lacks because they exceeded the limit.
+    virtual std::size_t droppedRawBytes() const { return 0; }
 
     // Why the state has no display and cannot get one: which template, and what is wrong with it, in one
     // line. Empty when all is well. Nothing is logged.

@@ -13,8 +13,9 @@ namespace {
 constexpr const char* kExecutableName = "EXECUTABLE_NAME";
 constexpr const char* kBuildDate = "Dec 19 2018 23:59:16";
 
-// Leaves the newest entries theirs, as far as there is room, and the others none.
-void dropOldestPackets(const Array& history, std::size_t room)
+// Keeps the packets of the newest entries that fit and drops those of the others. Returns how many bytes
+// went.
+std::size_t dropOldestPackets(const Array& history, std::size_t room)
 {
     std::size_t dropped = 0;
     for (std::size_t i = history.size(); i > 0; --i) {
@@ -32,6 +33,7 @@ void dropOldestPackets(const Array& history, std::size_t room)
     }
     if (dropped > 0)
         systemLog(Priority::warning, "The history dropped its oldest raw packets, %zu bytes", dropped);
+    return dropped;
 }
 } // namespace
 
@@ -96,13 +98,15 @@ ArrayRef MRLLogGenerator::getSaveContentsFromState(const Dictionary& state) cons
 
 void MRLLogGenerator::handOverBinData(Dictionary& state)
 {
-    state.set("DisplayState", Value()); // also the history's, which may drop it now
+    // The newest history entry shares these bytes. Letting go of them lets the memory go with that entry's
+    // packets.
+    state.set("DisplayState", Value());
     if (!_binData) {
         _binData.emplace(environment().rawPacketLimit);
         return;
     }
     if (const ArrayRef history = state["History"].array())
-        dropOldestPackets(*history, environment().rawPacketLimit - _binData->size());
+        _droppedFromHistory += dropOldestPackets(*history, environment().rawPacketLimit - _binData->size());
     state.set("DisplayState", _binData->take());
 }
 

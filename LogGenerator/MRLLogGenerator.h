@@ -28,6 +28,11 @@ public:
     // The history entries and, last, the DLF.
     ArrayRef getSaveContentsFromState(const Dictionary& state) const override;
 
+    std::size_t droppedRawBytes() const override
+    {
+        return _droppedFromHistory + (_binData ? _binData->droppedBytes() : 0);
+    }
+
 protected:
     // Without a buffer until the first display request.
     MRLLogGenerator(const GeneratorEnvironment& environment, NeverSetUp tag)
@@ -39,6 +44,9 @@ protected:
     void handOverBinData(Dictionary& state);
 
     std::optional<RawPackets> _binData; // since the last display request
+
+private:
+    std::size_t _droppedFromHistory = 0;
 };
 
 } // namespace orvex

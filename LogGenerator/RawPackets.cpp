@@ -17,8 +17,10 @@ void RawPackets::append(ByteView packet)
         return;
     if (_size + packet.size() > _limit) {
         makeRoomFor(packet.size());
-        if (packet.size() > _limit)
+        if (packet.size() > _limit) {
+            _droppedBytes += packet.size();
             return;
+        }
     }
     Bytes& batch = batchWithRoomFor(packet.size());
     batch.insert(batch.end(), packet.begin(), packet.end());
@@ -33,6 +35,7 @@ void RawPackets::makeRoomFor(std::size_t length)
     }
     while (!_batches.empty() && _size + length > _limit) {
         _size -= _batches.front()->size();
+        _droppedBytes += _batches.front()->size();
         _batches.pop_front();
     }
 }

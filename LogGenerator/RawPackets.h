@@ -23,6 +23,8 @@ public:
 
     void append(ByteView packet);
     std::size_t size() const { return _size; }
+    // Bytes of packets that did not fit, in all intervals.
+    std::size_t droppedBytes() const { return _droppedBytes; }
     // The packets back to back. The next interval begins.
     BytesRef take();
 
@@ -34,7 +36,8 @@ private:
     std::deque<BytesRef> _batches; // each begins with a packet
     std::size_t _size = 0;         // of all batches
     std::size_t _expectedSize = 0; // one interval is much like the next
-    bool _hasDropped = false;      // in this interval
+    std::size_t _droppedBytes = 0;
+    bool _hasDropped = false; // in this interval
 };
 
 } // namespace orvex

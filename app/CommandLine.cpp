@@ -128,8 +128,8 @@ std::string CommandLine::usage()
            "                   after the number of messages decoded so far.\n"
            "  --resources DIR  Take the section templates from this directory.\n"
            "  --light, --dark  Choose the colours. Default: the desktop's.\n"
-           "  --size WxH       Open the window with this size instead of the screen's. 'handset' is\n"
-           "                   375x667, or the screen's where that is a handset's.\n"
+           "  --size WxH       Open the window at this size instead of filling the screen. 'handset'\n"
+           "                   is 375x667, or the whole screen on a handset.\n"
            "  --until-painted  Print 'painted' after the first frame, then exit.\n"
            "  -h, --help       Show this help and exit.\n"
            "  -v, --version    Show the version and exit.\n";

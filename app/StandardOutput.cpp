@@ -14,7 +14,8 @@ StandardOutput::StandardOutput(std::function<void(int error)> onClosed)
 {
     QObject::connect(&_readerGone, &QSocketNotifier::activated, &_readerGone, [this] {
         pollfd output{.fd = STDOUT_FILENO, .events = 0, .revents = 0};
-        if (::poll(&output, 1, 0) > 0 && (output.revents & POLLERR) != 0)
+        if (::poll(&output, 1, 0) > 0
+            && (output.revents & (POLLERR | POLLHUP)) != 0) // a pipe has one, a socket the other
             close(EPIPE);
     });
 }

@@ -131,7 +131,8 @@ int runConsole(int argc, char** argv, const std::string& resourceDirectory)
     int status = EXIT_SUCCESS;
     StandardOutput output([&status](int error) {
         if (error != EPIPE) {
-            std::fprintf(stderr, "orvex: standard output: %s\n", std::strerror(error));
+            complain(
+                std::string("standard output: ") + std::strerror(error)); // NOLINT(concurrency-mt-unsafe)
             status = kExitFailure;
         }
         installConsole([](std::string_view) {});        // nobody is left to read about the end
@@ -172,11 +173,12 @@ int runWindow(int argc, char** argv, const std::string& resourceDirectory, const
     return runInWindow(argc, argv, commandLine.theme, [&resourceDirectory, &commandLine] {
         LinuxPlatform platform(resourceDirectory);
         const auto app = OrvexApp::create(platform.forApp(), windowSize(commandLine));
-        StandardOutput output([](int) {}); // the window stays when nobody reads
+        std::optional<StandardOutput> output;
         std::optional<StatusPrinter> statusPrinter;
         if (commandLine.printsStatus) {
             installConsole(writeConsoleToStandardError);
-            statusPrinter.emplace(*app, output);
+            output.emplace([](int) {}); // the window stays when nobody reads
+            statusPrinter.emplace(*app, *output);
         }
         const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
         std::optional<FirstPaint> firstPaint;

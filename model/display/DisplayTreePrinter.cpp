@@ -1,41 +1,40 @@
 #include "DisplayTreePrinter.h"
 
-#include "VisibleText.h"
-
 namespace orvex {
 
 namespace {
 
 constexpr std::size_t kIndent = 2;
 
-void appendLines(std::vector<std::string>& lines, const OrvexModelNode& node, std::size_t depth)
+void appendLines(
+    std::vector<std::string>& lines, const OrvexModelNode& node, std::size_t depth, std::size_t longest)
 {
     std::string line(depth * kIndent, ' ');
-    line += visibleText(node.displayName());
+    line += visibleText(node.displayName(), longest);
     if (const std::string* value = node.value()) {
         line += value->empty() ? ":" : ": ";
-        line += visibleText(*value);
+        line += visibleText(*value, longest);
     }
     lines.push_back(std::move(line));
     if (const auto* children = node.childNodes()) {
         for (const OrvexModelNodeRef& child : *children)
-            appendLines(lines, *child, depth + 1);
+            appendLines(lines, *child, depth + 1, longest);
     }
 }
 
 } // namespace
 
-std::vector<std::string> DisplayTreePrinter::lines(const OrvexModelNode& root)
+std::vector<std::string> DisplayTreePrinter::lines(const OrvexModelNode& root, std::size_t longest)
 {
     std::vector<std::string> result;
-    appendLines(result, root, 0);
+    appendLines(result, root, 0, longest);
     return result;
 }
 
-std::string DisplayTreePrinter::text(const OrvexModelNode& root)
+std::string DisplayTreePrinter::text(const OrvexModelNode& root, std::size_t longest)
 {
     std::string result;
-    for (const std::string& line : lines(root)) {
+    for (const std::string& line : lines(root, longest)) {
         result += line;
         result += '\n';
     }

@@ -2,6 +2,8 @@
 
 #include "OrvexModelNode.h"
 
+#include "VisibleText.h"
+
 #include <string>
 #include <vector>
 
@@ -14,9 +16,10 @@ namespace orvex {
 // written visibly: a line break as \n, other control characters as \x1b.
 class DisplayTreePrinter {
 public:
-    static std::vector<std::string> lines(const OrvexModelNode& root);
+    static std::vector<std::string> lines(
+        const OrvexModelNode& root, std::size_t longest = kLongestVisibleText);
     // The same lines, each ended by a line break.
-    static std::string text(const OrvexModelNode& root);
+    static std::string text(const OrvexModelNode& root, std::size_t longest = kLongestVisibleText);
 };
 
 } // namespace orvex

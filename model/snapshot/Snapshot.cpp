@@ -6,9 +6,7 @@
 #include "TextFormat.h"
 
 #include <algorithm>
-#include <cerrno>
 #include <cmath>
-#include <cstring>
 
 namespace orvex {
 
@@ -76,13 +74,13 @@ std::string writeSnapshot(const Snapshot& snapshot, const std::string& path)
     });
     if (const std::string fault = writePropertyListXML(list, [](std::string_view) {}); !fault.empty())
         return path + ": " + fault;
-    const auto [file, error] = openOutputFile(path);
-    if (!file)
-        return path + ": " + error;
-    writePropertyListXML(
-        list, [&file = *file](std::string_view piece) { std::fwrite(piece.data(), 1, piece.size(), &file); });
-    const bool isWhole = std::fflush(file.get()) == 0 && !std::ferror(file.get());
-    return isWhole ? std::string() : path + ": " + std::strerror(errno); // NOLINT(concurrency-mt-unsafe)
+    auto [file, error] = openOutputFile(path);
+    if (file) {
+        writePropertyListXML(list,
+            [&file = *file](std::string_view piece) { std::fwrite(piece.data(), 1, piece.size(), &file); });
+        error = closeOutputFile(std::move(file));
+    }
+    return error.empty() ? std::string() : path + ": " + error;
 }
 
 SnapshotResult readSnapshot(const std::string& path)

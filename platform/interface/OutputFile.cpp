@@ -82,7 +82,7 @@ std::string targetOf(const Descriptor& link, const std::string& path)
 }
 
 // Opens what was looked at, whatever has taken its place meanwhile.
-OutputFile reopen(const Descriptor& found)
+OutputFile reopen(const Descriptor& found, bool isRedirection)
 {
     struct stat status { };
     if (::fstat(found.number(), &status) != 0)
@@ -94,7 +94,9 @@ OutputFile reopen(const Descriptor& found)
     Descriptor file(::open(path.c_str(), O_WRONLY | O_CLOEXEC | O_NOCTTY));
     if (!file.isOpen())
         return fail();
-    if (isRegular && (::fchmod(file.number(), kOwnerOnly) != 0 || ::ftruncate(file.number(), 0) != 0))
+    if (isRegular && !isRedirection && ::fchmod(file.number(), kOwnerOnly) != 0)
+        return fail();
+    if (isRegular && ::ftruncate(file.number(), 0) != 0)
         return fail();
     return streamOf(file);
 }
@@ -116,17 +118,24 @@ OutputFile openOutputFile(const std::string& given)
         if (!found.isOpen() || ::fstat(found.number(), &status) != 0)
             return fail();
         if (!S_ISLNK(status.st_mode))
-            return reopen(found);
+            return reopen(found, false);
         if (!isTrusted(status))
             return fail("a link that belongs to another user");
         if (isLinkToOpenFile(found)) {
             const Descriptor behind(::open(path.c_str(), O_PATH | O_CLOEXEC));
-            return behind.isOpen() ? reopen(behind) : fail();
+            return behind.isOpen() ? reopen(behind, true) : fail();
         }
         path = targetOf(found, path);
     }
     errno = ELOOP;
     return fail();
+}
+
+std::string closeOutputFile(FilePointer file)
+{
+    const bool isWhole = std::fflush(file.get()) == 0 && std::ferror(file.get()) == 0;
+    const bool isClosed = std::fclose(file.release()) == 0;
+    return isWhole && isClosed ? std::string() : fail().error;
 }
 
 } // namespace orvex

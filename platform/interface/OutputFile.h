@@ -17,10 +17,14 @@ struct OutputFile {
     std::string error; // why, without the path
 };
 
-// Opens a file for writing, from its beginning, and for the eyes of its user alone: what is written may name
-// a subscriber. A file that exists is emptied. One of another user is refused, and so is a link of another
-// user, root excepted: in a shared directory anybody can put one there.
+// Opens a file for writing, from its beginning, readable by its owner only: what is written may name a
+// subscriber. An existing file is emptied and gets mode 0600, unless it is reached through /dev/stdout and
+// the like, whose mode the user chose. A file of another user is refused, and so is a link of another user,
+// root excepted: in a shared directory anybody can put one there.
 OutputFile openOutputFile(const std::string& path);
+
+// Closes the file. Returns why it does not hold all that was written to it; empty when it does.
+std::string closeOutputFile(FilePointer file);
 
 // Lets an output stream write to a file, which stays its owner's.
 class FileBuffer final : public std::streambuf {

@@ -10,7 +10,9 @@
 #include <cerrno>
 #include <cstring>
 #include <tuple>
+#include <utility>
 
+#include <poll.h>
 #include <sys/socket.h>
 #include <sys/stat.h>
 #include <sys/un.h>
@@ -120,10 +122,14 @@ void LocalSocketPort::acceptPeers()
         const int peer =
             accept4(static_cast<int>(_listener->socket()), nullptr, nullptr, SOCK_CLOEXEC | SOCK_NONBLOCK);
         if (peer < 0) {
-            if (errno == EMFILE || errno == ENFILE || errno == ENOMEM || errno == ENOBUFS)
-                pauseListening(errno);
+            const int error = errno;
+            const bool isShort = error == EMFILE || error == ENFILE || error == ENOMEM || error == ENOBUFS;
+            if (isShort && isPeerWaiting()) // the descriptor is wanted before a peer is looked for
+                pauseListening(error);
             return; // else there are no more, or this one has gone
         }
+        if (std::exchange(_isShortOfDescriptors, false))
+            systemLog(Priority::warning, "Message port %s: peers are accepted again", _name.c_str());
         auto socket = std::make_unique<QLocalSocket>();
         if (!socket->setSocketDescriptor(peer)) {
             ::close(peer);
@@ -137,16 +143,20 @@ void LocalSocketPort::acceptPeers()
     }
 }
 
+bool LocalSocketPort::isPeerWaiting() const
+{
+    pollfd listener{.fd = static_cast<int>(_listener->socket()), .events = POLLIN, .revents = 0};
+    return ::poll(&listener, 1, 0) > 0;
+}
+
 void LocalSocketPort::pauseListening(int error)
 {
     // The peer goes on waiting. Without a pause the event loop would do nothing but try.
-    systemLog(Priority::error, "Message port %s: a peer has to wait: %s", _name.c_str(),
-        std::strerror(error)); // NOLINT(concurrency-mt-unsafe)
+    if (!std::exchange(_isShortOfDescriptors, true))
+        systemLog(Priority::error, "Message port %s: a peer has to wait: %s", _name.c_str(),
+            std::strerror(error)); // NOLINT(concurrency-mt-unsafe)
     _listener->setEnabled(false);
-    QTimer::singleShot(kPause, _listener.get(), [this] {
-        systemLog(Priority::warning, "Message port %s: listening again", _name.c_str());
-        _listener->setEnabled(true);
-    });
+    QTimer::singleShot(kPause, _listener.get(), [this] { _listener->setEnabled(true); });
 }
 
 bool LocalSocketPort::isWelcome(const QLocalSocket& socket) const

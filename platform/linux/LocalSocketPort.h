@@ -15,10 +15,10 @@ class QLocalSocket;
 namespace orvex {
 
 // The receiving end of a message channel: a socket file in the port directory, and any number of peers up to
-// a limit, all of them this user or root. Messages of one peer keep their order. Beyond the limit a new peer
-// takes the place of the one that has been idle for longest, first of all one that never said anything; only
-// when all of them are talking it is refused. The messages that have come in part are bounded as a whole: the
-// one that has waited for longest goes, and its peer.
+// a limit, all of them this user or root. Messages of one peer keep their order. A new peer
+// beyond the limit replaces one that never sent a message, else the one that is idle for longest; it is
+// refused only while all are active. Partial messages are bounded in all: the one that has waited for longest
+// goes, and its peer.
 class LocalSocketPort final : public LocalPort {
 public:
     enum class ListenResult { listening, alreadyExists, failed };
@@ -41,6 +41,7 @@ public:
 private:
     void acceptPeers();
     bool isWelcome(const QLocalSocket& socket) const;
+    bool isPeerWaiting() const;
     void pauseListening(int error);
     // Where all places are taken, makes one by closing the connection that is idle for longest.
     bool makeRoom();
@@ -53,6 +54,7 @@ private:
     PortConnection::Receiver _receiver;
     std::function<void()> _invalidationCallback;
     std::unique_ptr<QSocketNotifier> _listener; // null when the port is not valid
+    bool _isShortOfDescriptors = false;
     std::vector<std::unique_ptr<PortConnection>> _connections;
 };
 

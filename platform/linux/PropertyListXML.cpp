@@ -6,6 +6,7 @@
 
 #include "Array.h"
 #include "Dictionary.h"
+#include "VisibleText.h"
 
 #include <algorithm>
 #include <array>
@@ -34,10 +35,9 @@ DictionaryRef withKeysOfXML(const DictionaryRef& dictionary)
 
 std::string dateOf(Date date)
 {
-    std::string text = dateText(date); // 2024-03-05 14:07:09 +0000
-    text[text.find(' ')] = 'T';
-    text.replace(text.find(' '), std::string::npos, "Z");
-    return text;
+    const std::string text = dateText(date); // 2024-03-05 14:07:09 +0000
+    const std::size_t time = text.find(' ') + 1;
+    return text.substr(0, time - 1) + 'T' + text.substr(time, text.find(' ', time) - time) + 'Z';
 }
 
 // Goes through the value without recursion: a list may be nested to any depth.
@@ -233,9 +233,7 @@ private:
             path += '/';
             path += container.entries ? container.entry(i).key : std::to_string(i);
         }
-        const auto isControl = [](unsigned char character) { return character < 0x20 || character == 0x7F; };
-        std::ranges::replace_if(path, isControl, '?'); // one line, whatever the keys hold
-        _fault = "the value at " + (path.empty() ? "/" : path) + ' ' + what;
+        _fault = "the value at " + (path.empty() ? "/" : visibleText(path)) + ' ' + what;
     }
 
     const TextSink& _sink;

@@ -9,8 +9,6 @@ namespace orvex {
 
 namespace {
 
-constexpr std::size_t kLongest = 4096;
-
 bool isPlain(char character)
 {
     return character >= ' ' && character <= '~';
@@ -36,9 +34,9 @@ std::string visible(std::string_view bytes, char32_t character)
 
 } // namespace
 
-std::string visibleText(std::string_view text)
+std::string visibleText(std::string_view text, std::size_t longest)
 {
-    if (text.size() <= kLongest && std::ranges::all_of(text, isPlain))
+    if (text.size() <= longest && std::ranges::all_of(text, isPlain))
         return std::string(text);
     std::string result;
     while (!text.empty()) {
@@ -46,7 +44,7 @@ std::string visibleText(std::string_view text)
         const auto byte = static_cast<unsigned char>(text.front());
         const std::string next =
             length > 0 ? visible(text.substr(0, length), character) : orvex::text("\\x%02x", byte);
-        if (result.size() + next.size() > kLongest)
+        if (next.size() > longest - result.size())
             return result += "…";
         result += next;
         text.remove_prefix(std::max<std::size_t>(length, 1));

@@ -5,11 +5,12 @@
 
 namespace orvex {
 
-// A text that a peer or a file chose, fit for a terminal, the system log or the title of a window: nothing in
-// it moves the cursor, ends the line or turns the direction of writing. Control characters and bytes that are
-// not UTF-8 become "\n", "\t" or "\x1b"; the controls of bidirectional text and the separators of lines and
-// paragraphs become
-// "\u202e". Of a text longer than 4 KB the beginning is left, and "…".
-std::string visibleText(std::string_view text);
+inline constexpr std::size_t kLongestVisibleText = 4096;
+
+// Makes a text from a peer or a file safe to show on a terminal, in the log or in a title. Control characters
+// and bytes that are not UTF-8 become escapes such as "\n" or "\x1b"; embeddings, overrides and isolates of
+// bidirectional text and the separators of lines and paragraphs become "\u202e" and the like. A longer text
+// is cut and ends in "…".
+std::string visibleText(std::string_view text, std::size_t longest = kLongestVisibleText);
 
 } // namespace orvex

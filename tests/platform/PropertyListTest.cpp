@@ -162,7 +162,7 @@ TEST(PropertyList, NamesTheValueThatHasNoXMLForm)
         std::string fault;
     } cases[] = {
         {Value(), "the value at / is null"},
-        {Array::make({1, Dictionary::make({{"a\n", Value()}})}), "the value at /1/a? is null"},
+        {Array::make({1, Dictionary::make({{"a\n", Value()}})}), "the value at /1/a\\n is null"},
         {holder, "the value at /a/1/0/0 holds itself"},
         {Array::make({Date{253'402'300'800}}), std::string("the value at /0 ") + date},
         {Array::make({Date{-62'135'596'801}}), std::string("the value at /0 ") + date},

@@ -205,7 +205,7 @@ TEST_F(LiveSession, EndsInTimeWhateverStandsStill)
         Program shell(own, "/bin/sh",
             {"-c", QString::fromStdString(line), "sh", program, QString::fromStdString(own.path("file"))});
         EXPECT_EQ(shell.waitForEnd(), status) << name;
-        EXPECT_LT(std::chrono::steady_clock::now() - start, 2700ms) << name;
+        EXPECT_LT(std::chrono::steady_clock::now() - start, 10s) << name;
         EXPECT_EQ(shell.errors(), errors) << name;
     }
 }

@@ -22,8 +22,9 @@ TEST(Recorder, SaysOnceThatAMessageIsTooLongAndGoesOn)
         recorder.reportCut();
     }
     EXPECT_EQ(testing::internal::GetCapturedStderr(),
-        "koratd: a message of 262145 bytes is too long for the recording, which has the first 262144\n"
-        "koratd: recorded only the beginning of 2 messages; a replay leaves them out\n");
+        "koratd: a message of 262145 bytes is too long for the recording; only its first 262144 bytes were "
+        "written\n"
+        "koratd: 2 messages were cut in the recording; a replay skips them\n");
     const auto reader = CaptureReader::open(file.path);
     for (const std::size_t length : {262'144U, 5U}) {
         ASSERT_EQ(reader->next(), CaptureReader::Status::message) << reader->error();

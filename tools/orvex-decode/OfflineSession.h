@@ -18,6 +18,7 @@ public:
     Value display() { return _generator->generateLogUsingState(_state); }
     // What a snapshot of the session stores.
     ArrayRef saveContents() const { return _generator->getSaveContentsFromState(_state); }
+    std::size_t droppedRawBytes() const { return _generator->droppedRawBytes(); }
 
     std::size_t messageCount() const { return _messageCount; }
 

@@ -18,14 +18,15 @@ bool complain(const std::string& message)
 namespace {
 bool writeFile(const std::string& path, const std::function<void(std::ostream&)>& write)
 {
-    const auto [file, error] = openOutputFile(path);
-    if (!file)
-        return complain(path + ": " + error);
-    FileBuffer buffer(*file);
-    std::ostream stream(&buffer);
-    write(stream);
-    stream.flush();
-    return stream ? true : complain(path + ": " + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
+    auto [file, error] = openOutputFile(path);
+    if (file) {
+        FileBuffer buffer(*file);
+        std::ostream stream(&buffer);
+        write(stream);
+        stream.flush();
+        error = closeOutputFile(std::move(file));
+    }
+    return error.empty() || complain(path + ": " + error);
 }
 } // namespace
 

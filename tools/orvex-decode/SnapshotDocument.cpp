@@ -70,7 +70,7 @@ void SnapshotDocument::decodeAnew(std::unique_ptr<LogGenerator> generator)
     }
 }
 
-std::string SnapshotDocument::tree() const
+std::string SnapshotDocument::tree(std::size_t longestText) const
 {
     NumberedRows rows{{"Timestamp", _timestamp}, {"Description", _description}};
     for (const Entry& entry : _entries) {
@@ -82,7 +82,7 @@ std::string SnapshotDocument::tree() const
         }
         rows.add(entry.description, shown);
     }
-    return DisplayTreePrinter::text(*treeOf(rows.dictionary()));
+    return DisplayTreePrinter::text(*treeOf(rows.dictionary()), longestText);
 }
 
 void SnapshotDocument::writeJson(JsonWriter& json) const

@@ -20,7 +20,8 @@ public:
     void decodeAnew(std::unique_ptr<LogGenerator> generator);
 
     // The snapshot as a tree, its entries beside each other.
-    std::string tree() const;
+    // The tree as text, names and values cut to the longest.
+    std::string tree(std::size_t longestText = std::string::npos) const;
     // {"timestamp": …, "description": …, "entries": [{"description": …, "date": …, "display": TREE,
     // "decoded": TREE}, …]}, the trees as those of captures. An entry without display has none, one without
     // messages is not decoded.

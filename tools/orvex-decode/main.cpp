@@ -22,6 +22,7 @@
 #include "TextFormat.h"
 
 #include <iostream>
+#include <unistd.h>
 
 using namespace orvex;
 
@@ -56,6 +57,12 @@ bool feed(OfflineSession& session, const std::string& path, const DecodeOptions&
         reader->error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
 }
 
+// A terminal gets the beginning of a text that is too long for it, a file or another program all of it.
+std::size_t longestText(const DecodeOptions& options)
+{
+    return !options.outputFile && ::isatty(STDOUT_FILENO) ? kLongestVisibleText : std::string::npos;
+}
+
 bool print(const Value& display, const DecodeOptions& options)
 {
     NodesByPath paths;
@@ -63,7 +70,7 @@ bool print(const Value& display, const DecodeOptions& options)
     return printDocument(
         [&](std::ostream& stream) {
             if (options.format == DecodeOptions::Format::tree) {
-                stream << DisplayTreePrinter::text(*tree);
+                stream << DisplayTreePrinter::text(*tree, longestText(options));
                 return;
             }
             JsonWriter json(stream);
@@ -134,6 +141,9 @@ bool save(const OfflineSession& session, Date begun, const DecodeOptions& option
 {
     const Snapshot snapshot{dateText(begun), session.saveContents(), options.description};
     const std::string fault = writeSnapshot(snapshot, *options.snapshotFile);
+    if (const std::size_t dropped = session.droppedRawBytes(); fault.empty() && dropped > 0)
+        complain(text("%s: lacks the oldest %zu bytes of raw messages; a snapshot holds up to %zu MiB",
+            options.snapshotFile->c_str(), dropped, RawPackets::kLimit >> 20));
     return fault.empty() || complain(fault);
 }
 
@@ -166,11 +176,11 @@ bool extractDlf(const SnapshotDocument& document, const DecodeOptions& options)
         *options.dlfFile, {reinterpret_cast<const char*>(document.dlf()->data()), document.dlf()->size()});
 }
 
-void write(const std::vector<SnapshotDocument>& documents, DecodeOptions::Format format, std::ostream& stream)
+void write(const std::vector<SnapshotDocument>& documents, const DecodeOptions& options, std::ostream& stream)
 {
-    if (format == DecodeOptions::Format::tree) {
+    if (options.format == DecodeOptions::Format::tree) {
         for (const SnapshotDocument& document : documents)
-            stream << document.tree();
+            stream << document.tree(longestText(options));
         return;
     }
     JsonWriter json(stream);
@@ -208,8 +218,8 @@ int showSnapshots(const DecodeOptions& options)
     }
     if (documents.empty())
         return kFailure;
-    isGood = printDocument([&](std::ostream& stream) { write(documents, options.format, stream); }, options)
-        && isGood;
+    isGood =
+        printDocument([&](std::ostream& stream) { write(documents, options, stream); }, options) && isGood;
     return isGood ? 0 : kFailure;
 }
 

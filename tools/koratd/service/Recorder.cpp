@@ -24,7 +24,7 @@ void Recorder::write(ByteView message, Microseconds time)
     if (!_file)
         return;
     if (message.size() > PcapWriter::kLongestPacket && ++_cut == 1)
-        report("a message of %zu bytes is too long for the recording, which has the first %zu",
+        report("a message of %zu bytes is too long for the recording; only its first %zu bytes were written",
             message.size(), PcapWriter::kLongestPacket);
     _file->write(message, time);
     stopAfterError();
@@ -33,7 +33,7 @@ void Recorder::write(ByteView message, Microseconds time)
 void Recorder::reportCut() const
 {
     if (_cut > 0)
-        report("recorded only the beginning of %zu messages; a replay leaves them out", _cut);
+        report("%zu messages were cut in the recording; a replay skips them", _cut);
 }
 
 void Recorder::flush()
