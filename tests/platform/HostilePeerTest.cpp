@@ -106,6 +106,8 @@ TEST_F(HostilePeerTest, PortListensAgainWhenThereAreDescriptors)
     ASSERT_TRUE(waitUntil([&] { return received == "1:early "; }));
     turnFor(50ms); // it has gone
     received.clear();
+    systemLog(Priority::error, "early");
+    log.take();
     std::deque<int> descriptors;
     rlimit limit{};
     getrlimit(RLIMIT_NOFILE, &limit);
