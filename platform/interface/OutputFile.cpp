@@ -103,17 +103,17 @@ OutputFile reopen(const Descriptor& found, bool isRedirection)
 
 } // namespace
 
-OutputFile openOutputFile(const std::string& given)
+OutputFile openOutputFile(const std::string& path)
 {
-    std::string path = given;
+    std::string place = path;
     for (int links = 0; links <= kMostLinks; ++links) {
         Descriptor created(::open(
-            path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC | O_NOCTTY, kOwnerOnly));
+            place.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC | O_NOCTTY, kOwnerOnly));
         if (created.isOpen())
             return streamOf(created);
         if (errno != EEXIST)
             return fail();
-        const Descriptor found(::open(path.c_str(), O_PATH | O_NOFOLLOW | O_CLOEXEC));
+        const Descriptor found(::open(place.c_str(), O_PATH | O_NOFOLLOW | O_CLOEXEC));
         struct stat status { };
         if (!found.isOpen() || ::fstat(found.number(), &status) != 0)
             return fail();
@@ -122,10 +122,10 @@ OutputFile openOutputFile(const std::string& given)
         if (!isTrusted(status))
             return fail("a link that belongs to another user");
         if (isLinkToOpenFile(found)) {
-            const Descriptor behind(::open(path.c_str(), O_PATH | O_CLOEXEC));
+            const Descriptor behind(::open(place.c_str(), O_PATH | O_CLOEXEC));
             return behind.isOpen() ? reopen(behind, true) : fail();
         }
-        path = targetOf(found, path);
+        place = targetOf(found, place);
     }
     errno = ELOOP;
     return fail();

@@ -11,9 +11,11 @@ public:
 
 protected:
     void paintEvent(QPaintEvent*) override { }
-    // Keys that its widgets leave over are the screen's.
+    // Keys that its widgets leave over are the screen's, not the button's.
+    // NOLINTBEGIN(bugprone-parent-virtual-call)
     void keyPressEvent(QKeyEvent* event) override { QWidget::keyPressEvent(event); }
     void keyReleaseEvent(QKeyEvent* event) override { QWidget::keyReleaseEvent(event); }
+    // NOLINTEND(bugprone-parent-virtual-call)
 };
 
 } // namespace orvex

@@ -21,6 +21,7 @@
 #include "Snapshot.h"
 #include "TextFormat.h"
 
+#include <filesystem>
 #include <iostream>
 #include <unistd.h>
 
@@ -93,7 +94,7 @@ std::string conflictOf(const DecodeOptions& options)
         inputs.push_back({"the input " + capture, capture});
     const std::string resources = resourcesOf(options);
     for (const std::string& name : FileResources(resources).propertyListPaths())
-        inputs.push_back({"the template " + name, resources + '/' + name});
+        inputs.push_back({"the template " + name, std::filesystem::path(resources) / name});
 
     std::vector<FileInUse> outputs;
     if (!options.outputFile)
