@@ -26,7 +26,9 @@ GSMNeighbhorMeasurements::GSMNeighbhorMeasurements(ClassDictionary& dict, CodeDi
 void GSMNeighbhorMeasurements::update(const LogCode_0xD00E& report)
 {
     clearSection();
-    listOf(report.neighbors(), printRecord); // shown nowhere: the list on screen has always been empty
+    RowList nowhere(nullptr); // the list on screen has always been empty
+    for (const auto& neighbor : report.neighbors())
+        printRecord(nowhere.next(), neighbor);
 }
 
 } // namespace orvex
