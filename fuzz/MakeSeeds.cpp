@@ -75,7 +75,7 @@ private:
         Messages messages;
         while (messages.size() < count) {
             korat::LogMessage message = scenario->next().message;
-            if (message.code.value_or(0) < korat::kExtraCodes)
+            if (message.code.value_or(0) < korat::kExtraCodeBase)
                 messages.push_back(std::move(message.bytes));
         }
         return messages;

@@ -7,12 +7,9 @@
 #include <functional>
 #include <memory>
 #include <optional>
-#include <span>
 #include <string>
 
 namespace orvex {
-
-using ByteView = std::span<const std::uint8_t>;
 
 // One end of a message channel between processes.
 class MessagePort {

@@ -7,7 +7,7 @@ namespace {
 
 TEST(PacketWriter, ValuesStayInTheirFieldAndLeaveTheirNeighboursAlone)
 {
-    PacketWriter packet(kExtraCodes + 2, Microseconds{0x0001020304050607}, 13 + 256);
+    PacketWriter packet(kExtraCodeBase + 2, Microseconds{0x0001020304050607}, 13 + 256);
     packet.u8(13, 300);
     packet.u8(14, -5);
     packet.u16(15, 70000);

@@ -10,8 +10,8 @@ LogMessage simFilesMessage(Microseconds time, const DictionaryRef& files);
 LogMessage cellMonitorMessage(Microseconds time, const ArrayRef& cells);
 LogMessage pdpContextsMessage(Microseconds time, const ArrayRef& contexts);
 
-inline constexpr LogCode kSimFilesCode = kExtraCodes + 0;
-inline constexpr LogCode kCellMonitorCode = kExtraCodes + 1;
-inline constexpr LogCode kPDPContextsCode = kExtraCodes + 2;
+inline constexpr LogCode kSimFilesCode = kExtraCodeBase + 0;
+inline constexpr LogCode kCellMonitorCode = kExtraCodeBase + 1;
+inline constexpr LogCode kPDPContextsCode = kExtraCodeBase + 2;
 
 } // namespace orvex::korat

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "LogCode.h"
 #include "Value.h"
 
 #include <chrono>
@@ -7,11 +8,6 @@
 #include <optional>
 
 namespace orvex::korat {
-
-// A log code as clients subscribe to it: the 16-bit code of a baseband packet, or an extra code above
-// kExtraCodes.
-using LogCode = std::uint32_t;
-inline constexpr LogCode kExtraCodes = 0xFF0000;
 
 // The time in a packet's header: microseconds since 1970-01-01 00:00:00 UTC.
 using Microseconds = std::chrono::microseconds;

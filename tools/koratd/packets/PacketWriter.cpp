@@ -27,7 +27,7 @@ std::int64_t clampedTo(std::int64_t value)
 PacketWriter::PacketWriter(LogCode code, Microseconds time, std::size_t length)
     : _message{code, Bytes(std::max(length, kHeaderLength))}
 {
-    u8(0, code >= kExtraCodes ? kExtraPacket : kBasebandPacket);
+    u8(0, code >= kExtraCodeBase ? kExtraPacket : kBasebandPacket);
     u16(1, static_cast<std::int64_t>(_message.bytes.size()) - 1);
     u16(3, code & 0xFFFF);
     littleEndian(5, 8, static_cast<std::uint64_t>(time.count()));

@@ -20,7 +20,7 @@ std::optional<LogCode> codeOf(ByteView bytes)
     const bool isPacket = message.isComplete()
         && (message.logType() == MessageFrame::kTypeBaseband
             || message.logType() == MessageFrame::kTypeExtra);
-    return isPacket ? std::optional(static_cast<LogCode>(message.logCode())) : std::nullopt;
+    return isPacket ? std::optional(message.logCode()) : std::nullopt;
 }
 } // namespace
 

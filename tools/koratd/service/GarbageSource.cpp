@@ -2,25 +2,22 @@
 
 #include "packets/PacketWriter.h"
 
+#include "MessageFrame.h"
+
 #include <algorithm>
 
 namespace orvex::korat {
 
 namespace {
 constexpr int kLongestRandom = 400;
-constexpr std::uint8_t kPrefixMark = 0x81; // such a message starts with two bytes that receivers remove
-constexpr std::size_t kPrefixLength = 2;
-constexpr std::uint8_t kExtraPacket = 255;
-constexpr unsigned kPropertyListCodes = 3;
+constexpr LogCode kPropertyListCodes = 3;
 } // namespace
 
 bool isReadAsPropertyList(const Bytes& message)
 {
-    if (message.size() < PacketWriter::kHeaderLength)
-        return false;
-    const std::size_t start = message[0] == kPrefixMark ? kPrefixLength : 0;
-    const unsigned code = message[start + 3] | static_cast<unsigned>(message[start + 4]) << 8;
-    return message[start] == kExtraPacket && code < kPropertyListCodes;
+    const MessageFrame frame(message);
+    return frame.isComplete() && frame.logType() == MessageFrame::kTypeExtra
+        && frame.logCode() - kExtraCodeBase < kPropertyListCodes;
 }
 
 Bytes GarbageSource::pass(Bytes message)

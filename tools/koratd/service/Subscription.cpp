@@ -26,7 +26,7 @@ Subscription::Subscription(const Dictionary& startCommand)
         }
     };
     add(telephony::kSetMarlinLogCodes, 0);
-    add(telephony::kSetKoratExtraCodes, kExtraCodes);
+    add(telephony::kSetKoratExtraCodes, kExtraCodeBase);
 }
 
 bool Subscription::isStartCommand(const Dictionary& command)

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "MessagePort.h"
+#include "Value.h"
 
 #include <cstddef>
 #include <cstdint>

@@ -1,6 +1,8 @@
 #pragma once
 
-#include "MessagePort.h"
+#include "LogCode.h"
+
+#include "Value.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -16,16 +18,7 @@ namespace orvex {
 //   13    ...   payload
 using Packet = ByteView;
 
-// The 16-bit code of a baseband packet, or kExtraCodeBase plus the 16-bit code of an extra packet.
-using LogCode = std::int32_t;
-
 inline constexpr std::size_t kPacketHeaderLength = 13;
-
-// Extra packets come from the telephony service, not from the baseband. Each carries a property list.
-inline constexpr LogCode kExtraCodeBase = 0xFF0000;
-inline constexpr LogCode kExtraCodeSimFiles = 0xFF0000;
-inline constexpr LogCode kExtraCodeCellMonitorList = 0xFF0001;
-inline constexpr LogCode kExtraCodePDPContexts = 0xFF0002;
 
 // The only place that touches raw bytes. Little-endian reads at an offset; a read that does not lie wholly
 // inside the packet yields 0.

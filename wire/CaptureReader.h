@@ -1,6 +1,6 @@
 #pragma once
 
-#include "MessagePort.h"
+#include "Value.h"
 
 #include <chrono>
 #include <memory>

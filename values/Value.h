@@ -6,6 +6,7 @@
 #include <concepts>
 #include <cstdint>
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
 #include <variant>
@@ -17,6 +18,7 @@ class Array;
 class Dictionary;
 
 using Bytes = std::vector<std::uint8_t>;
+using ByteView = std::span<const std::uint8_t>;
 using ArrayRef = std::shared_ptr<Array>;
 using DictionaryRef = std::shared_ptr<Dictionary>;
 using BytesRef = std::shared_ptr<Bytes>;

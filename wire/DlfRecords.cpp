@@ -1,6 +1,7 @@
 #include "DlfRecords.h"
 
 #include "MTLDLFAddVersionReport.h"
+#include "MessageFrame.h"
 
 #include <algorithm>
 
@@ -10,8 +11,8 @@ namespace {
 
 constexpr std::size_t kCodeOffset = 2;
 constexpr std::size_t kTimeOffset = 4;
-constexpr std::uint8_t kPrefixMark = 0x81;
-constexpr std::size_t kPrefixLength = 2;
+constexpr std::uint8_t kPrefixMark = MessageFrame::kPrefixMark;
+constexpr std::size_t kPrefixLength = MessageFrame::kPrefixLength;
 constexpr std::uint16_t kVersionReportCode = 0x1FFD;
 
 constexpr int kDepth = 4; // records that are looked at before a reading is chosen
@@ -46,7 +47,7 @@ bool isVersionReport(PacketReader header)
 
 bool isLogType(std::uint8_t byte)
 {
-    return byte == 1 || byte == 255;
+    return byte == MessageFrame::kTypeBaseband || byte == MessageFrame::kTypeExtra;
 }
 
 } // namespace

@@ -1,17 +1,13 @@
 #include "RawMessages.h"
 
-#include "PacketReader.h"
+#include "MessageFrame.h"
 
 namespace orvex {
 
-namespace {
-constexpr std::uint8_t kPrefixMark = 0x81;
-constexpr std::size_t kPrefixLength = 2;
-} // namespace
-
 std::optional<ByteView> RawMessages::next()
 {
-    const std::size_t prefix = !_rest.empty() && _rest[0] == kPrefixMark ? kPrefixLength : 0;
+    const std::size_t prefix =
+        !_rest.empty() && _rest[0] == MessageFrame::kPrefixMark ? MessageFrame::kPrefixLength : 0;
     const std::size_t length = prefix + 1 + PacketReader(_rest).u16(prefix + 1);
     if (length < prefix + kPacketHeaderLength || length > _rest.size())
         return std::nullopt;

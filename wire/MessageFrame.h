@@ -11,6 +11,9 @@ class MessageFrame {
 public:
     static constexpr std::uint8_t kTypeBaseband = 1;
     static constexpr std::uint8_t kTypeExtra = 255;
+    // The first byte of a message that has a prefix before its packet, and the prefix's length.
+    static constexpr std::uint8_t kPrefixMark = 0x81;
+    static constexpr std::size_t kPrefixLength = 2;
 
     explicit MessageFrame(ByteView message)
         : _isComplete(message.size() >= kPacketHeaderLength)
@@ -25,9 +28,6 @@ public:
     LogCode logCode() const { return _packet.u16(3) | (logType() == kTypeExtra ? kExtraCodeBase : 0); }
 
 private:
-    static constexpr std::uint8_t kPrefixMark = 0x81;
-    static constexpr std::size_t kPrefixLength = 2;
-
     bool _isComplete;
     PacketReader _packet;
 };
