@@ -50,7 +50,7 @@ protected:
         CodeDictionary& codeDict);
 
     // The bound dictionary, to write into; a writer over nothing while none is bound.
-    Rows rows() const { return Rows(_sectionRef.dictionary.get()); }
+    RowWriter rows() const { return RowWriter(_sectionRef.dictionary.get()); }
     // The bound array; null while none is bound.
     Array* array() const { return _sectionRef.array.get(); }
     // The two array operations on the bound array, if there is one.
@@ -64,7 +64,7 @@ protected:
         RowList list(array());
         fill(list);
     }
-    // The same with one row dictionary a record, written by print(Rows&, record).
+    // The same with one row dictionary a record, written by print(RowWriter&, record).
     template <typename Records, typename Printer>
     void refillSection(const Records& records, Printer print) const
     {

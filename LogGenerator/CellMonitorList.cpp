@@ -16,20 +16,20 @@ namespace {
 
 constexpr std::int16_t kNotMeasured = 32767;
 
-void printLevel(Rows& row, const char* name, std::int32_t number, int unitsPerStep, const char* unit)
+void printLevel(RowWriter& row, const char* name, std::int32_t number, int unitsPerStep, const char* unit)
 {
     const auto steps = static_cast<std::int16_t>(number);
     if (steps == kNotMeasured)
-        row.set(name, "");
+        row.setText(name, "");
     else
-        row.print(name, "%d%s", steps * unitsPerStep, unit);
+        row.setText(name, "%d%s", steps * unitsPerStep, unit);
 }
 
-void printNumber(Rows& row, const char* name, const CellEntry& entry, std::int32_t number)
+void printNumber(RowWriter& row, const char* name, const CellEntry& entry, std::int32_t number)
 {
     switch (entry.form) {
-    case CellNumber::whole: row.print(name, "%d", number); break;
-    case CellNumber::low16Bits: row.print(name, "%d", static_cast<std::uint16_t>(number)); break;
+    case CellNumber::whole: row.setText(name, "%d", number); break;
+    case CellNumber::low16Bits: row.setText(name, "%d", static_cast<std::uint16_t>(number)); break;
     case CellNumber::level: printLevel(row, name, number, 1, entry.unit); break;
     case CellNumber::levelBy2: printLevel(row, name, number, 2, entry.unit); break;
     }
@@ -53,7 +53,7 @@ std::optional<std::int32_t> CellRecord::number(const char* key) const
 }
 
 void printCell(
-    Rows& row, const CellRecord& cell, std::span<const CellEntry> entries, const char* sectionInMessage)
+    RowWriter& row, const CellRecord& cell, std::span<const CellEntry> entries, const char* sectionInMessage)
 {
     for (const CellEntry& entry : entries) {
         const auto number = cell.number(entry.key);

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "PacketReader.h"
-#include "Rows.h"
+#include "RowWriter.h"
 
 #include "Array.h"
 #include "Dictionary.h"
@@ -52,7 +52,7 @@ struct CellEntry {
 // Writes the rows of a cell's entries. An entry that is no number leaves its rows as they are, with the log
 // line "SECTION: Failed to retrieve NAME".
 void printCell(
-    Rows& row, const CellRecord& cell, std::span<const CellEntry> entries, const char* sectionInMessage);
+    RowWriter& row, const CellRecord& cell, std::span<const CellEntry> entries, const char* sectionInMessage);
 
 // The cell-monitor list (extra code 0xFF0001): a property list with an array of cell records from byte 13 on.
 class CellMonitorList {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LateText.h"
+#include "DeferredText.h"
 
 #include <span>
 
@@ -23,10 +23,10 @@ constexpr const char* textFor(int value, std::span<const EnumText> table, const 
 }
 
 // The same with a fallback that names the number.
-inline LateText textOrNumberFor(int value, std::span<const EnumText> table, PrintfFormat<int> fallback)
+inline DeferredText textOrNumberFor(int value, std::span<const EnumText> table, PrintfFormat<int> fallback)
 {
     const char* name = textFor(value, table, nullptr);
-    return name ? LateText(name) : LateText(fallback, value);
+    return name ? DeferredText(name) : DeferredText(fallback, value);
 }
 
 } // namespace orvex

@@ -44,8 +44,8 @@ void RRC_State::updateWithData(Packet packet, LogCode logCode)
     }
     const int state = LogCode_0xD0E0(packet).state();
     const char* name = textFor(state, kStates, "Unknown RRC Mode");
-    Rows row = rows();
-    row.set("State", name);
+    RowWriter row = rows();
+    row.setText("State", name);
     writeConsoleLine(
         text("Display Dict = %s, rrc mode = %d %s", describe(row.dictionary()).c_str(), state, name));
 }

@@ -2,7 +2,7 @@
 
 namespace orvex {
 
-Rows& RowList::next()
+RowWriter& RowList::next()
 {
     if (!_list)
         return _row;
@@ -10,7 +10,7 @@ Rows& RowList::next()
     Value& element = nextElement();
     if (!element.ownDictionary())
         element = Dictionary::make();
-    _row = Rows::anew(element.ownDictionary());
+    _row = RowWriter::anew(element.ownDictionary());
     return _row;
 }
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Rows.h"
+#include "RowWriter.h"
 
 #include "Array.h"
 
@@ -16,7 +16,7 @@ class RowList {
 public:
     explicit RowList(Array* list)
         : _list(list)
-        , _row(Rows::anew(nullptr))
+        , _row(RowWriter::anew(nullptr))
     {
     }
     ~RowList();
@@ -24,13 +24,13 @@ public:
     RowList& operator=(const RowList&) = delete;
 
     // The rows of the next record, to be written until the next call.
-    Rows& next();
+    RowWriter& next();
 
 private:
     Value& nextElement();
 
     Array* _list;
-    Rows _row;
+    RowWriter _row;
     std::size_t _count = 0;
 };
 

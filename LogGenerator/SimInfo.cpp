@@ -42,7 +42,7 @@ void SimInfo::updateWithData(Packet packet, LogCode logCode)
     if (logCode != kExtraCodeSimFiles)
         return;
     const DictionaryRef files = LogCode_0xFF0000(packet).files();
-    Rows row = rows();
+    RowWriter row = rows();
     for (const SimFile& file : kSimFiles) {
         if (files->contains(file.key))
             row.set(file.row, (*files)[file.key]);

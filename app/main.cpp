@@ -51,7 +51,7 @@ using namespace orvex;
 constexpr int kExitFailure = 1;
 constexpr int kExitWrongUsage = 2;
 
-void complain(const std::string& why)
+void printError(const std::string& why)
 {
     std::fprintf(stderr, "orvex: %s\n", visibleText(why).c_str());
 }
@@ -69,7 +69,7 @@ struct LinuxPlatform {
                     .ports = ports,
                     .telephony = telephony,
                     .generators = {.resources = resources, .clock = clock, .buildVersion = ORVEX_VERSION},
-                    .complain = complain},
+                    .printError = printError},
             .preferences = preferences};
     }
 
@@ -81,9 +81,9 @@ struct LinuxPlatform {
     IniPreferences preferences;
 };
 
-void complainOfNoDisplay()
+void printNoDisplay()
 {
-    complain("There is no display to connect to. Try 'orvex --console'.");
+    printError("There is no display to connect to. Try 'orvex --console'.");
 }
 
 bool displayIsNamed()
@@ -101,7 +101,7 @@ void endWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString&
 {
     if (type != QtFatalMsg)
         return;
-    complainOfNoDisplay();
+    printNoDisplay();
     std::_Exit(kExitFailure);
 }
 
@@ -131,7 +131,7 @@ int runConsole(int argc, char** argv, const std::string& resourceDirectory)
     int status = EXIT_SUCCESS;
     StandardOutput output([&status](int error) {
         if (error != EPIPE) {
-            complain(
+            printError(
                 std::string("standard output: ") + std::strerror(error)); // NOLINT(concurrency-mt-unsafe)
             status = kExitFailure;
         }
@@ -155,7 +155,7 @@ std::optional<QSize> windowSize(const CommandLine& commandLine)
 int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<int()>& body)
 {
     if (!displayIsNamed()) {
-        complainOfNoDisplay();
+        printNoDisplay();
         return kExitFailure;
     }
     const QtMessageHandler usualHandler = qInstallMessageHandler(endWithoutDisplay);
@@ -202,7 +202,7 @@ int showSnapshot(int argc, char** argv, const CommandLine& commandLine)
     const std::string& path = *commandLine.snapshot;
     const auto [snapshot, error] = readSnapshot(path);
     if (!snapshot) {
-        complain(error);
+        printError(error);
         return kExitFailure;
     }
     if (commandLine.action == CommandLine::Action::console) {
@@ -227,7 +227,7 @@ int main(int argc, char** argv)
     const CommandLine commandLine = CommandLine::parse(argumentTexts(argc, argv));
     switch (commandLine.action) {
     case CommandLine::Action::wrongUsage:
-        complain(commandLine.error + " Try 'orvex --help'.");
+        printError(commandLine.error + " Try 'orvex --help'.");
         return kExitWrongUsage;
     case CommandLine::Action::help: std::fputs(CommandLine::usage().c_str(), stdout); return EXIT_SUCCESS;
     case CommandLine::Action::version: std::puts("orvex " ORVEX_VERSION); return EXIT_SUCCESS;

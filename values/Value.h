@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Date.h"
-#include "LateText.h"
+#include "DeferredText.h"
 
 #include <concepts>
 #include <cstdint>
@@ -40,8 +40,8 @@ struct Set {
 // Scalars are held by value. Arrays, dictionaries and byte buffers are held by reference: copying a Value
 // that holds one shares it. A container of one's own is had from shallowCopy() and deepCopy() alone.
 //
-// A text may be given as a LateText. Nobody can tell: it is made by whoever reads it first. For its sake a
-// value is read by one thread at a time.
+// A text may be given as a DeferredText. Nobody can tell: it is made by whoever reads it first. For its sake
+// a value is read by one thread at a time.
 //
 // UIDs and sets come out of binary property lists alone. Nothing in Orvex makes use of them; they are kept so
 // that they are not taken for something else.
@@ -62,7 +62,7 @@ public:
         : _content(std::string(text))
     {
     }
-    Value(LateText text)
+    Value(DeferredText text)
         : _content(text)
     {
     }
@@ -94,8 +94,8 @@ public:
 
     Kind kind() const
     {
-        return std::holds_alternative<LateText>(_content) ? Kind::string
-                                                          : static_cast<Kind>(_content.index());
+        return std::holds_alternative<DeferredText>(_content) ? Kind::string
+                                                              : static_cast<Kind>(_content.index());
     }
     bool isNull() const { return kind() == Kind::null; }
 
@@ -121,12 +121,12 @@ public:
     Array* ownArray() const { return own(reference<ArrayRef>()); }
     Dictionary* ownDictionary() const { return own(reference<DictionaryRef>()); }
 
-    void set(LateText text)
+    void set(DeferredText text)
     {
-        if (auto* late = std::get_if<LateText>(&_content))
+        if (auto* late = std::get_if<DeferredText>(&_content))
             *late = text;
         else
-            _content.emplace<LateText>(text);
+            _content.emplace<DeferredText>(text);
     }
 
     // A container of its own kind holding the same elements; any other value as it is.
@@ -152,13 +152,13 @@ private:
     }
     void makeText() const
     {
-        if (const auto* late = std::get_if<LateText>(&_content))
+        if (const auto* late = std::get_if<DeferredText>(&_content))
             _content = late->text();
     }
 
     // In the order of Kind.
     mutable std::variant<std::monostate, std::string, std::int64_t, double, bool, Date, BytesRef, ArrayRef,
-        DictionaryRef, UID, Set, LateText>
+        DictionaryRef, UID, Set, DeferredText>
         _content;
 };
 

@@ -16,7 +16,7 @@ public:
     NoCapture(const std::string& path, const std::string& reason)
         : CaptureReader(path)
     {
-        breakOff(reason);
+        fail(reason);
     }
 
     Status next() override { return Status::broken; }

@@ -48,13 +48,13 @@ protected:
         _time = time;
         return Status::message;
     }
-    Status breakOff(const std::string& reason)
+    Status fail(const std::string& reason)
     {
         _error = _path + ": " + reason;
         return Status::broken;
     }
     // For the reason of another.
-    void breakOffAs(const CaptureReader& other) { _error = other._error; }
+    void failAs(const CaptureReader& other) { _error = other._error; }
 
 private:
     std::string _path;

@@ -15,7 +15,7 @@ DlfReader::DlfReader(const std::string& path, std::unique_ptr<RegularFile> file)
     , _file(std::move(file))
 {
     if (!isDlf()) {
-        breakOff("neither a pcap nor a DLF file");
+        fail("neither a pcap nor a DLF file");
         return;
     }
     _records.emplace(ByteView(), false);
@@ -59,10 +59,9 @@ CaptureReader::Status DlfReader::next()
     }
     if (!record) {
         if (!_file->error().empty())
-            return breakOff(_file->error());
+            return fail(_file->error());
         const std::size_t skipped = _records->skippedBytes();
-        return skipped == 0 ? Status::end
-                            : breakOff(text("%zu bytes that make no record were skipped", skipped));
+        return skipped == 0 ? Status::end : fail(text("%zu bytes that make no record were skipped", skipped));
     }
     _message.assign(1, record->logType.value_or(kLogTypeBaseband));
     _message.insert(_message.end(), record->bytes.begin(), record->bytes.end());

@@ -25,7 +25,7 @@ PcapReader::PcapReader(const std::string& path, RegularFile& file)
 {
     std::FILE* stream = file.openStream();
     if (!stream) {
-        breakOff(file.error());
+        fail(file.error());
         return;
     }
     std::array<char, PCAP_ERRBUF_SIZE> reason{};
@@ -33,12 +33,12 @@ PcapReader::PcapReader(const std::string& path, RegularFile& file)
         pcap_fopen_offline_with_tstamp_precision(stream, PCAP_TSTAMP_PRECISION_MICRO, reason.data());
     if (!opened) {
         std::fclose(stream);
-        breakOff(std::string("not a pcap file: ") + reason.data());
+        fail(std::string("not a pcap file: ") + reason.data());
         return;
     }
     _pcap = std::make_unique<Pcap>(opened);
     if (pcap_datalink(opened) != DLT_USER0) {
-        breakOff(text("its link type is %d; log messages have %d (USER0)", pcap_datalink(opened), DLT_USER0));
+        fail(text("its link type is %d; log messages have %d (USER0)", pcap_datalink(opened), DLT_USER0));
         _pcap.reset();
     }
 }
@@ -56,7 +56,7 @@ CaptureReader::Status PcapReader::next()
         if (result == PCAP_ERROR_BREAK)
             return Status::end;
         if (result != 1)
-            return breakOff(pcap_geterr(_pcap->handle));
+            return fail(pcap_geterr(_pcap->handle));
         if (header->caplen < header->len) {
             ++_incompletePackets;
             continue;

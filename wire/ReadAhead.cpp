@@ -60,7 +60,7 @@ void ReadAhead::takeBatch()
     // The thread leaves the reader alone from here on.
     _omissions = _reader->omissions();
     if (_batch.following == Status::broken)
-        breakOffAs(*_reader);
+        failAs(*_reader);
 }
 
 void ReadAhead::read()

@@ -22,7 +22,7 @@ constexpr EnumText kBandClasses[] = {
 };
 } // namespace
 
-LateText bandClassText(int bandClass)
+DeferredText bandClassText(int bandClass)
 {
     return textOrNumberFor(bandClass, kBandClasses, "[Bad Value %d]");
 }

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "LateText.h"
+#include "DeferredText.h"
 
 namespace orvex {
 
 // The text of a CDMA2000 band class, shared by 1x and EV-DO.
-LateText bandClassText(int bandClass);
+DeferredText bandClassText(int bandClass);
 
 } // namespace orvex

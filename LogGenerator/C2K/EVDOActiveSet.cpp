@@ -19,7 +19,7 @@ void EVDOActiveSet::decode(Packet packet, Dictionary&, const Publisher& publishe
     PilotList pilots;
     int index = 0;
     for (const auto& pilot : report.pilots())
-        pilots.add(index++, pilot.pn(), LateText(decibelText, pilot.strength()));
+        pilots.add(index++, pilot.pn(), DeferredText(decibelText, pilot.strength()));
     publisher.publish("kActiveSetPilots", pilots.rowsOrNone());
 }
 

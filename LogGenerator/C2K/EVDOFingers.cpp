@@ -23,7 +23,7 @@ void EVDOFingers::decode(Packet packet, Dictionary&, const Publisher& publisher)
     for (const auto& finger : report.fingers()) {
         ++index; // idle fingers keep their number
         if (!finger.isIdle())
-            fingers.add(index, finger.pn(), LateText(decibelText, finger.carrierToInterference()));
+            fingers.add(index, finger.pn(), DeferredText(decibelText, finger.carrierToInterference()));
     }
     publisher.publish("kFingerC2I", fingers.rowsOrNone());
 }

@@ -18,21 +18,21 @@ constexpr EnumText kDeviceStates[] = {{0, "Inactive [0]"}, {1, "Acquisition [1]"
 constexpr EnumText kSessionStates[] = {{0, "Closed [0]"}, {1, "AMP setup [1]"}, {2, "AT-initiated neg [2]"},
     {3, "Initiated neg [3]"}, {4, "Open [4]"}};
 
-LateText stateText(int value, std::span<const EnumText> states)
+DeferredText stateText(int value, std::span<const EnumText> states)
 {
     return textOrNumberFor(value, states, "[Reserved %d]");
 }
 
 // Antenna 1 and the transmitter are off outside access and connection, and their fields left over.
-LateText powerText(int dBm, bool isOn)
+DeferredText powerText(int dBm, bool isOn)
 {
-    return isOn ? LateText("%+d dBm", dBm) : LateText("N/A");
+    return isOn ? DeferredText("%+d dBm", dBm) : DeferredText("N/A");
 }
 
-LateText pnOffsetText(int offset)
+DeferredText pnOffsetText(int offset)
 {
-    return offset == LogCode_0x1183::kNoPNOffset ? LateText("Invalid Value")
-                                                 : LateText("%d × 64chips", offset);
+    return offset == LogCode_0x1183::kNoPNOffset ? DeferredText("Invalid Value")
+                                                 : DeferredText("%d × 64chips", offset);
 }
 
 } // namespace
@@ -46,7 +46,7 @@ void EVDOStatus::decode(Packet packet, Dictionary&, const Publisher& publisher)
     }
     const LogCode_0x1183 status(packet);
     const bool transmits = status.deviceState() >= kAccess;
-    publisher.print("kChannel", "%d", status.channel());
+    publisher.setText("kChannel", "%d", status.channel());
     publisher.publish("k1xEVDODeviceState", stateText(status.deviceState(), kDeviceStates));
     publisher.publish("kBandClass", bandClassText(status.bandClass()));
     publisher.publish("kRxAGC0", powerText(status.rxAGC0(), true));
@@ -54,8 +54,8 @@ void EVDOStatus::decode(Packet packet, Dictionary&, const Publisher& publisher)
     publisher.publish("kTxAGC", powerText(status.txAGC(), transmits));
     publisher.publish("kServingPNOffset", pnOffsetText(status.servingPNOffset()));
     publisher.publish("kSessionState", stateText(status.sessionState(), kSessionStates));
-    publisher.print("kUATI24", "0x%06x", status.uati24());
-    publisher.print("kColorCode", "%d", status.colorCode());
+    publisher.setText("kUATI24", "0x%06x", status.uati24());
+    publisher.setText("kColorCode", "%d", status.colorCode());
 }
 
 } // namespace orvex

@@ -32,19 +32,19 @@ constexpr EnumText kDeviceStates[] = {
 // Rows of what works in traffic alone.
 constexpr const char* kTrafficRows[] = {"k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1", "k1xTxAGC"};
 
-LateText deviceStateText(int state)
+DeferredText deviceStateText(int state)
 {
     return textOrNumberFor(state, kDeviceStates, "[Bad Value %d]");
 }
 
-LateText channelText(int channel)
+DeferredText channelText(int channel)
 {
-    return LateText("%d", channel);
+    return DeferredText("%d", channel);
 }
 
-LateText powerText(double dBm)
+DeferredText powerText(double dBm)
 {
-    return LateText("%+.2f dBm", dBm);
+    return DeferredText("%+.2f dBm", dBm);
 }
 
 std::string referenceText(double strength)
@@ -55,7 +55,7 @@ std::string referenceText(double strength)
 // A field that the packet does not hold leaves its row as it is.
 template <typename Field>
 void publishField(const Publisher& publisher, const char* internalKey, const std::optional<Field>& field,
-    LateText (*textOf)(Field))
+    DeferredText (*textOf)(Field))
 {
     if (field)
         publisher.publish(internalKey, textOf(*field));
@@ -79,7 +79,8 @@ void publishActiveSet(const LogCode_0x119C_ActiveSet& set, const Publisher& publ
         if (!pilot)
             break;
         const bool isReference = pilot->pn == set.referencePN();
-        pilots.add(index, pilot->pn, LateText(isReference ? referenceText : decibelText, pilot->strength));
+        pilots.add(
+            index, pilot->pn, DeferredText(isReference ? referenceText : decibelText, pilot->strength));
     }
     publisher.publish("k1xActiveSetInfo", pilots.rows());
 }

@@ -25,7 +25,7 @@ constexpr EnumText kRoamingIndicators[] = {
     {12, "Banner OFF [12]"},
 };
 
-LateText roamingText(int indicator)
+DeferredText roamingText(int indicator)
 {
     return textOrNumberFor(indicator, kRoamingIndicators, "ERI - %d");
 }
@@ -45,16 +45,16 @@ void OneXSystemIdentity::decode(Packet packet, Dictionary&, const Publisher& pub
     }
     publisher.publish("k1xRoamingHome", roamingText(identity.roamingIndicator()));
     if (identity.systemType() == LogCode_0x134F::kSystemTypeCDMA) {
-        publisher.print("kSystemId", "%d", identity.systemIdentity());
-        publisher.print("kNetworkId", "%d", identity.networkIdentity());
+        publisher.setText("kSystemId", "%d", identity.systemIdentity());
+        publisher.setText("kNetworkId", "%d", identity.networkIdentity());
     } else {
         for (const char* row : {"kSystemId", "kNetworkId"})
-            publisher.print(row, "(unknown system type %d)", identity.systemType());
+            publisher.setText(row, "(unknown system type %d)", identity.systemType());
     }
-    publisher.print("kPacketZoneId", "%d", identity.packetZoneIdentity());
+    publisher.setText("kPacketZoneId", "%d", identity.packetZoneIdentity());
     if (const auto base = identity.baseIdentity())
-        publisher.print("kBaseId", "%d", *base);
-    publisher.print("kProtocolRevision", "%d", identity.protocolRevision());
+        publisher.setText("kBaseId", "%d", *base);
+    publisher.setText("kProtocolRevision", "%d", identity.protocolRevision());
 }
 
 } // namespace orvex

@@ -15,7 +15,7 @@ PilotList::PilotList()
 {
 }
 
-void PilotList::add(int index, int pn, LateText content)
+void PilotList::add(int index, int pn, DeferredText content)
 {
     _rows->set(std::to_string(index) + ';' + std::to_string(pn), content);
     _isEmpty = false;

@@ -10,7 +10,7 @@ class PilotList {
 public:
     PilotList();
 
-    void add(int index, int pn, LateText content);
+    void add(int index, int pn, DeferredText content);
 
     const DictionaryRef& rows() const { return _rows; }
     // "(none)" in place of a list without pilots.

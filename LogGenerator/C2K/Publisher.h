@@ -26,10 +26,10 @@ public:
     void publish(const char* internalKey, const Value& value) const;
     // The text by a printf format.
     template <typename... Arguments>
-    void print(const char* internalKey, PrintfFormat<std::type_identity_t<Arguments>...> format,
+    void setText(const char* internalKey, PrintfFormat<std::type_identity_t<Arguments>...> format,
         Arguments... arguments) const
     {
-        publish(internalKey, LateText(format, arguments...));
+        publish(internalKey, DeferredText(format, arguments...));
     }
 
 private:

@@ -30,7 +30,7 @@ void RateCounter::publishRate(std::uint32_t sequenceDifference, std::int64_t sen
     const auto elapsed = static_cast<std::int32_t>(sequenceDifference); // sequence numbers wrap at 32 bits
     if (elapsed < 1)
         return;
-    _publisher.print(_names.rateKey, "%.2f kbps", static_cast<double>(sentDifference) / (elapsed * 1024.0));
+    _publisher.setText(_names.rateKey, "%.2f kbps", static_cast<double>(sentDifference) / (elapsed * 1024.0));
 }
 
 } // namespace orvex

@@ -31,7 +31,7 @@ void TrafficFER::addFrame(bool isErroneous)
         rate += faded;
     }
     _state.set(kRate, static_cast<double>(rate));
-    _publisher.print(kRow, "%.02f%%", percent(rate));
+    _publisher.setText(kRow, "%.02f%%", percent(rate));
 }
 
 void TrafficFER::endTraffic()
@@ -39,7 +39,7 @@ void TrafficFER::endTraffic()
     const auto rate = rateIn(_state);
     if (!rate)
         return;
-    _publisher.print(kRow, "%.02f%% (old)", percent(*rate));
+    _publisher.setText(kRow, "%.02f%% (old)", percent(*rate));
     _state.remove(kRate);
 }
 

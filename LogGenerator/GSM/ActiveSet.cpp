@@ -17,10 +17,10 @@ void ActiveSet::update(const LogCode_0x417A& report)
             if (!cells[i].isActive())
                 continue;
             const int ecNo = lookUpECNO(energies[i].ecIo());
-            Rows& row = list.next();
-            row.print("Scrambling Code", "%d", cells[i].primaryScramblingCode());
-            row.print("RSCP", "%d dB", report.rssi() + ecNo); // shown so, though it is dBm
-            row.print("Energy Per Chip", "%d dB", ecNo);
+            RowWriter& row = list.next();
+            row.setText("Scrambling Code", "%d", cells[i].primaryScramblingCode());
+            row.setText("RSCP", "%d dB", report.rssi() + ecNo); // shown so, though it is dBm
+            row.setText("Energy Per Chip", "%d dB", ecNo);
         }
     });
 }

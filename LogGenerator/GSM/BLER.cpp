@@ -4,11 +4,11 @@ namespace orvex {
 
 namespace {
 
-void printRecord(Rows& row, const LogCode_0x4116::TransportChannel& channel)
+void printRecord(RowWriter& row, const LogCode_0x4116::TransportChannel& channel)
 {
-    row.print("Transport Channel ID", "%d", channel.identity());
-    row.print("CRC Received", "%d", channel.received());
-    row.print("CRC Received in Error", "%d", channel.receivedInError());
+    row.setText("Transport Channel ID", "%d", channel.identity());
+    row.setText("CRC Received", "%d", channel.received());
+    row.setText("CRC Received in Error", "%d", channel.receivedInError());
 }
 
 } // namespace
@@ -20,8 +20,8 @@ BLER::BLER(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void BLER::update(const LogCode_0x4116& report)
 {
-    Rows row = rows();
-    row.print("Window Size", "%d", report.windowSize());
+    RowWriter row = rows();
+    row.setText("Window Size", "%d", report.windowSize());
     row.set("Transport Channels", listOf(report.transportChannels(), printRecord));
 }
 

@@ -4,10 +4,10 @@ namespace orvex {
 
 namespace {
 
-void printRecord(Rows& row, const LogCode_0x7150::PLMN& plmn)
+void printRecord(RowWriter& row, const LogCode_0x7150::PLMN& plmn)
 {
-    row.print("Mobile Country Code", "%d", plmn.mobileCountryCode());
-    row.print("Mobile Network Code", "%d", plmn.mobileNetworkCode());
+    row.setText("Mobile Country Code", "%d", plmn.mobileCountryCode());
+    row.setText("Mobile Network Code", "%d", plmn.mobileNetworkCode());
 }
 
 } // namespace

@@ -32,50 +32,51 @@ GPRSInformation::GPRSInformation(ClassDictionary& dict, CodeDictionary& codeDict
 
 void GPRSInformation::update(const LogCode_0x51F5& report)
 {
-    Rows row = rows();
-    row.set("Network Control Order", textFor(report.networkControlOrder(), kNetworkControlOrders, "Unknown"));
-    row.set("PFC Supported", textFor(report.packetFlowContext(), kPacketFlowContexts, "Unknown"));
-    row.set("Priority Access Threshold",
+    RowWriter row = rows();
+    row.setText(
+        "Network Control Order", textFor(report.networkControlOrder(), kNetworkControlOrders, "Unknown"));
+    row.setText("PFC Supported", textFor(report.packetFlowContext(), kPacketFlowContexts, "Unknown"));
+    row.setText("Priority Access Threshold",
         textFor(report.priorityAccessThreshold(), kPriorityAccessThresholds, "Unknown"));
 }
 
 void GPRSInformation::update(const LogCode_0x7135& report)
 {
-    rows().set(
+    rows().setText(
         "Network Operating Mode", textFor(report.networkOperatingMode(), kNetworkOperatingModes, "Unknown"));
 }
 
 void GPRSInformation::update(const LogCode_0x51F6& report)
 {
-    Rows row = rows();
-    row.set("T3192", textFor(report.t3192(), kT3192, "?? ms"));
-    row.set("Access Burst Type", report.hasLongAccessBurst() ? "11-bit format" : "8-bit format");
-    row.print("DRX Timer Max", "%d", report.drxTimerMax());
+    RowWriter row = rows();
+    row.setText("T3192", textFor(report.t3192(), kT3192, "?? ms"));
+    row.setText("Access Burst Type", report.hasLongAccessBurst() ? "11-bit format" : "8-bit format");
+    row.setText("DRX Timer Max", "%d", report.drxTimerMax());
 }
 
 void GPRSInformation::update(const LogCode_0x51FB& report)
 {
-    rows().print("PBCCH Present", "%d", report.pbcchPresent());
+    rows().setText("PBCCH Present", "%d", report.pbcchPresent());
 }
 
 void GPRSInformation::update(const LogCode_0x51FD& report)
 {
-    Rows row = rows();
-    row.print("Ext Measurement Order", "%d", report.extendedMeasurementOrder());
-    row.print("Packet PSI Status", "%d", report.packetPSIStatus());
-    row.set("Packet SI Status", report.hasPacketSIStatus() ? "Supported" : "Not Supported");
-    row.print("Count LR", "%d", report.countLowRepetition());
-    row.print("Count HR", "%d", report.countHighRepetition());
+    RowWriter row = rows();
+    row.setText("Ext Measurement Order", "%d", report.extendedMeasurementOrder());
+    row.setText("Packet PSI Status", "%d", report.packetPSIStatus());
+    row.setText("Packet SI Status", report.hasPacketSIStatus() ? "Supported" : "Not Supported");
+    row.setText("Count LR", "%d", report.countLowRepetition());
+    row.setText("Count HR", "%d", report.countHighRepetition());
 }
 
 void GPRSInformation::update(const LogCode_0x51F4& report)
 {
-    rows().set("SI13 Position", textFor(report.si13Position(), kSI13Positions, "Unknown"));
+    rows().setText("SI13 Position", textFor(report.si13Position(), kSI13Positions, "Unknown"));
 }
 
 void GPRSInformation::update(const LogCode_0x5137& report)
 {
-    rows().set("Cell Reselect Hysteresis", report.hasReselectHysteresis() ? "Applied" : "Not Applied");
+    rows().setText("Cell Reselect Hysteresis", report.hasReselectHysteresis() ? "Applied" : "Not Applied");
 }
 
 } // namespace orvex

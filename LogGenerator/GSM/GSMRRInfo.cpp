@@ -41,29 +41,29 @@ GSMRRInfo::GSMRRInfo(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void GSMRRInfo::update(const LogCode_0x512C& report)
 {
-    Rows row = rows();
-    row.set("RR State", textFor(report.state(), kStates, "Unknown"));
-    row.print("RR Sub State", "%d", report.subState());
-    row.print("RR Status", "%d", report.status());
-    row.set("RR Mode", report.isData() ? "Data" : "Voice");
+    RowWriter row = rows();
+    row.setText("RR State", textFor(report.state(), kStates, "Unknown"));
+    row.setText("RR Sub State", "%d", report.subState());
+    row.setText("RR Status", "%d", report.status());
+    row.setText("RR Mode", report.isData() ? "Data" : "Voice");
 }
 
 void GSMRRInfo::update(const LogCode_0x5137& report)
 {
-    Rows row = rows();
-    row.print("Serving Rx Level", "%d", report.receiveLevel());
-    row.print("Rx Quality Full", "%d", report.receiveQualityFull());
-    row.print("Rx Quality Sub", "%d", report.receiveQualitySub());
+    RowWriter row = rows();
+    row.setText("Serving Rx Level", "%d", report.receiveLevel());
+    row.setText("Rx Quality Full", "%d", report.receiveQualityFull());
+    row.setText("Rx Quality Sub", "%d", report.receiveQualitySub());
 }
 
 void GSMRRInfo::update(const LogCode_0x5072& report)
 {
-    rows().set("DTX Used", report.isDTXUsed() ? "ON" : "OFF");
+    rows().setText("DTX Used", report.isDTXUsed() ? "ON" : "OFF");
 }
 
 void GSMRRInfo::update(const LogCode_0x51F6& report)
 {
-    rows().print("DRX Used", "%d sec", report.drxTimerMax());
+    rows().setText("DRX Used", "%d sec", report.drxTimerMax());
 }
 
 } // namespace orvex

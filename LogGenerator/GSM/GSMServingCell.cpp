@@ -20,29 +20,29 @@ GSMServingCell::GSMServingCell(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void GSMServingCell::update(const LogCode_0x5134& report)
 {
-    Rows row = rows();
-    row.print("Cell ID", "%d", report.cellIdentity());
-    row.print("ARFCN", "%d", report.arfcn());
-    row.print("BSIC", "%d", report.bsic());
+    RowWriter row = rows();
+    row.setText("Cell ID", "%d", report.cellIdentity());
+    row.setText("ARFCN", "%d", report.arfcn());
+    row.setText("BSIC", "%d", report.bsic());
 }
 
 void GSMServingCell::update(const LogCode_0x5137& report)
 {
-    Rows row = rows();
-    row.print("RSSI", "%d dBm", report.receiveLevel()); // the bare byte: the sign has never been shown
-    row.print("C1 Value", "%d", report.c1());
-    row.print("C2 Value", "%d", report.c2());
+    RowWriter row = rows();
+    row.setText("RSSI", "%d dBm", report.receiveLevel()); // the bare byte: the sign has never been shown
+    row.setText("C1 Value", "%d", report.c1());
+    row.setText("C2 Value", "%d", report.c2());
 }
 
 void GSMServingCell::update(const LogCode_0x5076& report)
 {
-    rows().print("MA Dedicated ARFCN", "%d", report.arfcnLowByte());
+    rows().setText("MA Dedicated ARFCN", "%d", report.arfcnLowByte());
 }
 
 void GSMServingCell::update(const CellMonitorList& list)
 {
     list.reportIfAbsent();
-    Rows row = rows();
+    RowWriter row = rows();
     if (const CellRecord* cell = list.find({telephony::kRadioGSM}, telephony::kCellTypeServing))
         printCell(row, *cell, kCellEntries, "GSMServingCell");
 }

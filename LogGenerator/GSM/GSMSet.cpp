@@ -4,12 +4,12 @@ namespace orvex {
 
 namespace {
 
-void printRecord(Rows& row, const LogCode_0x4005::GSMCell& cell)
+void printRecord(RowWriter& row, const LogCode_0x4005::GSMCell& cell)
 {
-    row.print("ARFCN", "%d", cell.arfcn());
-    row.print("BSIC", "%d", cell.bsic());
-    row.print("RSSI", "%d dBm", cell.rssi());
-    row.print("Ranking Value", "%d", cell.rankingValue());
+    row.setText("ARFCN", "%d", cell.arfcn());
+    row.setText("BSIC", "%d", cell.bsic());
+    row.setText("RSSI", "%d dBm", cell.rssi());
+    row.setText("Ranking Value", "%d", cell.rankingValue());
 }
 
 } // namespace

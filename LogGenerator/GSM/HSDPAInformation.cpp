@@ -9,12 +9,12 @@ namespace {
 constexpr EnumText kCarrierConfigurations[] = {
     {0, "Single Carrier"}, {1, "MIMO"}, {2, "Dual Carrier"}, {3, "Reserved"}};
 
-void printRecord(Rows& row, const LogCode_0x4221::Process& process)
+void printRecord(RowWriter& row, const LogCode_0x4221::Process& process)
 {
-    row.print("Process ID", "%u", process.identity());
-    row.print("No Rx Bits", "%u", process.receivedBits());
-    row.print("New Tx", "%u", process.newTransmissions());
-    row.print("Block Errors", "%u", process.blockErrors());
+    row.setText("Process ID", "%u", process.identity());
+    row.setText("No Rx Bits", "%u", process.receivedBits());
+    row.setText("New Tx", "%u", process.newTransmissions());
+    row.setText("Block Errors", "%u", process.blockErrors());
 }
 
 } // namespace
@@ -26,10 +26,10 @@ HSDPAInformation::HSDPAInformation(ClassDictionary& dict, CodeDictionary& codeDi
 
 void HSDPAInformation::update(const LogCode_0x4221& report)
 {
-    Rows row = rows();
-    row.print("Version", "%u", report.version());
-    row.print("Sub Frames", "%u", report.subframes());
-    row.set("Carrier Info", textFor(report.carrierConfiguration(), kCarrierConfigurations, ""));
+    RowWriter row = rows();
+    row.setText("Version", "%u", report.version());
+    row.setText("Sub Frames", "%u", report.subframes());
+    row.setText("Carrier Info", textFor(report.carrierConfiguration(), kCarrierConfigurations, ""));
     if (report.primaryProcesses().count() > 0)
         row.set("Primary HARQ Process", listOf(report.primaryProcesses(), printRecord));
     if (report.secondaryProcesses().count() > 0)

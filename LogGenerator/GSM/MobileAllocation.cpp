@@ -9,11 +9,11 @@ MobileAllocation::MobileAllocation(ClassDictionary& dict, CodeDictionary& codeDi
 
 void MobileAllocation::update(const LogCode_0x51F8& report)
 {
-    Rows row = rows();
-    row.print("HSN", "%d", report.hoppingSequenceNumber());
+    RowWriter row = rows();
+    row.setText("HSN", "%d", report.hoppingSequenceNumber());
     auto channels = Array::make();
     for (const auto& channel : report.channels())
-        channels->append(LateText("%d", channel.arfcn()));
+        channels->append(DeferredText("%d", channel.arfcn()));
     row.set("ARFCNs", channels);
 }
 

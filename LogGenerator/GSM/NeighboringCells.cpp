@@ -12,7 +12,7 @@ constexpr CellEntry kCellEntries[] = {
     {telephony::kCellRSSI, "RSSI", "RSSI", CellNumber::levelBy2, " dBm"},
 };
 
-void printCellRecord(Rows& row, const CellRecord& cell)
+void printCellRecord(RowWriter& row, const CellRecord& cell)
 {
     printCell(row, cell, kCellEntries, "NeighboringCells");
 }
@@ -24,19 +24,19 @@ NeighboringCells::NeighboringCells(ClassDictionary& dict, CodeDictionary& codeDi
 {
 }
 
-void NeighboringCells::printNeighbor(Rows& row, const LogCode_0x5137::Neighbor& neighbor) const
+void NeighboringCells::printNeighbor(RowWriter& row, const LogCode_0x5137::Neighbor& neighbor) const
 {
-    row.print("ARFCN", "%d", neighbor.arfcn());
-    row.print("RSSI", "%d", neighbor.receiveLevel());
-    row.print("C1 Value", "%d", neighbor.c1());
+    row.setText("ARFCN", "%d", neighbor.arfcn());
+    row.setText("RSSI", "%d", neighbor.receiveLevel());
+    row.setText("C1 Value", "%d", neighbor.c1());
     if (const auto known = _arfcnToBsic.find(neighbor.arfcn()); known != _arfcnToBsic.end())
-        row.print("BSIC", "%d", known->second);
+        row.setText("BSIC", "%d", known->second);
 }
 
 void NeighboringCells::update(const LogCode_0x5137& report)
 {
     refillSection(
-        report.neighbors(), [this](Rows& row, const auto& neighbor) { printNeighbor(row, neighbor); });
+        report.neighbors(), [this](RowWriter& row, const auto& neighbor) { printNeighbor(row, neighbor); });
 }
 
 void NeighboringCells::update(const LogCode_0x51FF& report)

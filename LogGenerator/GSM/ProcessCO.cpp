@@ -12,12 +12,12 @@ ProcessCO::ProcessCO(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void ProcessCO::update(const LogCode_0x7131& report)
 {
-    rows().set("MM State", mmStateText(report.state()));
+    rows().setText("MM State", mmStateText(report.state()));
 }
 
 void ProcessCO::update(const LogCode_0x7132& report)
 {
-    rows().set("MM Service State", registrationStateText(report.registrationState()));
+    rows().setText("MM Service State", registrationStateText(report.registrationState()));
 }
 
 } // namespace orvex

@@ -35,16 +35,16 @@ ProcessCS::ProcessCS(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void ProcessCS::update(const LogCode_0x7131& report)
 {
-    Rows row = rows();
-    row.set("MM State", mmStateText(report.state()));
-    row.set("MM Sub State", textFor(report.subState(), kSubStates, "Unknown"));
+    RowWriter row = rows();
+    row.setText("MM State", mmStateText(report.state()));
+    row.setText("MM Sub State", textFor(report.subState(), kSubStates, "Unknown"));
     // The update status is what a rejected location update leaves behind.
-    row.set("LU Reject Cause", textFor(report.updateStatus(), kUpdateStatuses, "Unknown"));
+    row.setText("LU Reject Cause", textFor(report.updateStatus(), kUpdateStatuses, "Unknown"));
 }
 
 void ProcessCS::update(const LogCode_0x7132& report)
 {
-    rows().set("MM Service State", registrationStateText(report.registrationState()));
+    rows().setText("MM Service State", registrationStateText(report.registrationState()));
 }
 
 } // namespace orvex

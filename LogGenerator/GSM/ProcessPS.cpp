@@ -49,16 +49,16 @@ ProcessPS::ProcessPS(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void ProcessPS::update(const LogCode_0x7130& report)
 {
-    Rows row = rows();
-    row.set("MM State", textFor(report.state(), kStates, "Unknown"));
-    row.set("MM Sub State", textFor(report.subState(), kSubStates, "Unknown"));
+    RowWriter row = rows();
+    row.setText("MM State", textFor(report.state(), kStates, "Unknown"));
+    row.setText("MM Sub State", textFor(report.subState(), kSubStates, "Unknown"));
     // The update status is what a rejected attach leaves behind.
-    row.set("Attach Reject Cause", textFor(report.updateStatus(), kUpdateStatuses, "Unknown"));
+    row.setText("Attach Reject Cause", textFor(report.updateStatus(), kUpdateStatuses, "Unknown"));
 }
 
 void ProcessPS::update(const LogCode_0x7132& report)
 {
-    rows().set("MM Service State", registrationStateText(report.registrationState()));
+    rows().setText("MM Service State", registrationStateText(report.registrationState()));
 }
 
 } // namespace orvex

@@ -21,7 +21,7 @@ constexpr CellEntry kCellEntries[] = {
     {telephony::kCellLAC, "Location Area Code", "LAC"},
 };
 
-void printDigits(Rows& row, const char* name, const LogCode_0x7135::Digits& digits)
+void printDigits(RowWriter& row, const char* name, const LogCode_0x7135::Digits& digits)
 {
     row.set(name, text("%c%c%c", digits[0], digits[1], digits[2]));
 }
@@ -35,23 +35,23 @@ ServingPLMN::ServingPLMN(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void ServingPLMN::update(const LogCode_0x7135& report)
 {
-    Rows row = rows();
+    RowWriter row = rows();
     printDigits(row, "Mobile Country Code", report.mobileCountryCode());
     printDigits(row, "Mobile Network Code", report.mobileNetworkCode());
-    row.print("Location Area Code", "%d", report.locationAreaCode());
-    row.print("Routing Area Code", "%d", report.routingAreaCode());
-    row.set("Service Type", textFor(report.serviceType(), kServiceTypes, "Unknown"));
+    row.setText("Location Area Code", "%d", report.locationAreaCode());
+    row.setText("Routing Area Code", "%d", report.routingAreaCode());
+    row.setText("Service Type", textFor(report.serviceType(), kServiceTypes, "Unknown"));
 }
 
 void ServingPLMN::update(const LogCode_0x7132& report)
 {
-    rows().set("PLMN Sel Mod", textFor(report.plmnSelectionMode(), kSelectionModes, "Unknown"));
+    rows().setText("PLMN Sel Mod", textFor(report.plmnSelectionMode(), kSelectionModes, "Unknown"));
 }
 
 void ServingPLMN::update(const CellMonitorList& list)
 {
     list.reportIfAbsent();
-    Rows row = rows();
+    RowWriter row = rows();
     if (const CellRecord* cell =
             list.find({telephony::kRadioUMTS, telephony::kRadioGSM}, telephony::kCellTypeServing))
         printCell(row, *cell, kCellEntries, "ServingPLMN");

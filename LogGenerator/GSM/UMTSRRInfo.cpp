@@ -43,33 +43,33 @@ UMTSRRInfo::UMTSRRInfo(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void UMTSRRInfo::update(const LogCode_0x4125& report)
 {
-    rows().set("RRC State", textFor(report.state(), kStates, "Unknown"));
+    rows().setText("RRC State", textFor(report.state(), kStates, "Unknown"));
 }
 
 void UMTSRRInfo::update(const LogCode_0x4031& report)
 {
-    rows().print("Transmit Power", "%4.2lf dBm", averageTransmitPower(report));
+    rows().setText("Transmit Power", "%4.2lf dBm", averageTransmitPower(report));
 }
 
 void UMTSRRInfo::update(const LogCode_0x4127& report)
 {
-    Rows row = rows();
-    row.print("Cell ID", "%d", report.cellIdentity());
-    row.print("Downlink Frequency", "%d", report.downlinkUARFCN());
-    row.print("Uplink Frequency", "%d", report.uplinkUARFCN());
+    RowWriter row = rows();
+    row.setText("Cell ID", "%d", report.cellIdentity());
+    row.setText("Downlink Frequency", "%d", report.downlinkUARFCN());
+    row.setText("Uplink Frequency", "%d", report.uplinkUARFCN());
     row.remove("UARFCN"); // the cell-monitor list's; it is of the cell before
-    row.print("URA ID", "%d", report.uraIdentity());
+    row.setText("URA ID", "%d", report.uraIdentity());
 }
 
 void UMTSRRInfo::update(const LogCode_0x4157& report)
 {
-    rows().set("Ciphering", report.isCiphered() ? "Enabled" : "Disabled");
+    rows().setText("Ciphering", report.isCiphered() ? "Enabled" : "Disabled");
 }
 
 void UMTSRRInfo::update(const CellMonitorList& list)
 {
     list.reportIfAbsent();
-    Rows row = rows();
+    RowWriter row = rows();
     if (const CellRecord* cell = list.find({telephony::kRadioUMTS}, telephony::kCellTypeServing))
         printCell(row, *cell, kCellEntries, "UMTSRRInfo");
 }

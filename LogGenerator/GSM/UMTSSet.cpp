@@ -13,19 +13,19 @@ constexpr CellEntry kCellEntries[] = {
     {telephony::kCellECN0, "Energy Per Chip", "Energy Per Chip", CellNumber::level, " dB"},
 };
 
-void printCellRecord(Rows& row, const CellRecord& cell)
+void printCellRecord(RowWriter& row, const CellRecord& cell)
 {
     printCell(row, cell, kCellEntries, "UMTSSet");
 }
 
-void printRankedCell(Rows& row, const LogCode_0x4005::UMTSCell& cell)
+void printRankedCell(RowWriter& row, const LogCode_0x4005::UMTSCell& cell)
 {
-    row.print("Scrambling Code", "%d", cell.primaryScramblingCode());
-    row.print("RSCP", "%d dB", cell.rscp()); // shown so, though it is dBm
-    row.print("Energy Per Chip", "%f dB", cell.ecNo());
-    row.print("Downlink Frequency", "%d", cell.downlinkUARFCN());
-    row.print("Ranking Value", "%d", cell.rankingValue());
-    row.print("Rank Cell RSCP", "%d dB", cell.rankingRSCP());
+    row.setText("Scrambling Code", "%d", cell.primaryScramblingCode());
+    row.setText("RSCP", "%d dB", cell.rscp()); // shown so, though it is dBm
+    row.setText("Energy Per Chip", "%f dB", cell.ecNo());
+    row.setText("Downlink Frequency", "%d", cell.downlinkUARFCN());
+    row.setText("Ranking Value", "%d", cell.rankingValue());
+    row.setText("Rank Cell RSCP", "%d dB", cell.rankingRSCP());
 }
 
 } // namespace

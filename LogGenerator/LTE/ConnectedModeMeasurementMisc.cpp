@@ -9,12 +9,12 @@ ConnectedModeMeasurementMisc::ConnectedModeMeasurementMisc(ClassDictionary& dict
 
 void ConnectedModeMeasurementMisc::update(const LogCode_0xB179& report)
 {
-    Rows row = rows();
-    row.print("E-ARFCN", "%d", report.earfcn());
-    row.print("Serving Physical Cell ID", "%d", report.servingPhysicalCellIdentity());
-    row.print("Subframe Number", "%d", report.subframeNumber());
-    row.print("Serving Filtered RSRP", "%4.2f dBm", report.servingFilteredRSRP());
-    row.print("Serving Filtered RSRQ", "%4.2f dB", report.servingFilteredRSRQ());
+    RowWriter row = rows();
+    row.setText("E-ARFCN", "%d", report.earfcn());
+    row.setText("Serving Physical Cell ID", "%d", report.servingPhysicalCellIdentity());
+    row.setText("Subframe Number", "%d", report.subframeNumber());
+    row.setText("Serving Filtered RSRP", "%4.2f dBm", report.servingFilteredRSRP());
+    row.setText("Serving Filtered RSRQ", "%4.2f dB", report.servingFilteredRSRQ());
 }
 
 } // namespace orvex

@@ -4,9 +4,9 @@ namespace orvex {
 
 namespace {
 
-void printRecord(Rows& row, const LogCode_0xB179::DetectedCell& cell)
+void printRecord(RowWriter& row, const LogCode_0xB179::DetectedCell& cell)
 {
-    row.print("Physical Cell ID", "%d", cell.physicalCellIdentity());
+    row.setText("Physical Cell ID", "%d", cell.physicalCellIdentity());
 }
 
 } // namespace

@@ -34,7 +34,7 @@ LTEServingCellInfo::LTEServingCellInfo(ClassDictionary& dict, CodeDictionary& co
 
 void LTEServingCellInfo::update(const LogCode_0xB0C1& antennas)
 {
-    rows().print("Num Tx Antennas", "%d", antennas.transmitAntennas());
+    rows().setText("Num Tx Antennas", "%d", antennas.transmitAntennas());
     // Decoded, and yet reported: the logs of this system have always had this line for every such packet,
     // and people's filters know it.
     reportUnknown(LogCode_0xB0C1::kCode);
@@ -42,22 +42,22 @@ void LTEServingCellInfo::update(const LogCode_0xB0C1& antennas)
 
 void LTEServingCellInfo::update(const LogCode_0xB0C2& cell)
 {
-    Rows row = rows();
-    row.print("Physical Cell ID", "%d", cell.physicalCellIdentity());
-    row.print("Download Frequency", "%d", cell.downlinkFrequency());
-    row.print("Upload Frequency", "%d", cell.uplinkFrequency());
+    RowWriter row = rows();
+    row.setText("Physical Cell ID", "%d", cell.physicalCellIdentity());
+    row.setText("Download Frequency", "%d", cell.downlinkFrequency());
+    row.setText("Upload Frequency", "%d", cell.uplinkFrequency());
     row.remove("UARFCN"); // the cell-monitor list's; it is of the cell before
-    row.set("Download Bandwidth", bandwidthText(cell.downlinkBandwidth()));
-    row.set("Upload Bandwidth", bandwidthText(cell.uplinkBandwidth()));
-    row.print("Cell Identity", "%d", cell.cellIdentity());
-    row.print("Tracking Area Code", "%d", cell.trackingAreaCode());
-    row.print("Freq Band Indicator", "%d", cell.frequencyBandIndicator());
+    row.setText("Download Bandwidth", bandwidthText(cell.downlinkBandwidth()));
+    row.setText("Upload Bandwidth", bandwidthText(cell.uplinkBandwidth()));
+    row.setText("Cell Identity", "%d", cell.cellIdentity());
+    row.setText("Tracking Area Code", "%d", cell.trackingAreaCode());
+    row.setText("Freq Band Indicator", "%d", cell.frequencyBandIndicator());
 }
 
 void LTEServingCellInfo::update(const CellMonitorList& list)
 {
     list.reportIfAbsent();
-    Rows row = rows();
+    RowWriter row = rows();
     if (const CellRecord* cell = list.find({telephony::kRadioLTE}, telephony::kCellTypeServing))
         printCell(row, *cell, kCellEntries, "Serving Cell Info");
 }

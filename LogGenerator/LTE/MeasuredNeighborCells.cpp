@@ -4,11 +4,11 @@ namespace orvex {
 
 namespace {
 
-void printRecord(Rows& row, const LogCode_0xB179::MeasuredNeighbor& neighbor)
+void printRecord(RowWriter& row, const LogCode_0xB179::MeasuredNeighbor& neighbor)
 {
-    row.print("Physical Cell ID", "%d", neighbor.physicalCellIdentity());
-    row.print("Filtered RSRP", "%4.2f dBm", neighbor.filteredRSRP());
-    row.print("Filtered RSRQ", "%4.2f dB", neighbor.filteredRSRQ());
+    row.setText("Physical Cell ID", "%d", neighbor.physicalCellIdentity());
+    row.setText("Filtered RSRP", "%4.2f dBm", neighbor.filteredRSRP());
+    row.setText("Filtered RSRQ", "%4.2f dB", neighbor.filteredRSRQ());
 }
 
 } // namespace

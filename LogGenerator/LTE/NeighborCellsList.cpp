@@ -7,28 +7,28 @@ namespace orvex {
 namespace {
 
 // One format for every scaled row in the log, whichever row it is.
-void printAndLog(Rows& row, const char* name, double value, const char* unit)
+void printAndLog(RowWriter& row, const char* name, double value, const char* unit)
 {
-    row.print(name, "%4.2f %s", value, unit);
+    row.setText(name, "%4.2f %s", value, unit);
     systemLog(Priority::warning, "Measured RSSI: %lf\n", value);
 }
 
-void printRecord(Rows& row, const LogCode_0xB180::NeighborCell& cell)
+void printRecord(RowWriter& row, const LogCode_0xB180::NeighborCell& cell)
 {
-    row.print("Physical Cell ID", "%d", cell.physicalCellIdentity());
+    row.setText("Physical Cell ID", "%d", cell.physicalCellIdentity());
     systemLog(Priority::warning, "Physical Cell ID: %d\n", cell.physicalCellIdentity());
     printAndLog(row, "Measured RSSI", cell.measuredRSSI(), "dBm");
     printAndLog(row, "Measured RSRP", cell.measuredRSRP(), "dBm");
     printAndLog(row, "Average RSRP", cell.averageRSRP(), "dBm");
     printAndLog(row, "Measured RSRQ", cell.measuredRSRQ(), "dB");
     printAndLog(row, "Average RSRQ", cell.averageRSRQ(), "dB");
-    row.print("Srxlev", "%d dBm", cell.srxlev());
-    row.print("Frequency Offset", "%d", cell.frequencyOffset());
-    row.print("Ant 0 Frame Offset", "%d", cell.antenna0FrameOffset());
-    row.print("Ant 0 Sample Offset", "%d", cell.antenna0SampleOffset());
+    row.setText("Srxlev", "%d dBm", cell.srxlev());
+    row.setText("Frequency Offset", "%d", cell.frequencyOffset());
+    row.setText("Ant 0 Frame Offset", "%d", cell.antenna0FrameOffset());
+    row.setText("Ant 0 Sample Offset", "%d", cell.antenna0SampleOffset());
     // Antenna 1 shows antenna 0 again: the record has no other bits for it.
-    row.print("Ant 1 Frame Offset", "%d", cell.antenna0FrameOffset());
-    row.print("Ant 1 Sample Offset", "%d", cell.antenna0SampleOffset());
+    row.setText("Ant 1 Frame Offset", "%d", cell.antenna0FrameOffset());
+    row.setText("Ant 1 Sample Offset", "%d", cell.antenna0SampleOffset());
 }
 
 } // namespace

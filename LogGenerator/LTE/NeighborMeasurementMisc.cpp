@@ -9,10 +9,10 @@ NeighborMeasurementMisc::NeighborMeasurementMisc(ClassDictionary& dict, CodeDict
 
 void NeighborMeasurementMisc::update(const LogCode_0xB180& report)
 {
-    Rows row = rows();
-    row.print("Version", "%d", report.version());
-    row.print("E-ARFCN", "%d", report.earfcn());
-    row.print("Qrxlevmin", "%d dBm", report.qRxLevMin());
+    RowWriter row = rows();
+    row.setText("Version", "%d", report.version());
+    row.setText("E-ARFCN", "%d", report.earfcn());
+    row.setText("Qrxlevmin", "%d dBm", report.qRxLevMin());
 }
 
 } // namespace orvex

@@ -14,44 +14,44 @@ constexpr EnumText kTechnologies[] = {
     {LogCode_0xB186::cdmaHRPD, "CDMAHRPD"},
 };
 
-void printTechnologyFields(Rows& row, const LogCode_0xB186::Candidate& candidate)
+void printTechnologyFields(RowWriter& row, const LogCode_0xB186::Candidate& candidate)
 {
     switch (candidate.technology()) {
     case LogCode_0xB186::lte: {
         const auto cell = candidate.lteFields();
-        row.print("E ARFCN", "%d", cell.earfcn);
-        row.print("Cell ID", "%d", cell.cellIdentity);
+        row.setText("E ARFCN", "%d", cell.earfcn);
+        row.setText("Cell ID", "%d", cell.cellIdentity);
         break;
     }
     case LogCode_0xB186::utran: {
         const auto cell = candidate.utranFields();
-        row.print("U ARFCN", "%d", cell.uarfcn);
-        row.print("PSC", "%d", cell.primaryScramblingCode);
+        row.setText("U ARFCN", "%d", cell.uarfcn);
+        row.setText("PSC", "%d", cell.primaryScramblingCode);
         break;
     }
     case LogCode_0xB186::geran: {
         const auto cell = candidate.geranFields();
-        row.print("ARFCN", "%d", cell.arfcn);
-        row.print("Band", "%d", cell.band);
-        row.print("BSIC ID", "%d", cell.bsic);
+        row.setText("ARFCN", "%d", cell.arfcn);
+        row.setText("Band", "%d", cell.band);
+        row.setText("BSIC ID", "%d", cell.bsic);
         break;
     }
     case LogCode_0xB186::cdma1xRTT:
     case LogCode_0xB186::cdmaHRPD: {
         const auto cell = candidate.cdmaFields();
-        row.print("Band", "%d", cell.band);
-        row.print("Channel", "%d", cell.channel);
-        row.print("Pilot", "%d", cell.pilot);
+        row.setText("Band", "%d", cell.band);
+        row.setText("Channel", "%d", cell.channel);
+        row.setText("Pilot", "%d", cell.pilot);
         break;
     }
     default: break;
     }
 }
 
-void printRecord(Rows& row, const LogCode_0xB186::Candidate& candidate)
+void printRecord(RowWriter& row, const LogCode_0xB186::Candidate& candidate)
 {
-    row.print("Candidate Priority", "%d", candidate.priority());
-    row.set("Candidate RAT Type", textFor(candidate.technology(), kTechnologies, "??"));
+    row.setText("Candidate Priority", "%d", candidate.priority());
+    row.setText("Candidate RAT Type", textFor(candidate.technology(), kTechnologies, "??"));
     printTechnologyFields(row, candidate);
 }
 

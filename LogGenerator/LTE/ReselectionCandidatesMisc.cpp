@@ -9,10 +9,10 @@ ReselectionCandidatesMisc::ReselectionCandidatesMisc(ClassDictionary& dict, Code
 
 void ReselectionCandidatesMisc::update(const LogCode_0xB186& report)
 {
-    Rows row = rows();
-    row.print("Version", "%d", report.version());
-    row.print("Serving EARFCN", "%d", report.servingEARFCN());
-    row.print("Serving Cell ID", "%d", report.servingCellIdentity());
+    RowWriter row = rows();
+    row.setText("Version", "%d", report.version());
+    row.setText("Serving EARFCN", "%d", report.servingEARFCN());
+    row.setText("Serving Cell ID", "%d", report.servingCellIdentity());
 }
 
 } // namespace orvex

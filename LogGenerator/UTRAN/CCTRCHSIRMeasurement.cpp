@@ -4,13 +4,13 @@ namespace orvex {
 
 namespace {
 
-void printRecord(Rows& row, const LogCode_0xD00C::CompositeChannel& channel)
+void printRecord(RowWriter& row, const LogCode_0xD00C::CompositeChannel& channel)
 {
-    row.print("CCTRCH ID", "%d", channel.identity());
-    row.print("TSNUM", "%d", channel.timeSlotNumber());
+    row.setText("CCTRCH ID", "%d", channel.identity());
+    row.setText("TSNUM", "%d", channel.timeSlotNumber());
     auto ratios = Array::make();
     for (std::size_t i = 0; i < LogCode_0xD00C::CompositeChannel::kSIRCount; ++i)
-        ratios->append(LateText("%d", channel.sir(i)));
+        ratios->append(DeferredText("%d", channel.sir(i)));
     row.set("SIR", ratios);
 }
 

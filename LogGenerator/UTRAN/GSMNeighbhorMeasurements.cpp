@@ -4,15 +4,15 @@ namespace orvex {
 
 namespace {
 
-void printRecord(Rows& row, const LogCode_0xD00E::GSMNeighbor& neighbor)
+void printRecord(RowWriter& row, const LogCode_0xD00E::GSMNeighbor& neighbor)
 {
-    row.print("Cell ID", "%d", neighbor.cellIdentity());
-    row.print("Band Indicator", "%d", neighbor.bandIndicator());
-    row.print("BSIC Valid", "%d", neighbor.bsicValid());
-    row.print("NCC", "%d", neighbor.ncc());
-    row.print("BCC", "%d", neighbor.bcc());
-    row.print("ARFCN", "%d", neighbor.arfcn());
-    row.print("RSSI", "%d", neighbor.rssi());
+    row.setText("Cell ID", "%d", neighbor.cellIdentity());
+    row.setText("Band Indicator", "%d", neighbor.bandIndicator());
+    row.setText("BSIC Valid", "%d", neighbor.bsicValid());
+    row.setText("NCC", "%d", neighbor.ncc());
+    row.setText("BCC", "%d", neighbor.bcc());
+    row.setText("ARFCN", "%d", neighbor.arfcn());
+    row.setText("RSSI", "%d", neighbor.rssi());
 }
 
 } // namespace

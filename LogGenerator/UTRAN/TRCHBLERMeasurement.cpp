@@ -4,10 +4,10 @@ namespace orvex {
 
 namespace {
 
-void printRecord(Rows& row, const LogCode_0xD00C::TransportChannel& channel)
+void printRecord(RowWriter& row, const LogCode_0xD00C::TransportChannel& channel)
 {
-    row.print("TRCH ID", "%d", channel.identity());
-    row.print("TRCH BLER Measurement", "%d", channel.blockErrorRate());
+    row.setText("TRCH ID", "%d", channel.identity());
+    row.setText("TRCH BLER Measurement", "%d", channel.blockErrorRate());
 }
 
 } // namespace

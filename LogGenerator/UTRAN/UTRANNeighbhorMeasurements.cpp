@@ -8,14 +8,14 @@ namespace {
 
 constexpr EnumText kStatuses[] = {{0, "ASET"}, {1, "MSET"}, {2, "DSET"}};
 
-void printRecord(Rows& row, const LogCode_0xD00A::Neighbor& neighbor)
+void printRecord(RowWriter& row, const LogCode_0xD00A::Neighbor& neighbor)
 {
-    row.print("UARFCN", "%d", neighbor.uarfcn());
-    row.print("Cell ID", "%d", neighbor.cellIdentity());
-    row.print("Filter RSCP", "%f", neighbor.filteredRSCP());
+    row.setText("UARFCN", "%d", neighbor.uarfcn());
+    row.setText("Cell ID", "%d", neighbor.cellIdentity());
+    row.setText("Filter RSCP", "%f", neighbor.filteredRSCP());
     if (const char* status = textFor(neighbor.status(), kStatuses, nullptr))
-        row.set("Status", status);
-    row.set("inJDCS", neighbor.isInJDCS() ? "TRUE" : "FALSE");
+        row.setText("Status", status);
+    row.setText("inJDCS", neighbor.isInJDCS() ? "TRUE" : "FALSE");
 }
 
 } // namespace

@@ -28,18 +28,18 @@ UTRANServingCellInfo::UTRANServingCellInfo(ClassDictionary& dict, CodeDictionary
 
 void UTRANServingCellInfo::update(const LogCode_0xD0E2& cell)
 {
-    Rows row = rows();
-    row.print("Cell Access Restrictions", "%d", cell.cellAccessRestrictions());
-    row.print("Cell ID", "%d", cell.cellIdentity());
-    row.print("Downlink UARFCN", "%d", cell.downlinkUARFCN());
-    row.print("Uplink UARFCN", "%d", cell.uplinkUARFCN());
-    row.print("URA ID", "%d", cell.uraIdentity());
-    row.set("Allowed Access", cell.isBarred() ? "Emergency Calls Only" : "All Calls");
+    RowWriter row = rows();
+    row.setText("Cell Access Restrictions", "%d", cell.cellAccessRestrictions());
+    row.setText("Cell ID", "%d", cell.cellIdentity());
+    row.setText("Downlink UARFCN", "%d", cell.downlinkUARFCN());
+    row.setText("Uplink UARFCN", "%d", cell.uplinkUARFCN());
+    row.setText("URA ID", "%d", cell.uraIdentity());
+    row.setText("Allowed Access", cell.isBarred() ? "Emergency Calls Only" : "All Calls");
 }
 
 void UTRANServingCellInfo::update(const CellMonitorList& list)
 {
-    Rows row = rows();
+    RowWriter row = rows();
     for (const CellRecord& cell : list.findAll(telephony::kRadioUTRAN, telephony::kCellTypeServing))
         printCell(row, cell, kCellEntries, "Serving Cell Info"); // of several, the last one wins
 }

@@ -161,8 +161,8 @@ void OrvexModel::startMonitor()
         refresh();
     });
     const std::string error = _logGenerator->templateError(*_state);
-    if (!error.empty() && _platform.complain)
-        _platform.complain(error);
+    if (!error.empty() && _platform.printError)
+        _platform.printError(error);
 }
 
 bool OrvexModel::sendStartCommand()

@@ -34,7 +34,7 @@ public:
         TelephonyService& telephony;
         GeneratorEnvironment generators;
         // Told at each start of a session that can show nothing, in one line: which template, and why.
-        std::function<void(const std::string& why)> complain = {};
+        std::function<void(const std::string& why)> printError = {};
     };
 
     static std::shared_ptr<OrvexModel> create(const Platform& platform);

@@ -18,7 +18,7 @@ public:
     }
     void updateWithData(Packet packet, LogCode logCode) override
     {
-        rows().print("Packet", "%04X, %zu", static_cast<unsigned>(logCode), packet.size());
+        rows().setText("Packet", "%04X, %zu", static_cast<unsigned>(logCode), packet.size());
     }
 };
 

@@ -13,9 +13,9 @@ void fill(Array& list, const Records& records)
 {
     RowList rows(&list);
     for (const auto& record : records) {
-        Rows& row = rows.next();
+        RowWriter& row = rows.next();
         for (const auto& [name, number] : record)
-            row.print(name, "%d", number);
+            row.setText(name, "%d", number);
     }
 }
 
@@ -59,7 +59,7 @@ TEST(RowListTest, RemovedRowsAreGone)
     Array list;
     for (int i = 0; i < 2; ++i) {
         RowList rows(&list);
-        Rows& row = rows.next();
+        RowWriter& row = rows.next();
         row.set("A", "1");
         row.set("B", "2");
         row.remove("A");
@@ -82,9 +82,9 @@ TEST(RowListTest, LeavesWhatSomebodyElseHoldsAndElementsOfAnotherKind)
 TEST(RowsTest, KeepsTheOthersAndTheirOrder)
 {
     const auto dictionary = Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}});
-    Rows rows(dictionary.get());
-    rows.print("C", "%d", 30);
-    rows.print("A", "%d", 10);
+    RowWriter rows(dictionary.get());
+    rows.setText("C", "%d", 30);
+    rows.setText("A", "%d", 10);
     rows.set("D", "40");
     EXPECT_EQ(described(Array({dictionary})), "A=10 B=2 C=30 D=40 | ");
 }

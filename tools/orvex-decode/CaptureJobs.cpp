@@ -113,13 +113,13 @@ private:
         const Results& results = _results.at(job);
         std::cerr << results.complaints.contents();
         if (!end.death.empty())
-            complain(capture + ": decoding " + end.death);
+            printError(capture + ": decoding " + end.death);
         _isGood = _isGood && end.isGood;
         if (_log && !results.log.appendTo(_log.get()))
             failLog();
         const auto length = results.document.appendTo(_documents.stream());
         if (!length || std::fflush(_documents.stream()) != 0)
-            _isGood = complain(capture + ": " + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
+            _isGood = printError(capture + ": " + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
         else if (*length > 0)
             _parts.push_back({capture, *length});
         _results.erase(job);
@@ -130,7 +130,7 @@ private:
     {
         auto [file, error] = openOutputFile(*_options.logFile);
         _log = std::move(file);
-        return _log || complain(*_options.logFile + ": " + error);
+        return _log || printError(*_options.logFile + ": " + error);
     }
     void closeLog()
     {
@@ -139,7 +139,8 @@ private:
     }
     void failLog()
     {
-        _isGood = complain(*_options.logFile + ": " + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
+        _isGood =
+            printError(*_options.logFile + ": " + std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
     }
 
     const DecodeOptions& _options;
@@ -164,7 +165,7 @@ int decodeInJobs(const DecodeOptions& options, const std::function<int(const Dec
     try {
         return CaptureJobs(options, decode).run();
     } catch (const TemporaryFile::Failure& failure) {
-        complain(failure.what());
+        printError(failure.what());
         return EXIT_FAILURE;
     }
 }

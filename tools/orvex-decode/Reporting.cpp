@@ -9,7 +9,7 @@
 
 namespace orvex {
 
-bool complain(const std::string& message)
+bool printError(const std::string& message)
 {
     std::cerr << "orvex-decode: " << visibleText(message) << '\n';
     return false;
@@ -26,7 +26,7 @@ bool writeFile(const std::string& path, const std::function<void(std::ostream&)>
         stream.flush();
         error = closeOutputFile(std::move(file));
     }
-    return error.empty() || complain(path + ": " + error);
+    return error.empty() || printError(path + ": " + error);
 }
 } // namespace
 
@@ -41,7 +41,7 @@ bool printDocument(const std::function<void(std::ostream&)>& write, const Decode
         return writeFile(*options.outputFile, write);
     write(std::cout);
     std::cout.flush();
-    return std::cout ? true : complain("standard output: could not be written");
+    return std::cout ? true : printError("standard output: could not be written");
 }
 
 } // namespace orvex

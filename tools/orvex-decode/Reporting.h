@@ -12,7 +12,7 @@ namespace orvex {
 // What the decoder says and writes. All return whether it is well.
 
 // One line on standard error. False, always.
-bool complain(const std::string& message);
+bool printError(const std::string& message);
 // Replaces the file.
 bool writeFile(const std::string& path, std::string_view content);
 // Where the options want the document to go.

@@ -50,11 +50,11 @@ bool feed(OfflineSession& session, const std::string& path, const DecodeOptions&
         progress.advance(reader->message().size());
     }
     if (const std::string omissions = reader->omissions(); !omissions.empty())
-        complain(path + ": " + omissions);
+        printError(path + ": " + omissions);
     if (status == CaptureReader::Status::end)
         return true;
     const std::size_t whole = session.messageCount() - before;
-    return complain(
+    return printError(
         reader->error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
 }
 
@@ -135,7 +135,7 @@ struct Platform {
 bool hasTemplate(const LogGenerator& generator)
 {
     const std::string error = generator.templateError({});
-    return error.empty() || complain(error);
+    return error.empty() || printError(error);
 }
 
 bool save(const OfflineSession& session, Date begun, const DecodeOptions& options)
@@ -143,9 +143,9 @@ bool save(const OfflineSession& session, Date begun, const DecodeOptions& option
     const Snapshot snapshot{dateText(begun), session.saveContents(), options.description};
     const std::string fault = writeSnapshot(snapshot, *options.snapshotFile);
     if (const std::size_t dropped = session.droppedRawBytes(); fault.empty() && dropped > 0)
-        complain(text("%s: lacks the oldest %zu bytes of raw messages; a snapshot holds up to %zu MiB",
+        printError(text("%s: lacks the oldest %zu bytes of raw messages; a snapshot holds up to %zu MiB",
             options.snapshotFile->c_str(), dropped, RawPackets::kLimit >> 20));
-    return fault.empty() || complain(fault);
+    return fault.empty() || printError(fault);
 }
 
 int decodeCaptures(const DecodeOptions& options)
@@ -172,7 +172,7 @@ int decodeCaptures(const DecodeOptions& options)
 bool extractDlf(const SnapshotDocument& document, const DecodeOptions& options)
 {
     if (!document.dlf())
-        return complain(options.captures.front() + ": holds no binary log");
+        return printError(options.captures.front() + ": holds no binary log");
     return writeFile(
         *options.dlfFile, {reinterpret_cast<const char*>(document.dlf()->data()), document.dlf()->size()});
 }
@@ -203,7 +203,7 @@ int showSnapshots(const DecodeOptions& options)
     for (const std::string& path : options.captures) {
         const auto [snapshot, error] = readSnapshot(path);
         if (!snapshot) {
-            isGood = complain(error);
+            isGood = printError(error);
             continue;
         }
         SnapshotDocument& document = documents.emplace_back(*snapshot);
@@ -213,7 +213,7 @@ int showSnapshots(const DecodeOptions& options)
             document.decodeAnew(std::move(generator));
         }
         for (const std::string& omission : document.omissions())
-            complain(text("%s: %s", path.c_str(), omission.c_str()));
+            printError(text("%s: %s", path.c_str(), omission.c_str()));
         if (options.dlfFile)
             isGood = extractDlf(document, options) && isGood;
     }
@@ -231,7 +231,7 @@ int decode(const DecodeOptions& options)
     if (options.logFile) {
         log = std::make_unique<FileSystemLog>(*options.logFile);
         if (!log->error().empty()) {
-            complain(log->error());
+            printError(log->error());
             return kFailure;
         }
         SystemLog::install(log.get());
@@ -241,7 +241,7 @@ int decode(const DecodeOptions& options)
     if (log) {
         log->flush();
         if (!log->error().empty()) {
-            complain(log->error());
+            printError(log->error());
             status = kFailure;
         }
     }
@@ -258,13 +258,13 @@ int main(int argc, char** argv)
     case DecodeOptions::Action::help: std::cout << DecodeOptions::usage(); return 0;
     case DecodeOptions::Action::version: std::cout << "orvex-decode " ORVEX_VERSION "\n"; return 0;
     case DecodeOptions::Action::wrongUsage:
-        complain(options.error);
+        printError(options.error);
         std::cerr << DecodeOptions::usage();
         return kWrongUsage;
     case DecodeOptions::Action::decode: break;
     }
     if (const std::string conflict = conflictOf(options); !conflict.empty()) {
-        complain(conflict);
+        printError(conflict);
         return kWrongUsage;
     }
 

@@ -1,8 +1,8 @@
-#include "Rows.h"
+#include "RowWriter.h"
 
 namespace orvex {
 
-Value& Rows::slotElsewhere(std::string_view name)
+Value& RowWriter::slotElsewhere(std::string_view name)
 {
     // What stands from here on is left from before. As the next row is another one it goes, and the order is
     // the same as if the dictionary had been empty.
@@ -13,7 +13,7 @@ Value& Rows::slotElsewhere(std::string_view name)
     return value;
 }
 
-void Rows::remove(std::string_view name)
+void RowWriter::remove(std::string_view name)
 {
     if (!_dictionary)
         return;

@@ -7,40 +7,40 @@ namespace orvex {
 // Writes rows, name and text, into one dictionary of the display: a section's own, or a record's in a list.
 // A writer over nothing drops what it is given.
 //
-// Texts are made when they are read (LateText): a const char* given to set() or print() has to live as long
+// Texts are made when they are read (DeferredText): a const char* given to setText() has to live as long
 // as the program.
-class Rows {
+class RowWriter {
 public:
     // Sets rows and leaves the others. The dictionary outlives the writer.
-    explicit Rows(Dictionary* dictionary)
+    explicit RowWriter(Dictionary* dictionary)
         : _dictionary(dictionary)
     {
     }
     // Writes a dictionary anew: only what is set from now on is in it after end().
-    static Rows anew(Dictionary* dictionary)
+    static RowWriter anew(Dictionary* dictionary)
     {
-        Rows rows(dictionary);
+        RowWriter rows(dictionary);
         rows._isWrittenAnew = true;
         return rows;
     }
 
-    void set(std::string_view name, const char* text)
+    void setText(std::string_view name, const char* text)
     {
         if (_dictionary)
-            slot(name).set(LateText(text));
+            slot(name).set(DeferredText(text));
     }
     void set(std::string_view name, Value value)
     {
         if (_dictionary)
             slot(name) = std::move(value);
     }
-    // The text by a printf format.
+    // Formatted as by printf.
     template <typename... Arguments>
-    void print(std::string_view name, PrintfFormat<std::type_identity_t<Arguments>...> format,
+    void setText(std::string_view name, PrintfFormat<std::type_identity_t<Arguments>...> format,
         Arguments... arguments)
     {
         if (_dictionary)
-            slot(name).set(LateText(format, arguments...));
+            slot(name).set(DeferredText(format, arguments...));
     }
     void remove(std::string_view name);
 

@@ -16,10 +16,10 @@ namespace {
 template <typename... Arguments>
 std::string late(PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
 {
-    return LateText(format, arguments...).text();
+    return DeferredText(format, arguments...).text();
 }
 
-TEST(LateTextTest, IsWhatPrintfMakes)
+TEST(DeferredTextTest, IsWhatPrintfMakes)
 {
     EXPECT_EQ(late("plain 100%%"), "plain 100%");
     EXPECT_EQ(late("%d dBm", std::numeric_limits<int>::min()), "-2147483648 dBm");
@@ -32,7 +32,7 @@ TEST(LateTextTest, IsWhatPrintfMakes)
     EXPECT_EQ(late("%-4u|%+d", 7, 8), "7   |+8");
     EXPECT_EQ(
         late("%5s%%%lu", "abc", std::numeric_limits<unsigned long>::max()), "  abc%18446744073709551615");
-    EXPECT_EQ(LateText("100%d").text(), "100%d"); // a text is no format
+    EXPECT_EQ(DeferredText("100%d").text(), "100%d"); // a text is no format
     EXPECT_EQ(late("%f", 1e300).size(), 308U);
 }
 
@@ -70,9 +70,9 @@ TEST(FixedPointTest, IsWhatPrintfMakesOrNothing)
 }
 #pragma GCC diagnostic pop
 
-TEST(LateTextTest, NobodyCanTellItInAValue)
+TEST(DeferredTextTest, NobodyCanTellItInAValue)
 {
-    const Value value(LateText("%d", 7));
+    const Value value(DeferredText("%d", 7));
     const Value copy = value;
     EXPECT_EQ(value.kind(), Value::Kind::string);
     EXPECT_EQ(value, Value("7"));

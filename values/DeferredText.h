@@ -15,20 +15,20 @@ namespace orvex {
 //
 // Holds a printf format and up to two arguments. What a const char* points to, the format included, has to
 // live as long as the program: a literal, a table's text.
-class LateText {
+class DeferredText {
 public:
     static constexpr std::size_t kMaximumArguments = 2;
 
     // The text as it stands.
-    explicit LateText(const char* text)
+    explicit DeferredText(const char* text)
         : _format(text)
-        , _print([](const LateText& late) { return std::string(late._format); })
+        , _print([](const DeferredText& late) { return std::string(late._format); })
     {
     }
     // What the function makes of a number.
-    LateText(std::string (*make)(double), double number)
+    DeferredText(std::string (*make)(double), double number)
         : _format(nullptr)
-        , _print([](const LateText& late) {
+        , _print([](const DeferredText& late) {
             return late.argument<std::string (*)(double)>(1)(late.argument<double>(0));
         })
     {
@@ -36,7 +36,7 @@ public:
         store(_arguments[1], make);
     }
     template <typename... Arguments>
-    explicit LateText(PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
+    explicit DeferredText(PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
         : _format(format.text())
         , _print(&printed<PrintfArgument<Arguments>...>)
     {
@@ -62,7 +62,7 @@ private:
         return result;
     }
     template <typename... Arguments>
-    static std::string printed(const LateText& late)
+    static std::string printed(const DeferredText& late)
     {
         return late.printWith<Arguments...>(std::index_sequence_for<Arguments...>());
     }
@@ -76,7 +76,7 @@ private:
     }
 
     const char* _format;
-    std::string (*_print)(const LateText&);
+    std::string (*_print)(const DeferredText&);
     std::array<std::uint64_t, kMaximumArguments> _arguments;
 };
 
