@@ -1,4 +1,4 @@
-// A capture file of any content, told apart and read to its end.
+// Detects the format of a capture file and reads it to its end.
 
 #include "FuzzTarget.h"
 #include "MemoryFile.h"
@@ -13,7 +13,7 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
     CaptureReader::Status status = reader->next();
     std::size_t messages = 0;
     for (; status == CaptureReader::Status::message; status = reader->next()) {
-        // A record becomes a message by a log type in front.
+        // A DLF record gains a log type when it becomes a message.
         fuzz::require(reader->message().size() <= size + 1, "a message is no longer than its file");
         fuzz::require(++messages <= size, "no more messages than bytes");
     }

@@ -1,5 +1,4 @@
-// A DLF, and the same bytes as the messages that a snapshot keeps of an interval: neither reader leaves a
-// byte out that it does not own up to.
+// Reads the input as a DLF and as the raw messages of a snapshot. Both readers account for every byte.
 
 #include "FuzzTarget.h"
 
@@ -21,7 +20,7 @@ void walkRecords(ByteView file)
         fuzz::require(record->bytes.size() >= kRecordHeader, "a record holds its header");
         fuzz::require(record->start + record->bytes.size() <= file.size(), "a record lies in the file");
         fuzz::require(record->bytes.data() == file.data() + record->start, "a record is the file's bytes");
-        // A log type may stand before a record, and a prefix of two bytes or what is left of one before that.
+        // A log type may precede a record, and all or part of a two-byte prefix may precede that.
         const std::size_t between = record->start - end - (records.skippedBytes() - skipped);
         fuzz::require(record->logType ? between >= 1 && between <= 3 : between == 0,
             "records and skipped bytes follow each other");

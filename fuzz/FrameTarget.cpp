@@ -1,4 +1,4 @@
-// A stream of frames that arrives in pieces of any length: the messages of the input.
+// Reads a stream of frames that arrives in pieces, one per message of the input.
 
 #include "FuzzTarget.h"
 #include "InputMessages.h"
@@ -9,7 +9,7 @@ namespace {
 
 using namespace orvex;
 
-// The frames that can be taken now, as the bytes that they came as.
+// Takes all complete frames and encodes them again.
 Bytes takeAll(FrameReader& reader)
 {
     Bytes taken;

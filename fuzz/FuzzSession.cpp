@@ -44,10 +44,10 @@ const char* templateName(const std::string& technology)
         {telephony::kTechnologyMRL_UTRAN2, "MRL_UTRAN2"},
     };
     const auto name = names.find(technology);
-    return name == names.end() ? nullptr : name->second; // IFX has none
+    return name == names.end() ? nullptr : name->second; // IFX has no template
 }
 
-// Read once: what is tried is not the file.
+// Cached, because reading the file is not under test.
 DictionaryRef ownTemplate(const std::string& technology)
 {
     static std::map<std::string, DictionaryRef> known;
@@ -100,7 +100,7 @@ void FuzzSession::run(InputMessages messages)
         if (!take(*message))
             return;
     }
-    if (refresh()) // what builds the display shows none yet
+    if (refresh()) // the first refresh builds the display, the next shows it
         finish(Ending::written);
 }
 

@@ -9,24 +9,22 @@
 
 namespace orvex::fuzz {
 
-// A session as it is lived: messages of any content, a refresh now and then, at the end all that is made of
-// it. All log lines are made, and dropped.
+// A session over messages of any content, with refreshes, that ends with its tree and snapshot. Log lines are
+// formatted and dropped.
 class FuzzSession {
 public:
-    // Over the technology's own template.
+    // Uses the technology's own template.
     explicit FuzzSession(const std::string& technology);
-    // Over another one in its place.
+    // Uses another template instead.
     FuzzSession(const std::string& technology, const DictionaryRef& skeleton);
 
-    // Returns at the end, or where the process would have ended by design.
+    // Takes all messages, or those up to one that ends the process by design.
     void run(InputMessages messages);
 
-    // The steps of a session that is not one run. False where the process would have ended by design: no
-    // other step may follow.
+    // Single steps. False when the process would have ended by design; no other step may follow.
     bool take(ByteView message);
     bool refresh();
-    // Makes the tree of the screens and a snapshot. To read again what was written takes twice as long as all
-    // the rest.
+    // Builds the tree and writes a snapshot. Reading both again takes twice as long as all the rest.
     enum class Ending { written, readAgain };
     void finish(Ending ending);
 

@@ -11,12 +11,12 @@
 #include <cstdio>
 #include <cstdlib>
 
-// What every target defines: takes one input and returns 0. A fault ends the process.
+// Defined by every target: takes one input and returns 0. A finding aborts the process.
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size);
 
 namespace orvex::fuzz {
 
-// Ends the process when something does not hold that does whatever the input is.
+// Aborts unless a property that every input must have holds.
 inline void require(bool holds, const char* what)
 {
     if (holds)
@@ -25,9 +25,8 @@ inline void require(bool holds, const char* what)
     std::abort();
 }
 
-// Runs a step of a session. False when it threw one of the exceptions that end the process by design: extra
-// packets, messages of IFX and templates that hold something else than they must. Nothing else is caught:
-// any other exception is a finding.
+// Runs a step of a session. Returns false if it threw one of the exceptions that end the process by design,
+// for extra packets, IFX messages and templates of the wrong kind. Any other exception is a finding.
 template <typename Step>
 bool survives(Step step)
 {

@@ -7,8 +7,8 @@
 
 namespace orvex::fuzz {
 
-// The messages of an input, back to back, each behind its length as a little-endian u16. A length that
-// reaches beyond the input takes what is left of it, so that every input is one.
+// Splits an input into messages, each preceded by its length as a little-endian u16. A length beyond the end
+// of the input takes the rest, so every input is valid.
 class InputMessages {
 public:
     explicit InputMessages(ByteView input)
@@ -16,7 +16,8 @@ public:
     {
     }
 
-    // A copy without a byte to spare, so that reading beyond it is seen. None at the end.
+    // The next message in an allocation of its exact size, so the sanitizer sees reads beyond it. None at the
+    // end.
     std::optional<Bytes> next();
     ByteView rest() const { return _rest; }
 

@@ -6,7 +6,7 @@
 
 namespace orvex::fuzz {
 
-// A file without a disk, for readers and writers that want a path. It goes when the object goes.
+// A file in memory for code that takes a path. Destroyed with the object.
 class MemoryFile {
 public:
     explicit MemoryFile(ByteView content = {});

@@ -1,4 +1,4 @@
-// Runs a target over the files of a directory, in a build without a fuzzer: replay CORPUS
+// Runs a target over a corpus without a fuzzer: replay CORPUS
 
 #include "FuzzTarget.h"
 
@@ -21,7 +21,8 @@ int main(int argc, char** argv)
         files.push_back(entry.path());
     std::ranges::sort(files);
     for (const fs::path& path : files) {
-        std::cout << path.filename().string() << std::endl; // before it is tried: the last one is at fault
+        std::cout << path.filename().string()
+                  << std::endl; // flushed first: the last name printed is at fault
         std::ifstream file(path, std::ios::binary);
         const std::vector<char> bytes(
             (std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());

@@ -1,5 +1,5 @@
-// A whole session: the first byte chooses the technology, the messages of the input are the pieces in which a
-// stream of frames arrives on the log channel. An empty piece is a refresh.
+// Runs a whole session. The first byte selects the technology; each message of the input is a piece of the
+// frame stream on the log channel, and an empty one is a refresh.
 
 #include "FuzzSession.h"
 #include "FuzzTarget.h"

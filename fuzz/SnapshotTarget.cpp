@@ -1,4 +1,4 @@
-// A snapshot file of any content, shown as the application and orvex-decode show it, written and read again.
+// Reads a snapshot file, shows it as the application and orvex-decode do, writes it and reads it again.
 
 #include "FuzzTarget.h"
 #include "MemoryFile.h"
@@ -34,7 +34,7 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
     const auto again = readSnapshot(copy.path());
     fuzz::require(again.snapshot.has_value(), "a snapshot that was written can be read");
     fuzz::require(again.snapshot->description == xmlText(read.snapshot->description),
-        "the description is kept, but for bytes that no text has");
+        "the description is kept, except for invalid bytes");
     fuzz::require(again.snapshot->data->size() == read.snapshot->data->size(), "the entries are kept");
     return 0;
 }

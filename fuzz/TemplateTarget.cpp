@@ -1,5 +1,5 @@
-// A template of any content under a technology, and a few packets. The first byte chooses the technology, the
-// first message is the template.
+// Decodes packets with any template. The first byte selects the technology; the first message is the
+// template.
 
 #include "FuzzSession.h"
 #include "FuzzTarget.h"
