@@ -6,6 +6,8 @@
 #include "SystemLog.h"
 #include "TextFormat.h"
 
+#include <utility>
+
 namespace orvex {
 
 namespace {
@@ -43,7 +45,7 @@ MRLLogGenerator::MRLLogGenerator(const GeneratorEnvironment& environment)
 {
 }
 
-BytesRef MRLLogGenerator::generateDlfFromState(const Dictionary& state) const
+std::optional<PiecedBytes> MRLLogGenerator::generateDlfFromState(const Dictionary& state) const
 {
     const auto& [resources, clock, buildVersion, rawPacketLimit] = environment();
     const std::string version = buildVersion ? text("Orvex %s", buildVersion->c_str()) : "(none)";
@@ -55,15 +57,18 @@ BytesRef MRLLogGenerator::generateDlfFromState(const Dictionary& state) const
         .isDaylightSaving = static_cast<std::uint8_t>(zone.isDaylightSaving ? 1 : 0),
     };
 
-    auto dlf = std::make_shared<Bytes>(kMTLDLFVersionReportLength);
+    const auto report = std::make_shared<Bytes>(kMTLDLFVersionReportLength);
     std::uint32_t written = 0;
-    const std::uint32_t result = MTLDLFAddVersionReport(dlf->data(), static_cast<std::uint32_t>(dlf->size()),
-        written, 1, 1, version.c_str(), kExecutableName, kBuildDate, time);
+    const std::uint32_t result =
+        MTLDLFAddVersionReport(report->data(), static_cast<std::uint32_t>(report->size()), written, 1, 1,
+            version.c_str(), kExecutableName, kBuildDate, time);
     if (result != 0) {
         systemLog(Priority::dlfFailure, "Could not write DLF header (result=%d)", static_cast<int>(result));
-        return nullptr;
+        return std::nullopt;
     }
 
+    PiecedBytes dlf;
+    dlf.append(report);
     const ArrayRef history = state["History"].array();
     if (!history)
         return dlf;
@@ -75,10 +80,10 @@ BytesRef MRLLogGenerator::generateDlfFromState(const Dictionary& state) const
         if (!packets) {
             systemLog(Priority::dlfFailure,
                 "Got wrong class writing history to DLF; aborting writing the DLF file");
-            return nullptr;
+            return std::nullopt;
         }
         if (packets->size() >= 2)
-            dlf->insert(dlf->end(), packets->begin() + 1, packets->end());
+            dlf.append(packets, 1);
     }
     return dlf;
 }
@@ -87,10 +92,10 @@ ArrayRef MRLLogGenerator::getSaveContentsFromState(const Dictionary& state) cons
 {
     const ArrayRef history = state["History"].array();
     auto contents = history ? history->shallowCopy() : Array::make();
-    if (const BytesRef dlf = generateDlfFromState(state)) {
+    if (auto dlf = generateDlfFromState(state)) {
         contents->append(Dictionary::make({
             {"Description", text("DLF binary (%d bytes)", static_cast<int>(dlf->size()))},
-            {"DLF", dlf},
+            {"DLF", std::move(*dlf)},
         }));
     }
     return contents;

@@ -22,8 +22,9 @@ public:
 
     // The version report followed by the raw packets of the history. Only the first byte of every history
     // entry is dropped: later packets of an entry keep their log type, and readers of these files know it.
-    // Null, with a log line, when an entry's "DisplayState" is something else than bytes.
-    BytesRef generateDlfFromState(const Dictionary& state) const;
+    // The packets are not copied. None, with a log line, when an entry's "DisplayState" is something else
+    // than bytes.
+    std::optional<PiecedBytes> generateDlfFromState(const Dictionary& state) const;
 
     // The history entries and, last, the DLF.
     ArrayRef getSaveContentsFromState(const Dictionary& state) const override;

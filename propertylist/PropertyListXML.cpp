@@ -102,7 +102,7 @@ private:
         case Value::Kind::real: return putReal(*value.real());
         case Value::Kind::boolean: return putLine(*value.boolean() ? "<true/>\n" : "<false/>\n");
         case Value::Kind::date: return putDate(*value.date());
-        case Value::Kind::data: return putData(*value.data());
+        case Value::Kind::data: return putData(value.dataPieces());
         case Value::Kind::array: return open(value.heldArray(), value.heldArray(), nullptr);
         case Value::Kind::dictionary:
             return open(value.heldDictionary(), nullptr, withKeysOfXML(value.dictionary()));
@@ -155,24 +155,36 @@ private:
         open(&uid, nullptr, Dictionary::make({{"CF$UID", number}}));
     }
 
-    void putData(const Bytes& data)
+    // Lines and groups of base64 run on from piece to piece.
+    void putData(const std::vector<ByteView>& pieces)
     {
         static constexpr std::size_t kMostTabs = 8;
         static constexpr std::size_t kWidth = 76; // with a tab as wide as eight characters
         const std::size_t tabs = std::min(_open.size(), kMostTabs);
         const std::size_t bytesALine = (kWidth - tabs * 8) / 4 * 3;
         putLine("<data>\n");
-        for (std::span<const std::uint8_t> rest(data); !rest.empty();) {
-            const auto line = rest.first(std::min(bytesALine, rest.size()));
-            rest = rest.subspan(line.size());
+        Bytes line;
+        const auto putBase64Line = [&] {
             _buffer.append(tabs, '\t');
             appendBase64(line);
             put("\n");
+            line.clear();
+        };
+        for (ByteView rest : pieces) {
+            while (!rest.empty()) {
+                const auto part = rest.first(std::min(bytesALine - line.size(), rest.size()));
+                rest = rest.subspan(part.size());
+                line.insert(line.end(), part.begin(), part.end());
+                if (line.size() == bytesALine)
+                    putBase64Line();
+            }
         }
+        if (!line.empty())
+            putBase64Line();
         putLine("</data>\n");
     }
 
-    void appendBase64(std::span<const std::uint8_t> bytes)
+    void appendBase64(ByteView bytes)
     {
         static constexpr char kDigits[] = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
         for (std::size_t i = 0; i < bytes.size(); i += 3) {

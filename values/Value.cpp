@@ -7,10 +7,29 @@
 
 namespace orvex {
 
+void PiecedBytes::append(BytesRef bytes, std::size_t offset)
+{
+    _size += bytes->size() - offset;
+    _pieces.push_back({std::move(bytes), offset});
+}
+
+std::vector<ByteView> PiecedBytes::pieces() const
+{
+    std::vector<ByteView> result;
+    for (const auto& [bytes, offset] : _pieces)
+        result.push_back(ByteView(*bytes).subspan(offset));
+    return result;
+}
+
 Value::Value(BytesRef data)
 {
     if (data)
         _content = std::move(data);
+}
+
+Value::Value(PiecedBytes data)
+    : _content(std::make_shared<const PiecedBytes>(std::move(data)))
+{
 }
 
 Value::Value(ArrayRef array)
@@ -29,6 +48,26 @@ Value::Value(Set set)
 {
     if (set.elements)
         _content = std::move(set);
+}
+
+std::vector<ByteView> Value::dataPieces() const
+{
+    if (const auto* pieced = std::get_if<PiecedBytesRef>(&_content))
+        return (*pieced)->pieces();
+    const auto& whole = reference<BytesRef>();
+    return whole ? std::vector{ByteView(*whole)} : std::vector<ByteView>();
+}
+
+void Value::joinPieces() const
+{
+    if (!std::holds_alternative<PiecedBytesRef>(_content))
+        return;
+    auto joined = std::make_shared<Bytes>();
+    const PiecedBytesRef& pieced = std::get<PiecedBytesRef>(_content);
+    joined->reserve(pieced->size());
+    for (const ByteView piece : pieced->pieces())
+        joined->insert(joined->end(), piece.begin(), piece.end());
+    _content = std::move(joined);
 }
 
 Value Value::shallowCopy() const

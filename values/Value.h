@@ -30,6 +30,25 @@ struct UID {
     friend bool operator==(const UID&, const UID&) = default;
 };
 
+// One run of bytes in pieces that others hold too, so that it takes no memory of its own.
+class PiecedBytes {
+public:
+    // All bytes from the offset on, which is at most their number.
+    void append(BytesRef bytes, std::size_t offset = 0);
+    std::size_t size() const { return _size; }
+    // In order; they live as long as this does.
+    std::vector<ByteView> pieces() const;
+
+private:
+    struct Piece {
+        BytesRef bytes;
+        std::size_t offset;
+    };
+
+    std::vector<Piece> _pieces;
+    std::size_t _size = 0;
+};
+
 // Elements in no order. They are not changed any more.
 struct Set {
     std::shared_ptr<const Array> elements;
@@ -42,6 +61,8 @@ struct Set {
 //
 // A text may be given as a DeferredText. Nobody can tell: it is made by whoever reads it first. For its sake
 // a value is read by one thread at a time.
+//
+// Data may be given as PiecedBytes. dataPieces() reads it as it is; data() makes it one buffer, for good.
 //
 // UIDs and sets come out of binary property lists alone. Nothing in Orvex makes use of them; they are kept so
 // that they are not taken for something else.
@@ -84,6 +105,7 @@ public:
     }
     // A null reference makes a null value.
     Value(BytesRef data);
+    Value(PiecedBytes data);
     Value(ArrayRef array);
     Value(DictionaryRef dictionary);
     Value(UID uid)
@@ -94,8 +116,10 @@ public:
 
     Kind kind() const
     {
-        return std::holds_alternative<DeferredText>(_content) ? Kind::string
-                                                              : static_cast<Kind>(_content.index());
+        if (std::holds_alternative<DeferredText>(_content))
+            return Kind::string;
+        return std::holds_alternative<PiecedBytesRef>(_content) ? Kind::data
+                                                                : static_cast<Kind>(_content.index());
     }
     bool isNull() const { return kind() == Kind::null; }
 
@@ -109,7 +133,13 @@ public:
     const double* real() const { return std::get_if<double>(&_content); }
     const bool* boolean() const { return std::get_if<bool>(&_content); }
     const Date* date() const { return std::get_if<Date>(&_content); }
-    BytesRef data() const { return reference<BytesRef>(); }
+    BytesRef data() const
+    {
+        joinPieces();
+        return reference<BytesRef>();
+    }
+    // The bytes of data; none when the value is of another kind.
+    std::vector<ByteView> dataPieces() const;
     ArrayRef array() const { return reference<ArrayRef>(); }
     DictionaryRef dictionary() const { return reference<DictionaryRef>(); }
     const UID* uid() const { return std::get_if<UID>(&_content); }
@@ -138,6 +168,8 @@ public:
     friend bool operator==(const Value& left, const Value& right);
 
 private:
+    using PiecedBytesRef = std::shared_ptr<const PiecedBytes>;
+
     template <typename Reference>
     const Reference& reference() const
     {
@@ -155,10 +187,11 @@ private:
         if (const auto* late = std::get_if<DeferredText>(&_content))
             _content = late->text();
     }
+    void joinPieces() const;
 
     // In the order of Kind.
     mutable std::variant<std::monostate, std::string, std::int64_t, double, bool, Date, BytesRef, ArrayRef,
-        DictionaryRef, UID, Set, DeferredText>
+        DictionaryRef, UID, Set, DeferredText, PiecedBytesRef>
         _content;
 };
 

@@ -26,8 +26,8 @@ class MRLLogGeneratorTest : public GeneratorFixture {
 public:
     Bytes dlfOf(const Dictionary& from, std::optional<std::string> version = "1.0") const
     {
-        const auto dlf = ProbeGenerator({resources, clock, std::move(version)}).generateDlfFromState(from);
-        return dlf ? *dlf : Bytes();
+        auto dlf = ProbeGenerator({resources, clock, std::move(version)}).generateDlfFromState(from);
+        return dlf ? *Value(std::move(*dlf)).data() : Bytes();
     }
 };
 

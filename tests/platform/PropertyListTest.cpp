@@ -131,6 +131,30 @@ TEST(PropertyList, WritesEachKindAsXML)
         EXPECT_EQ(propertyListFromData(propertyListXML(number).value()).value, Value(number));
 }
 
+// Pieces end inside of base64 groups, at their ends, at those of a line, and hold nothing.
+TEST(PropertyList, DataInPiecesIsWrittenAsIfItWereWhole)
+{
+    const auto bytes = std::make_shared<Bytes>();
+    for (int i = 0; i < 300; ++i)
+        bytes->push_back(static_cast<std::uint8_t>(i * 7));
+    for (const std::size_t length : {0U, 1U, 2U, 3U, 50U, 51U, 52U, 53U, 150U}) {
+        PiecedBytes pieced;
+        Bytes whole;
+        for (const std::size_t size : {length, std::size_t{0}, std::size_t{1}, length}) {
+            const auto piece =
+                std::make_shared<Bytes>(bytes->end() - static_cast<std::ptrdiff_t>(size), bytes->end());
+            piece->insert(piece->begin(), 3, 0xEE); // not part of it
+            pieced.append(piece, 3);
+            whole.insert(whole.end(), piece->begin() + 3, piece->end());
+        }
+        EXPECT_EQ(pieced.size(), whole.size());
+        const Value value = std::move(pieced);
+        EXPECT_EQ(propertyListXML(Array::make({value})), propertyListXML(Array::make({data(whole)})))
+            << length;
+        EXPECT_EQ(value, data(whole)) << length;
+    }
+}
+
 TEST(PropertyList, WritesBinaryListsThatAreReadAsTheyWere)
 {
     const auto list = Dictionary::make({{"z", Array::make({"a<b>&", "\uFEFF\u00e4", "", Array::make()})},
