@@ -24,34 +24,25 @@ void Base::updateLogCodeDict(CodeDictionary& codeDict)
 
 void Base::updateSectionRef(const Value& container)
 {
-    _sectionRef.dictionary = container.dictionary();
-    _sectionRef.array = container.array();
+    _dictionary = container.dictionary();
+    _array = container.array();
     systemLogText(Priority::warning, getSectionName());
 }
 
-void Base::clearElementsInArray(Array& array)
+void Base::clearElementsInArray(const ArrayRef& array)
 {
     const ArrayLockScope lock;
-    array.removeAll();
+    if (array)
+        array->removeAll();
 }
 
-void Base::replaceArray(Array& array, const Array& with)
+void Base::replaceArray(const ArrayRef& array, const Array& with)
 {
     const ArrayLockScope lock;
-    array.removeAll();
-    array.appendAll(with);
-}
-
-void Base::clearSection() const
-{
-    if (Array* bound = array())
-        clearElementsInArray(*bound);
-}
-
-void Base::replaceSection(const Array& with) const
-{
-    if (Array* bound = array())
-        replaceArray(*bound, with);
+    if (!array)
+        return;
+    array->removeAll();
+    array->appendAll(with);
 }
 
 void Base::reportUnknown(LogCode logCode)

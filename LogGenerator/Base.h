@@ -1,11 +1,8 @@
 #pragma once
 
-#include "Bound.h"
 #include "CodeDictionary.h"
 #include "PacketReader.h"
 #include "RowList.h"
-
-#include "ArrayLock.h"
 
 #include <map>
 #include <memory>
@@ -36,9 +33,10 @@ public:
     // Binds the section to its container.
     void updateSectionRef(const Value& container);
 
-    // Arrays bound to sections change only through these two and refillSection(), which take the array lock.
-    static void clearElementsInArray(Array& array);
-    static void replaceArray(Array& array, const Array& with);
+    // Arrays of the display change only through these two and RowList, which all take the array lock. A null
+    // array is left alone.
+    static void clearElementsInArray(const ArrayRef& array);
+    static void replaceArray(const ArrayRef& array, const Array& with);
 
     // Ec/No in whole dB of a linear energy ratio in which 2^19 stands for 0 dB. The bands at both ends are
     // peculiar: full scale and above yield 0, the two lowest bands both -31, and below 706 it is 0 again.
@@ -49,55 +47,22 @@ protected:
     Base(std::string sectionName, std::vector<LogCode> logCodes, ClassDictionary& dict,
         CodeDictionary& codeDict);
 
-    // The bound dictionary, to write into; a writer over nothing while none is bound.
-    RowWriter rows() const { return RowWriter(_sectionRef.dictionary.get()); }
+    // Writes into the bound dictionary; drops everything while none is bound.
+    RowWriter rows() const { return RowWriter(_dictionary.lock()); }
     // The bound array; null while none is bound.
-    Array* array() const { return _sectionRef.array.get(); }
-    // The two array operations on the bound array, if there is one.
-    void clearSection() const;
-    void replaceSection(const Array& with) const;
-    // Fills the bound array anew, under the array lock: fill(RowList&).
-    template <typename Filler>
-    void fillSection(Filler fill) const
-    {
-        const ArrayLockScope lock;
-        RowList list(array());
-        fill(list);
-    }
-    // The same with one row dictionary a record, written by print(RowWriter&, record).
-    template <typename Records, typename Printer>
-    void refillSection(const Records& records, Printer print) const
-    {
-        fillSection([&](RowList& list) { printRecords(list, records, print); });
-    }
-    // A new array of such dictionaries, to be set as a row.
-    template <typename Records, typename Printer>
-    static ArrayRef listOf(const Records& records, Printer print)
-    {
-        auto result = Array::make();
-        RowList list(result.get());
-        printRecords(list, records, print);
-        return result;
-    }
+    ArrayRef array() const { return _array.lock(); }
 
     // "Received an unknown log message: %d"
     static void reportUnknown(LogCode logCode);
 
 private:
-    template <typename Records, typename Printer>
-    static void printRecords(RowList& list, const Records& records, Printer print)
-    {
-        for (const auto& record : records)
-            print(list.next(), record);
-    }
     void updateLogCodeDict(CodeDictionary& codeDict);
 
     std::string _sectionName;
     std::vector<LogCode> _logCodes;
-    struct {
-        Bound<Dictionary> dictionary;
-        Bound<Array> array;
-    } _sectionRef; // one of the two, or neither
+    // The sectionRef: one of the two, or neither.
+    std::weak_ptr<Dictionary> _dictionary;
+    std::weak_ptr<Array> _array;
 };
 
 } // namespace orvex

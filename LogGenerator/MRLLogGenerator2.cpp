@@ -113,8 +113,8 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
 
 bool MRLLogGenerator2::isBoundToDisplayOf(const Dictionary& state) const
 {
-    const Dictionary* display = state["Display"].heldDictionary();
-    return display && display == _boundDisplay.get();
+    const DictionaryRef display = state["Display"].dictionary();
+    return display && display == _boundDisplay.lock();
 }
 
 Value MRLLogGenerator2::processTemplate(const Value& object)

@@ -62,9 +62,9 @@ private:
     void bindToDisplay(const Value& templateObject, const Value& display);
     void bindSection(std::string_view name, const Value& container);
 
-    std::string _pListName;              // empty in a generator that was never set up
-    std::unique_ptr<ClassIndex> _cIndex; // null then
-    Bound<Dictionary> _boundDisplay;     // whose entries the sections write into
+    std::string _pListName;                  // empty in a generator that was never set up
+    std::unique_ptr<ClassIndex> _cIndex;     // null then
+    std::weak_ptr<Dictionary> _boundDisplay; // whose entries the sections write into
 };
 
 } // namespace orvex

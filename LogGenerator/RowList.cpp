@@ -4,14 +4,20 @@ namespace orvex {
 
 RowWriter& RowList::next()
 {
+    _row.end();
     if (!_list)
         return _row;
-    _row.end();
     Value& element = nextElement();
     if (!element.ownDictionary())
         element = Dictionary::make();
-    _row = RowWriter::anew(element.ownDictionary());
+    _row = RowWriter::anew(*element.ownDictionary());
     return _row;
+}
+
+void RowList::append(DeferredText text)
+{
+    if (_list)
+        nextElement().set(text);
 }
 
 Value& RowList::nextElement()

@@ -3,33 +3,37 @@
 #include "RowWriter.h"
 
 #include "Array.h"
+#include "ArrayLock.h"
 
 namespace orvex {
 
-// Fills a list of the display anew, a row dictionary for each record. Dictionaries and texts that are there,
-// and that nobody else holds, are written into again: lists change with nearly every packet, and most of the
-// work would be to make the same rows anew.
+// Fills a list of the display anew, with a row dictionary or a text for each record, and holds the array lock
+// meanwhile. At its end the list has exactly the records written. Without a list it drops them.
 //
-// The list ends with the last record when the RowList does. One over nothing drops what it is given. Who
-// fills a published list holds the array lock.
+// Dictionaries and texts that nobody else holds are reused: lists change with nearly every packet, and making
+// the same rows again would be most of the work.
+//
+// Never nest two of these: the array lock does not give nested holds back.
 class RowList {
 public:
-    explicit RowList(Array* list)
-        : _list(list)
-        , _row(RowWriter::anew(nullptr))
+    explicit RowList(ArrayRef list)
+        : _list(std::move(list))
     {
     }
     ~RowList();
     RowList(const RowList&) = delete;
     RowList& operator=(const RowList&) = delete;
 
-    // The rows of the next record, to be written until the next call.
+    // Begins the next record. The writer is valid until the next call.
     RowWriter& next();
+    // A record that is a text.
+    void append(DeferredText text);
 
 private:
     Value& nextElement();
 
-    Array* _list;
+    ArrayLockScope _lock;
+    ArrayRef _list;
     RowWriter _row;
     std::size_t _count = 0;
 };

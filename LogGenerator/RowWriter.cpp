@@ -4,21 +4,30 @@ namespace orvex {
 
 Value& RowWriter::slotElsewhere(std::string_view name)
 {
-    // What stands from here on is left from before. As the next row is another one it goes, and the order is
-    // the same as if the dictionary had been empty.
+    // The rows from here on are left over from before. The next row is a different one, so they go: the order
+    // is then the same as in a dictionary that was empty.
     end();
     std::size_t position = 0;
     Value& value = _dictionary->slot(name, position);
-    _next = _isWrittenAnew ? _dictionary->size() : position + 1; // it may be a row that was set already
+    _next = _isWrittenAnew ? _dictionary->size() : position + 1; // the row may have been set already
     return value;
+}
+
+ArrayRef RowWriter::list(std::string_view name)
+{
+    if (!_dictionary)
+        return nullptr;
+    Value& value = slot(name);
+    if (!value.ownArray())
+        value = Array::make();
+    return value.array();
 }
 
 void RowWriter::remove(std::string_view name)
 {
     if (!_dictionary)
         return;
-    if (_isWrittenAnew)
-        end();
+    end();
     _dictionary->remove(name);
     _next = _isWrittenAnew ? _dictionary->size() : 0;
 }

@@ -1,25 +1,29 @@
 #pragma once
 
+#include "Array.h"
 #include "Dictionary.h"
 
 namespace orvex {
 
 // Writes rows, name and text, into one dictionary of the display: a section's own, or a record's in a list.
-// A writer over nothing drops what it is given.
+// A writer without a dictionary drops what it is given.
 //
-// Texts are made when they are read (DeferredText): a const char* given to setText() has to live as long
-// as the program.
+// Texts are formatted when they are read (DeferredText), so a const char* given to setText() must live as
+// long as the program.
 class RowWriter {
 public:
-    // Sets rows and leaves the others. The dictionary outlives the writer.
-    explicit RowWriter(Dictionary* dictionary)
-        : _dictionary(dictionary)
+    RowWriter() = default;
+    // Sets rows and leaves the others.
+    explicit RowWriter(DictionaryRef dictionary)
+        : _dictionary(dictionary.get())
+        , _share(std::move(dictionary))
     {
     }
-    // Writes a dictionary anew: only what is set from now on is in it after end().
-    static RowWriter anew(Dictionary* dictionary)
+    // Writes the dictionary anew: after end() it has only the rows set here. It outlives the writer.
+    static RowWriter anew(Dictionary& dictionary)
     {
-        RowWriter rows(dictionary);
+        RowWriter rows;
+        rows._dictionary = &dictionary;
         rows._isWrittenAnew = true;
         return rows;
     }
@@ -42,11 +46,14 @@ public:
         if (_dictionary)
             slot(name).set(DeferredText(format, arguments...));
     }
+    // The list in this row, to be filled by a RowList. An array that somebody else holds is replaced, not
+    // changed: it may be part of an older history entry.
+    ArrayRef list(std::string_view name);
     void remove(std::string_view name);
 
     void end()
     {
-        if (_isWrittenAnew && _dictionary && _next < _dictionary->size())
+        if (_isWrittenAnew && _next < _dictionary->size())
             _dictionary->removeFrom(_next);
     }
 
@@ -64,7 +71,8 @@ private:
     }
     Value& slotElsewhere(std::string_view name);
 
-    Dictionary* _dictionary;
+    Dictionary* _dictionary = nullptr;
+    DictionaryRef _share;  // null for a record, whose list holds it
     std::size_t _next = 0; // where the next row is expected
     bool _isWrittenAnew = false;
 };

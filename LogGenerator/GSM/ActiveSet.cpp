@@ -11,18 +11,17 @@ void ActiveSet::update(const LogCode_0x417A& report)
 {
     const auto cells = report.cells();
     const auto energies = report.energies();
-    fillSection([&](RowList& list) {
-        // Energies stand behind all cells: where a cell's energies are in the packet, so is the cell.
-        for (std::size_t i = 0; i < energies.countInside(); ++i) {
-            if (!cells[i].isActive())
-                continue;
-            const int ecNo = lookUpECNO(energies[i].ecIo());
-            RowWriter& row = list.next();
-            row.setText("Scrambling Code", "%d", cells[i].primaryScramblingCode());
-            row.setText("RSCP", "%d dB", report.rssi() + ecNo); // shown so, though it is dBm
-            row.setText("Energy Per Chip", "%d dB", ecNo);
-        }
-    });
+    RowList list(array());
+    // Energies stand behind all cells: where a cell's energies are in the packet, so is the cell.
+    for (std::size_t i = 0; i < energies.countInside(); ++i) {
+        if (!cells[i].isActive())
+            continue;
+        const int ecNo = lookUpECNO(energies[i].ecIo());
+        RowWriter& row = list.next();
+        row.setText("Scrambling Code", "%d", cells[i].primaryScramblingCode());
+        row.setText("RSCP", "%d dB", report.rssi() + ecNo); // shown so, though it is dBm
+        row.setText("Energy Per Chip", "%d dB", ecNo);
+    }
 }
 
 } // namespace orvex

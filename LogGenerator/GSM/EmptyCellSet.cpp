@@ -10,7 +10,7 @@ EmptyCellSet::EmptyCellSet(
 
 void EmptyCellSet::update(const LogCode_0x417A& /*report*/)
 {
-    clearSection();
+    clearElementsInArray(array());
 }
 
 } // namespace orvex

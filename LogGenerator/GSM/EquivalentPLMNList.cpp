@@ -2,16 +2,6 @@
 
 namespace orvex {
 
-namespace {
-
-void printRecord(RowWriter& row, const LogCode_0x7150::PLMN& plmn)
-{
-    row.setText("Mobile Country Code", "%d", plmn.mobileCountryCode());
-    row.setText("Mobile Network Code", "%d", plmn.mobileNetworkCode());
-}
-
-} // namespace
-
 EquivalentPLMNList::EquivalentPLMNList(ClassDictionary& dict, CodeDictionary& codeDict)
     : PacketSection("Equivalent PLMN List", dict, codeDict)
 {
@@ -19,7 +9,12 @@ EquivalentPLMNList::EquivalentPLMNList(ClassDictionary& dict, CodeDictionary& co
 
 void EquivalentPLMNList::update(const LogCode_0x7150& report)
 {
-    refillSection(report.plmns(), printRecord);
+    RowList list(array());
+    for (const auto& plmn : report.plmns()) {
+        RowWriter& row = list.next();
+        row.setText("Mobile Country Code", "%d", plmn.mobileCountryCode());
+        row.setText("Mobile Network Code", "%d", plmn.mobileNetworkCode());
+    }
 }
 
 } // namespace orvex

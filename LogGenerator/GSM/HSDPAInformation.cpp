@@ -9,12 +9,16 @@ namespace {
 constexpr EnumText kCarrierConfigurations[] = {
     {0, "Single Carrier"}, {1, "MIMO"}, {2, "Dual Carrier"}, {3, "Reserved"}};
 
-void printRecord(RowWriter& row, const LogCode_0x4221::Process& process)
+void printProcesses(ArrayRef array, const RecordList<LogCode_0x4221::Process>& processes)
 {
-    row.setText("Process ID", "%u", process.identity());
-    row.setText("No Rx Bits", "%u", process.receivedBits());
-    row.setText("New Tx", "%u", process.newTransmissions());
-    row.setText("Block Errors", "%u", process.blockErrors());
+    RowList list(std::move(array));
+    for (const auto& process : processes) {
+        RowWriter& row = list.next();
+        row.setText("Process ID", "%u", process.identity());
+        row.setText("No Rx Bits", "%u", process.receivedBits());
+        row.setText("New Tx", "%u", process.newTransmissions());
+        row.setText("Block Errors", "%u", process.blockErrors());
+    }
 }
 
 } // namespace
@@ -31,9 +35,9 @@ void HSDPAInformation::update(const LogCode_0x4221& report)
     row.setText("Sub Frames", "%u", report.subframes());
     row.setText("Carrier Info", textFor(report.carrierConfiguration(), kCarrierConfigurations, ""));
     if (report.primaryProcesses().count() > 0)
-        row.set("Primary HARQ Process", listOf(report.primaryProcesses(), printRecord));
+        printProcesses(row.list("Primary HARQ Process"), report.primaryProcesses());
     if (report.secondaryProcesses().count() > 0)
-        row.set("Secondary HARQ Process", listOf(report.secondaryProcesses(), printRecord));
+        printProcesses(row.list("Secondary HARQ Process"), report.secondaryProcesses());
 }
 
 } // namespace orvex

@@ -11,10 +11,9 @@ void MobileAllocation::update(const LogCode_0x51F8& report)
 {
     RowWriter row = rows();
     row.setText("HSN", "%d", report.hoppingSequenceNumber());
-    auto channels = Array::make();
+    RowList channels(row.list("ARFCNs"));
     for (const auto& channel : report.channels())
-        channels->append(DeferredText("%d", channel.arfcn()));
-    row.set("ARFCNs", channels);
+        channels.append(DeferredText("%d", channel.arfcn()));
 }
 
 } // namespace orvex

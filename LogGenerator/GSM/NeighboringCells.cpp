@@ -12,11 +12,6 @@ constexpr CellEntry kCellEntries[] = {
     {telephony::kCellRSSI, "RSSI", "RSSI", CellNumber::levelBy2, " dBm"},
 };
 
-void printCellRecord(RowWriter& row, const CellRecord& cell)
-{
-    printCell(row, cell, kCellEntries, "NeighboringCells");
-}
-
 } // namespace
 
 NeighboringCells::NeighboringCells(ClassDictionary& dict, CodeDictionary& codeDict)
@@ -24,19 +19,17 @@ NeighboringCells::NeighboringCells(ClassDictionary& dict, CodeDictionary& codeDi
 {
 }
 
-void NeighboringCells::printNeighbor(RowWriter& row, const LogCode_0x5137::Neighbor& neighbor) const
-{
-    row.setText("ARFCN", "%d", neighbor.arfcn());
-    row.setText("RSSI", "%d", neighbor.receiveLevel());
-    row.setText("C1 Value", "%d", neighbor.c1());
-    if (const auto known = _arfcnToBsic.find(neighbor.arfcn()); known != _arfcnToBsic.end())
-        row.setText("BSIC", "%d", known->second);
-}
-
 void NeighboringCells::update(const LogCode_0x5137& report)
 {
-    refillSection(
-        report.neighbors(), [this](RowWriter& row, const auto& neighbor) { printNeighbor(row, neighbor); });
+    RowList list(array());
+    for (const auto& neighbor : report.neighbors()) {
+        RowWriter& row = list.next();
+        row.setText("ARFCN", "%d", neighbor.arfcn());
+        row.setText("RSSI", "%d", neighbor.receiveLevel());
+        row.setText("C1 Value", "%d", neighbor.c1());
+        if (const auto known = _arfcnToBsic.find(neighbor.arfcn()); known != _arfcnToBsic.end())
+            row.setText("BSIC", "%d", known->second);
+    }
 }
 
 void NeighboringCells::update(const LogCode_0x51FF& report)
@@ -49,7 +42,9 @@ void NeighboringCells::update(const LogCode_0x51FF& report)
 void NeighboringCells::update(const CellMonitorList& list)
 {
     list.reportIfAbsent();
-    refillSection(list.findAll(telephony::kRadioGSM, telephony::kCellTypeNeighbor), printCellRecord);
+    RowList rows(array());
+    for (const CellRecord& cell : list.findAll(telephony::kRadioGSM, telephony::kCellTypeNeighbor))
+        printCell(rows.next(), cell, kCellEntries, "NeighboringCells");
 }
 
 } // namespace orvex

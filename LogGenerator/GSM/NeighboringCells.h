@@ -21,8 +21,6 @@ protected:
     void update(const CellMonitorList& list) override;
 
 private:
-    void printNeighbor(RowWriter& row, const LogCode_0x5137::Neighbor& neighbor) const;
-
     std::map<int, int> _arfcnToBsic; // of the last 0x51FF; the neighbours themselves come without BSIC
 };
 

@@ -18,7 +18,7 @@ void PDPContextList::updateWithData(Packet packet, LogCode)
     if (!list.value)
         throw UnknownDataException("PDP context list: " + list.error);
     if (const ArrayRef contexts = list.value->array())
-        replaceSection(*contexts);
+        replaceArray(array(), *contexts);
 }
 
 } // namespace orvex

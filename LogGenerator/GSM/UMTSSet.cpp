@@ -13,21 +13,6 @@ constexpr CellEntry kCellEntries[] = {
     {telephony::kCellECN0, "Energy Per Chip", "Energy Per Chip", CellNumber::level, " dB"},
 };
 
-void printCellRecord(RowWriter& row, const CellRecord& cell)
-{
-    printCell(row, cell, kCellEntries, "UMTSSet");
-}
-
-void printRankedCell(RowWriter& row, const LogCode_0x4005::UMTSCell& cell)
-{
-    row.setText("Scrambling Code", "%d", cell.primaryScramblingCode());
-    row.setText("RSCP", "%d dB", cell.rscp()); // shown so, though it is dBm
-    row.setText("Energy Per Chip", "%f dB", cell.ecNo());
-    row.setText("Downlink Frequency", "%d", cell.downlinkUARFCN());
-    row.setText("Ranking Value", "%d", cell.rankingValue());
-    row.setText("Rank Cell RSCP", "%d dB", cell.rankingRSCP());
-}
-
 } // namespace
 
 UMTSSet::UMTSSet(ClassDictionary& dict, CodeDictionary& codeDict)
@@ -37,13 +22,24 @@ UMTSSet::UMTSSet(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void UMTSSet::update(const LogCode_0x4005& report)
 {
-    refillSection(report.umtsCells(), printRankedCell);
+    RowList list(array());
+    for (const auto& cell : report.umtsCells()) {
+        RowWriter& row = list.next();
+        row.setText("Scrambling Code", "%d", cell.primaryScramblingCode());
+        row.setText("RSCP", "%d dB", cell.rscp()); // shown so, though it is dBm
+        row.setText("Energy Per Chip", "%f dB", cell.ecNo());
+        row.setText("Downlink Frequency", "%d", cell.downlinkUARFCN());
+        row.setText("Ranking Value", "%d", cell.rankingValue());
+        row.setText("Rank Cell RSCP", "%d dB", cell.rankingRSCP());
+    }
 }
 
 void UMTSSet::update(const CellMonitorList& list)
 {
     list.reportIfAbsent();
-    refillSection(list.findAll(telephony::kRadioUMTS, telephony::kCellTypeNeighbor), printCellRecord);
+    RowList rows(array());
+    for (const CellRecord& cell : list.findAll(telephony::kRadioUMTS, telephony::kCellTypeNeighbor))
+        printCell(rows.next(), cell, kCellEntries, "UMTSSet");
 }
 
 } // namespace orvex

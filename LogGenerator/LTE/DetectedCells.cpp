@@ -2,15 +2,6 @@
 
 namespace orvex {
 
-namespace {
-
-void printRecord(RowWriter& row, const LogCode_0xB179::DetectedCell& cell)
-{
-    row.setText("Physical Cell ID", "%d", cell.physicalCellIdentity());
-}
-
-} // namespace
-
 DetectedCells::DetectedCells(ClassDictionary& dict, CodeDictionary& codeDict)
     : PacketSection("Detected Cells", dict, codeDict)
 {
@@ -18,7 +9,11 @@ DetectedCells::DetectedCells(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void DetectedCells::update(const LogCode_0xB179& report)
 {
-    refillSection(report.detectedCells(), printRecord);
+    RowList list(array());
+    for (const auto& cell : report.detectedCells()) {
+        RowWriter& row = list.next();
+        row.setText("Physical Cell ID", "%d", cell.physicalCellIdentity());
+    }
 }
 
 } // namespace orvex

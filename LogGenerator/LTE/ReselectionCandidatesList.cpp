@@ -48,13 +48,6 @@ void printTechnologyFields(RowWriter& row, const LogCode_0xB186::Candidate& cand
     }
 }
 
-void printRecord(RowWriter& row, const LogCode_0xB186::Candidate& candidate)
-{
-    row.setText("Candidate Priority", "%d", candidate.priority());
-    row.setText("Candidate RAT Type", textFor(candidate.technology(), kTechnologies, "??"));
-    printTechnologyFields(row, candidate);
-}
-
 } // namespace
 
 ReselectionCandidatesList::ReselectionCandidatesList(ClassDictionary& dict, CodeDictionary& codeDict)
@@ -64,13 +57,15 @@ ReselectionCandidatesList::ReselectionCandidatesList(ClassDictionary& dict, Code
 
 void ReselectionCandidatesList::update(const LogCode_0xB186& report)
 {
-    fillSection([&](RowList& list) {
-        for (const auto& candidate : report.candidates()) {
-            if (!candidate.isComplete())
-                break;
-            printRecord(list.next(), candidate);
-        }
-    });
+    RowList list(array());
+    for (const auto& candidate : report.candidates()) {
+        if (!candidate.isComplete())
+            break;
+        RowWriter& row = list.next();
+        row.setText("Candidate Priority", "%d", candidate.priority());
+        row.setText("Candidate RAT Type", textFor(candidate.technology(), kTechnologies, "??"));
+        printTechnologyFields(row, candidate);
+    }
 }
 
 } // namespace orvex

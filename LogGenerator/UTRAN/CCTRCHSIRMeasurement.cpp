@@ -2,20 +2,6 @@
 
 namespace orvex {
 
-namespace {
-
-void printRecord(RowWriter& row, const LogCode_0xD00C::CompositeChannel& channel)
-{
-    row.setText("CCTRCH ID", "%d", channel.identity());
-    row.setText("TSNUM", "%d", channel.timeSlotNumber());
-    auto ratios = Array::make();
-    for (std::size_t i = 0; i < LogCode_0xD00C::CompositeChannel::kSIRCount; ++i)
-        ratios->append(DeferredText("%d", channel.sir(i)));
-    row.set("SIR", ratios);
-}
-
-} // namespace
-
 CCTRCHSIRMeasurement::CCTRCHSIRMeasurement(ClassDictionary& dict, CodeDictionary& codeDict)
     : PacketSection(
         "CCTRCH SIR", {Priority::warning, "CCTRCH SIR Measurement"}, OtherCodes::areIgnored, dict, codeDict)
@@ -24,7 +10,16 @@ CCTRCHSIRMeasurement::CCTRCHSIRMeasurement(ClassDictionary& dict, CodeDictionary
 
 void CCTRCHSIRMeasurement::update(const LogCode_0xD00C& report)
 {
-    refillSection(report.compositeChannels(), printRecord);
+    RowList list(array());
+    for (const auto& channel : report.compositeChannels()) {
+        RowWriter& row = list.next();
+        row.setText("CCTRCH ID", "%d", channel.identity());
+        row.setText("TSNUM", "%d", channel.timeSlotNumber());
+        auto ratios = Array::make();
+        for (std::size_t i = 0; i < LogCode_0xD00C::CompositeChannel::kSIRCount; ++i)
+            ratios->append(DeferredText("%d", channel.sir(i)));
+        row.set("SIR", ratios);
+    }
 }
 
 } // namespace orvex

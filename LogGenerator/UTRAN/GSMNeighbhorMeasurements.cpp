@@ -25,7 +25,7 @@ GSMNeighbhorMeasurements::GSMNeighbhorMeasurements(ClassDictionary& dict, CodeDi
 
 void GSMNeighbhorMeasurements::update(const LogCode_0xD00E& report)
 {
-    clearSection();
+    clearElementsInArray(array());
     RowList nowhere(nullptr); // the list on screen has always been empty
     for (const auto& neighbor : report.neighbors())
         printRecord(nowhere.next(), neighbor);

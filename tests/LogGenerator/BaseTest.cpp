@@ -18,7 +18,7 @@ public:
         : Base(name, std::move(codes), dict, codeDict)
     {
     }
-    void updateWithData(Packet, LogCode) override { replaceSection(Array({"new"})); }
+    void updateWithData(Packet, LogCode) override { replaceArray(array(), Array({"new"})); }
 };
 
 class ProbeIndex final : public ClassIndex {

@@ -9,9 +9,9 @@ namespace {
 
 using Records = std::vector<std::vector<std::pair<const char*, int>>>; // rows of each record
 
-void fill(Array& list, const Records& records)
+void fill(const ArrayRef& list, const Records& records)
 {
-    RowList rows(&list);
+    RowList rows(list);
     for (const auto& record : records) {
         RowWriter& row = rows.next();
         for (const auto& [name, number] : record)
@@ -44,36 +44,36 @@ TEST(RowListTest, HoldsWhatWasWrittenLast)
         {{{"A", 1}, {"B", 2}, {"A", 3}, {"C", 4}}},             // a row set twice keeps its place
         {{{"A", 1}, {"B", 2}, {"C", 3}}},
     };
-    Array list;
+    const auto list = Array::make();
     for (const Records& step : kSteps) {
         fill(list, step);
-        Array fromNothing;
+        const auto fromNothing = Array::make();
         fill(fromNothing, step);
-        EXPECT_EQ(described(list), described(fromNothing));
+        EXPECT_EQ(described(*list), described(*fromNothing));
     }
-    EXPECT_EQ(described(list), "A=1 B=2 C=3 | ");
+    EXPECT_EQ(described(*list), "A=1 B=2 C=3 | ");
 }
 
 TEST(RowListTest, RemovedRowsAreGone)
 {
-    Array list;
+    const auto list = Array::make();
     for (int i = 0; i < 2; ++i) {
-        RowList rows(&list);
+        RowList rows(list);
         RowWriter& row = rows.next();
         row.set("A", "1");
         row.set("B", "2");
         row.remove("A");
         row.set("C", "3");
     }
-    EXPECT_EQ(described(list), "B=2 C=3 | ");
+    EXPECT_EQ(described(*list), "B=2 C=3 | ");
 }
 
 TEST(RowListTest, LeavesWhatSomebodyElseHoldsAndElementsOfAnotherKind)
 {
     const auto kept = Dictionary::make({{"Z", "1"}});
-    Array list({"text", kept});
+    const auto list = Array::make({"text", kept});
     fill(list, {{{"A", 1}}, {{"A", 2}}});
-    EXPECT_EQ(described(list), "A=1 | A=2 | ");
+    EXPECT_EQ(described(*list), "A=1 | A=2 | ");
     fill(list, {});
     fill(list, {{{"A", 3}}});
     EXPECT_EQ(*kept, Dictionary({{"Z", "1"}}));
@@ -82,7 +82,7 @@ TEST(RowListTest, LeavesWhatSomebodyElseHoldsAndElementsOfAnotherKind)
 TEST(RowsTest, KeepsTheOthersAndTheirOrder)
 {
     const auto dictionary = Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}});
-    RowWriter rows(dictionary.get());
+    RowWriter rows(dictionary);
     rows.setText("C", "%d", 30);
     rows.setText("A", "%d", 10);
     rows.set("D", "40");

@@ -51,8 +51,9 @@ TEST(ArrayLock, IsTakenByWhoeverWalksOrChangesAPublishedArray)
                 NodesByPath nodes;
                 OrvexModelNode::makeTreeFromObject(array, nodes);
             }},
-        {"clear", [&array] { Base::clearElementsInArray(*array); }},
-        {"replace", [&array] { Base::replaceArray(*array, Array({"new"})); }},
+        {"clear", [&array] { Base::clearElementsInArray(array); }},
+        {"fill", [&array] { RowList(array).append(DeferredText("filled")); }},
+        {"replace", [&array] { Base::replaceArray(array, Array({"new"})); }},
     };
     for (const auto& [name, use] : users) {
         ArrayLock::lockArray();
