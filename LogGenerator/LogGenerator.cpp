@@ -23,7 +23,7 @@ DictionaryRef entryEndingAtFirstAbsent(std::initializer_list<Dictionary::Entry> 
     for (const auto& [key, value] : entries) {
         if (value.isNull())
             break;
-        // Bytes are replaced in the state, never changed: they need no copy of their own.
+        // Byte buffers in the state are replaced, never changed, so they need no copy.
         result->set(key, value.data() ? value : value.shallowCopy());
     }
     return result;
@@ -36,24 +36,24 @@ LogGenerator::LogGenerator(const GeneratorEnvironment& environment)
     systemLog(Priority::warning, "Creating Log object: %p", static_cast<const void*>(this));
 }
 
-std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
-    const Value& technology, const GeneratorEnvironment& environment)
+std::span<const Technology> technologies()
 {
-    using Maker = std::unique_ptr<LogGenerator> (*)(const GeneratorEnvironment&);
-    struct Choice {
-        const char* technology;
-        Maker generator;
-    };
-    static constexpr Choice kChoices[] = {
+    static constexpr Technology kTechnologies[] = {
         {telephony::kTechnologyIFX, &GSMLogGenerator::generator},
         {telephony::kTechnologyMRL_GSM, &MRL_GSMLogGenerator::generator},
         {telephony::kTechnologyMRL_CDMA, &C2KLogGenerator::generator},
         {telephony::kTechnologyMRL_LTE, &LTELogGenerator::generator},
         {telephony::kTechnologyMRL_UTRAN2, &UTRANLogGenerator::generator},
     };
-    for (const Choice& choice : kChoices) {
-        if (technology == Value(choice.technology))
-            return choice.generator(environment);
+    return kTechnologies;
+}
+
+std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
+    const Value& technology, const GeneratorEnvironment& environment)
+{
+    for (const Technology& each : technologies()) {
+        if (technology == Value(each.identifier))
+            return each.generator(environment);
     }
     return nullptr;
 }

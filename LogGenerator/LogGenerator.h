@@ -1,23 +1,36 @@
 #pragma once
 
-#include "GeneratorEnvironment.h"
+#include "RawPackets.h"
 
+#include "Clock.h"
 #include "Dictionary.h"
 #include "MessagePort.h"
+#include "Resources.h"
 
 #include <memory>
+#include <optional>
+#include <span>
+#include <string>
 
 namespace orvex {
 
+// What every generator needs from the platform. The referents outlive all generators.
+struct GeneratorEnvironment {
+    const Resources& resources;                      // templates
+    const Clock& clock;                              // dates of history entries, times of a DLF
+    std::optional<std::string> buildVersion;         // of the application; absent when it has none
+    std::size_t rawPacketLimit = RawPackets::kLimit; // bytes kept for snapshots; 0 for a session never saved
+};
+
 // The decoder of one log technology: turns log messages into the display dictionary.
 //
-// A generator keeps little of its own. What a session knows lies in the generator state, a dictionary that
-// the session makes once and hands to every call. Keys that all generators share:
+// A generator keeps little itself. The session's data is in the generator state, a dictionary that the
+// session creates once and passes to every call. Keys that all generators share:
 //
 //   "Display"       the display dictionary, into which packets write
 //   "DisplayState"  the raw material of the display
 //   "ExtraInfo"     values to be kept with each snapshot
-//   "History"       the last displays that were asked for, oldest first, at most five
+//   "History"       the last displays requested, oldest first, at most five
 //
 // Order of calls: getStartCommand() once per session start, updateState() for every message,
 // generateLogUsingState() whenever the display tree is rebuilt, getSaveContentsFromState() to save.
@@ -28,14 +41,14 @@ public:
     LogGenerator(const LogGenerator&) = delete;
     LogGenerator& operator=(const LogGenerator&) = delete;
 
-    // The generator for the identifier that the telephony service gives its technology; null when nothing
-    // decodes it.
+    // The generator of the technology with that identifier; null when there is none.
     static std::unique_ptr<LogGenerator> generatorFromTechnology(
         const Value& technology, const GeneratorEnvironment& environment);
 
     // Appends copies of "DisplayState", "Display" and "ExtraInfo" with the current date to "History" and
-    // drops the oldest entries beyond five. The copies are shallow: an entry keeps seeing what happens inside
-    // nested sections. Bytes are shared. The entry ends before the first of the three that is absent.
+    // drops the oldest entries beyond five. The copies are shallow: an entry sees later changes inside
+    // nested sections. Byte buffers are shared. The entry ends before the first of the three that is
+    // absent.
     static void updateHistoryInState(Dictionary& state, const Clock& clock);
 
     // What the session sends to start the stream.
@@ -54,7 +67,7 @@ public:
     virtual std::string templateError(const Dictionary& /*state*/) const { return {}; }
 
 protected:
-    // Marks the construction of a generator on which no set-up runs, not even the log line of its birth.
+    // Selects the constructor of a generator that is never set up and does not even log its creation.
     struct NeverSetUp { };
     LogGenerator(const GeneratorEnvironment& environment, NeverSetUp)
         : _environment(environment)
@@ -66,5 +79,14 @@ protected:
 private:
     GeneratorEnvironment _environment;
 };
+
+// A log technology: the identifier by which the telephony service names it, and what makes its generator.
+struct Technology {
+    const char* identifier;
+    std::unique_ptr<LogGenerator> (*generator)(const GeneratorEnvironment& environment);
+};
+
+// All technologies that Orvex decodes.
+std::span<const Technology> technologies();
 
 } // namespace orvex

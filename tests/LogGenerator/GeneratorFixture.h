@@ -5,7 +5,7 @@
 #include "RecordingLog.h"
 #include "Shown.h"
 
-#include "GeneratorEnvironment.h"
+#include "LogGenerator.h"
 
 #include <gtest/gtest.h>
 

@@ -1,8 +1,8 @@
 #include "DecodeOptions.h"
 
 #include "ArgumentBytes.h"
+#include "LogGenerator.h"
 #include "RegularFile.h"
-#include "TelephonyConstants.h"
 
 #include <QCommandLineParser>
 
@@ -12,9 +12,6 @@
 namespace orvex {
 
 namespace {
-
-constexpr const char* kTechnologies[] = {telephony::kTechnologyIFX, telephony::kTechnologyMRL_GSM,
-    telephony::kTechnologyMRL_CDMA, telephony::kTechnologyMRL_LTE, telephony::kTechnologyMRL_UTRAN2};
 
 constexpr int kMostJobs = 256;
 
@@ -103,7 +100,8 @@ DecodeOptions DecodeOptions::parse(int count, char** arguments)
     if (result.technology.empty() && !result.areSnapshots)
         return wrongUsage(QStringLiteral("--technology is missing."));
     if (!result.technology.empty()
-        && std::ranges::find(kTechnologies, result.technology) == std::end(kTechnologies))
+        && std::ranges::find(technologies(), result.technology, &Technology::identifier)
+            == technologies().end())
         return wrongUsage(QStringLiteral("Unknown technology '%1'.").arg(parser.value(technology)));
     if (parser.isSet(format)) {
         if (parser.value(format) == QLatin1String("json"))
