@@ -1,8 +1,8 @@
 #pragma once
 
-#include "CodeDictionary.h"
+#include "ClassIndex.h"
 #include "PacketReader.h"
-#include "RowList.h"
+#include "RowWriter.h"
 
 #include <map>
 #include <memory>
@@ -10,13 +10,10 @@
 
 namespace orvex {
 
-// Sections by their names. Of two sections with one name the later is kept.
-using ClassDictionary = std::map<std::string, Base*, std::less<>>;
-
-// A section of the display: takes the packets of its log codes and writes rows into its own place in the
-// display dictionary. That place, its sectionRef, is a dictionary of rows or an array of row dictionaries, as
-// the technology's template has it. It belongs to the display: the section holds it weakly, and what is
-// written while nothing, or a container of the other kind, is bound is dropped.
+// A section of the display: decodes the packets of its log codes and writes rows into its own entry of the
+// display dictionary. That entry, its sectionRef, is a dictionary of rows or an array of row dictionaries,
+// as the technology's template has it. The display owns it; the section holds it weakly, and drops its rows
+// while nothing, or a container of the other kind, is bound.
 class Base {
 public:
     virtual ~Base() = default;
@@ -38,8 +35,8 @@ public:
     static void clearElementsInArray(const ArrayRef& array);
     static void replaceArray(const ArrayRef& array, const Array& with);
 
-    // Ec/No in whole dB of a linear energy ratio in which 2^19 stands for 0 dB. The bands at both ends are
-    // peculiar: full scale and above yield 0, the two lowest bands both -31, and below 706 it is 0 again.
+    // Ec/No in whole dB from a linear energy ratio; 2^19 is 0 dB. Both ends are odd: full scale and above
+    // give 0, the two lowest bands both give -31, and anything below 706 gives 0 again.
     static std::int16_t lookUpECNO(std::uint32_t ratio);
 
 protected:

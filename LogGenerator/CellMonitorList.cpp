@@ -1,6 +1,6 @@
 #include "CellMonitorList.h"
 
-#include "ExtraPacket.h"
+#include "ExtraPackets.h"
 
 #include "SystemLog.h"
 #include "TelephonyConstants.h"

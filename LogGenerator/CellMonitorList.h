@@ -22,7 +22,7 @@ public:
     {
     }
 
-    // True when it has both entries and they are these texts.
+    // True when both entries are these texts.
     bool is(const char* radioAccessTechnology, const char* cellType) const;
     // The entry as a number. Only an integer that fits 32 bits with sign is one; absent otherwise.
     std::optional<std::int32_t> number(const char* key) const;
@@ -60,16 +60,16 @@ public:
     static constexpr LogCode kCode = kExtraCodeCellMonitorList;
     static constexpr std::size_t kMinimumLength = 0;
 
-    // The list is a property list of another kind. Nobody catches it.
+    // The property list is not an array. Never caught.
     class WrongKindException : public std::runtime_error {
     public:
         using std::runtime_error::runtime_error;
     };
 
-    // Says "Cell Info Array data could not be constructed" in the log when there is no property list.
+    // Logs "Cell Info Array data could not be constructed" when there is no property list.
     explicit CellMonitorList(Packet packet);
 
-    // Says "Failed to get Cell Array" in the log when there was no property list. Then it has no cells.
+    // Logs "Failed to get Cell Array" when there was no property list, and so no cells.
     void reportIfAbsent() const;
     // The first cell of the type in one of the technologies; null when there is none.
     const CellRecord* find(

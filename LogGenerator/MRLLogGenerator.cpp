@@ -15,8 +15,7 @@ namespace {
 constexpr const char* kExecutableName = "EXECUTABLE_NAME";
 constexpr const char* kBuildDate = "Dec 19 2018 23:59:16";
 
-// Keeps the packets of the newest entries that fit and drops those of the others. Returns how many bytes
-// went.
+// Keeps the packets of the newest entries that fit and drops the others. Returns the number of bytes dropped.
 std::size_t dropOldestPackets(const Array& history, std::size_t room)
 {
     std::size_t dropped = 0;
@@ -103,8 +102,8 @@ ArrayRef MRLLogGenerator::getSaveContentsFromState(const Dictionary& state) cons
 
 void MRLLogGenerator::handOverBinData(Dictionary& state)
 {
-    // The newest history entry shares these bytes. Letting go of them lets the memory go with that entry's
-    // packets.
+    // The newest history entry shares these bytes. Without this hold they are freed when that entry loses
+    // its packets.
     state.set("DisplayState", Value());
     if (!_binData) {
         _binData.emplace(environment().rawPacketLimit);

@@ -13,17 +13,17 @@ namespace orvex {
 // A DLF is a flat sequence of records: u16 length (the record's own), u16 log code, 8 bytes time, payload.
 // A log packet is such a record once its first byte, the log type, is removed.
 //
-// What a peer sends does not decide how much memory this takes: an interval keeps what RawPackets keeps, and
-// the history as a whole no more than one interval may. When a new interval does not fit beside the older
-// ones, the oldest lose their packets, each all of its own; their displays stay.
+// Memory is bounded whatever the peer sends: an interval keeps what RawPackets keeps, and the history as a
+// whole no more than one interval may. When a new interval does not fit beside the older ones, the oldest
+// entries lose all their packets; their displays stay.
 class MRLLogGenerator : public LogGenerator {
 public:
     explicit MRLLogGenerator(const GeneratorEnvironment& environment);
 
-    // The version report followed by the raw packets of the history. Only the first byte of every history
-    // entry is dropped: later packets of an entry keep their log type, and readers of these files know it.
-    // The packets are not copied. None, with a log line, when an entry's "DisplayState" is something else
-    // than bytes.
+    // The version report followed by the raw packets of the history. Only the first byte of each history
+    // entry is dropped, so the later packets of an entry keep their log type; readers of these files expect
+    // that. The packets are not copied. None, with a log line, when the "DisplayState" of an entry is not a
+    // byte buffer.
     std::optional<PiecedBytes> generateDlfFromState(const Dictionary& state) const;
 
     // The history entries and, last, the DLF.
@@ -41,7 +41,7 @@ protected:
     {
     }
 
-    // Moves the packets gathered so far into the state's "DisplayState" and starts anew.
+    // Moves the packets gathered so far into the state's "DisplayState" and starts over.
     void handOverBinData(Dictionary& state);
 
     std::optional<RawPackets> _binData; // since the last display request

@@ -1,5 +1,6 @@
 #include "MRLLogGenerator2.h"
 
+#include "Base.h"
 #include "MessageFrame.h"
 #include "StateTemplate.h"
 
@@ -14,7 +15,7 @@
 namespace orvex {
 
 namespace {
-// Says that a generator comes into being before the generators below it say so themselves.
+// Logs the creation of the generator before its base classes log theirs.
 const GeneratorEnvironment& announced(const GeneratorEnvironment& environment, const ClassIndex* cIndexObj)
 {
     systemLog(
@@ -35,7 +36,7 @@ MRLLogGenerator2::MRLLogGenerator2(
 
 MRLLogGenerator2::~MRLLogGenerator2()
 {
-    // All Marlin technologies say this, whichever they are.
+    // Every Marlin technology logs this name.
     systemLog(Priority::warning, "MRL_GSMLogGenerator is destructed %p", static_cast<const void*>(this));
 }
 
@@ -87,8 +88,8 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
     const StateTemplate ownTemplate(_pListName);
     DictionaryRef skeleton = ownTemplate.in(state);
     if (const DictionaryRef display = state["Display"].dictionary(); display && skeleton) {
-        // The session went on with a new generator, after the service came back say: the display stays, and
-        // the new sections take over where the old ones stopped writing.
+        // The session has a new generator, for example because the service came back. The display stays,
+        // and the new sections write where the old ones did.
         bindToDisplay(skeleton, display);
         _boundDisplay = display;
         return display;
@@ -108,7 +109,7 @@ Value MRLLogGenerator2::getDisplayFromState(Dictionary& state)
     ownTemplate.setDisplay(state, built);
     state.set("ExtraInfo", Dictionary::make());
     _boundDisplay = built.dictionary();
-    return {}; // deliberately: only the next call gets it
+    return {}; // deliberate: only the next call returns it
 }
 
 bool MRLLogGenerator2::isBoundToDisplayOf(const Dictionary& state) const

@@ -7,7 +7,7 @@
 
 namespace orvex {
 
-// A template that holds something else than texts, arrays and dictionaries. Nobody catches it.
+// A template with a value other than a text, an array or a dictionary. Never caught.
 class InvalidTemplateException : public std::runtime_error {
 public:
     using std::runtime_error::runtime_error;

@@ -6,7 +6,7 @@
 
 namespace orvex {
 
-// The line that a section writes for every packet.
+// The line that a section logs for every packet.
 struct EntryLine {
     Priority priority;
     const char* word;
@@ -14,7 +14,7 @@ struct EntryLine {
 
 enum class OtherCodes { areReported, areIgnored };
 
-// Takes the packets that one kind of payload reader reads.
+// Receives the packets of one payload reader.
 template <typename Reader>
 class PacketTaker {
 public:
@@ -28,9 +28,9 @@ protected:
     ~PacketTaker() = default;
 };
 
-// A section that says which packets it takes by naming their payload readers, in the order of its log codes,
-// and has an update() for each. Packets of other codes, and packets below their reader's minimum length,
-// change nothing.
+// A section that names the payload readers of its packets, in the order of its log codes, and has an
+// update() for each. Packets of other codes, and packets shorter than their reader's minimum length, change
+// nothing.
 template <typename... Readers>
 class PacketSection : public Base, protected PacketTaker<Readers>... {
 public:
@@ -43,12 +43,12 @@ public:
     }
 
 protected:
-    // Says its name for every packet and reports those of other codes.
+    // Logs its name for every packet and reports other codes.
     PacketSection(const char* sectionName, ClassDictionary& dict, CodeDictionary& codeDict)
         : PacketSection(sectionName, sectionName, dict, codeDict)
     {
     }
-    // The same under another name.
+    // The same, but logs another word.
     PacketSection(
         const char* sectionName, const char* entryWord, ClassDictionary& dict, CodeDictionary& codeDict)
         : PacketSection(sectionName, {Priority::warning, entryWord}, OtherCodes::areReported, dict, codeDict)

@@ -62,7 +62,7 @@ BytesRef RawPackets::take()
     result->reserve(_expectedSize);
     for (BytesRef& batch : batches) {
         result->insert(result->end(), batch->begin(), batch->end());
-        batch.reset(); // never twice the memory
+        batch.reset(); // so that the data is never held twice
     }
     return result;
 }

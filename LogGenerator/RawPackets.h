@@ -7,15 +7,15 @@
 
 namespace orvex {
 
-// The raw packets of one refresh interval, in order of arrival. All are kept as long as they fit into the
-// limit; beyond it the oldest go, whole packets, an eighth of the limit or so at a time, and the system log
-// says so once for each interval. What is kept always begins with a packet.
+// The raw packets of one refresh interval, in order of arrival. All are kept while they fit within the
+// limit. Beyond it the oldest are dropped, whole packets, about an eighth of the limit at a time, with one
+// log line per interval. What is kept always begins with a whole packet.
 class RawPackets {
 public:
     // Far more than a modem sends between two refreshes.
     static constexpr std::size_t kLimit = std::size_t{64} << 20;
 
-    // A limit of 0 keeps nothing, without a word.
+    // A limit of 0 keeps nothing and logs nothing.
     explicit RawPackets(std::size_t limit)
         : _limit(limit)
     {
@@ -25,7 +25,7 @@ public:
     std::size_t size() const { return _size; }
     // Bytes of packets that did not fit, in all intervals.
     std::size_t droppedBytes() const { return _droppedBytes; }
-    // The packets back to back. The next interval begins.
+    // Returns the packets back to back and begins the next interval.
     BytesRef take();
 
 private:

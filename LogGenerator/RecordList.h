@@ -1,19 +1,25 @@
 #pragma once
 
-#include "ArrayOutOfBoundsException.h"
 #include "PacketReader.h"
 
 #include <algorithm>
+#include <exception>
 
 namespace orvex {
 
+// A record was indexed at or beyond its packet's own count. Never caught: the section that does so is broken.
+class ArrayOutOfBoundsException : public std::exception {
+public:
+    const char* what() const noexcept override { return "record index beyond the packet's own count"; }
+};
+
 // The repeated records of a packet: `count` of them, as the packet itself says, `stride` bytes apart from
-// `start` on, each `width` bytes long (the stride where nothing else is said; some formats let one record
-// reach into the next). Record is made from a reader that begins at the record's first byte.
+// `start` on, each `width` bytes long (the stride by default; in some formats one record reaches into the
+// next). Record is constructed from a reader that begins at the record's first byte.
 //
-// Iterating ends at the last record that lies wholly inside the packet, whatever the count claims. Indexing
-// goes by the count alone: at or beyond it throws ArrayOutOfBoundsException, and fields of a record that the
-// packet does not hold read as 0.
+// Iteration ends at the last record that lies wholly inside the packet, whatever the count claims. Indexing
+// checks the count alone: an index at or beyond it throws ArrayOutOfBoundsException, and fields beyond the
+// packet read as 0.
 template <typename Record>
 class RecordList {
 public:

@@ -6,29 +6,30 @@
 
 namespace orvex {
 
-// The template of a display, as the generator state keeps it: "Template", and under "TemplateName" whose
-// display it is. The session goes on with one state while generators and even technologies come and go; the
-// name tells a successor whether the display it finds is one of its own, one of another technology, which it
-// replaces, or one without a name, which did not come from a generator and is shown as it is.
+// The template of a display as the generator state keeps it: the dictionary under "Template", its name
+// under "TemplateName". One state outlives generators and even technologies. The name tells a new generator
+// whether the display it finds is its own, another technology's, which it replaces, or one that no
+// generator made, which has no name and is shown as it is.
 class StateTemplate {
 public:
-    // `name` is the base name of the resource; of a technology without templates any that is its own.
+    // `name` is the base name of the resource; a technology without templates uses any unique name.
     explicit StateTemplate(std::string name)
         : _name(std::move(name))
     {
     }
 
-    // The state's template; null when it has none, or another technology's. One without a name is taken.
+    // The state's template; null when it has none, or another technology's. One without a name counts as
+    // this one.
     DictionaryRef in(const Dictionary& state) const;
-    // The template of the resource, put into the state. Null, and the state as it was, when there is none.
+    // Loads the resource into the state. Null, with the state unchanged, when it cannot.
     DictionaryRef loadInto(Dictionary& state, const Resources& resources) const;
 
-    // Why there would be none, in one line; empty when the state has it or it can be loaded.
+    // Why there is no template, in one line; empty when the state has it or it can be loaded.
     std::string errorIn(const Dictionary& state, const Resources& resources) const;
 
-    // Makes the display the state's, under this template's name.
+    // Stores the display in the state, with this template's name.
     void setDisplay(Dictionary& state, const Value& display) const;
-    // Whether the state has a display that no generator has made.
+    // True when the state has a display that no generator made.
     static bool hasForeignDisplay(const Dictionary& state);
 
 private:

@@ -1,10 +1,8 @@
 #pragma once
 
 #include "CellMonitorList.h"
-#include "GSM/PDPContextList.h"
-#include "LogCode_0xFF0000.h"
-
-#include "AssertionFailure.h"
+#include "ExtraPackets.h"
+#include "GSM/GSMLogGenerator.h"
 #include "MRLLogGenerator2.h"
 
 #include <cstdint>

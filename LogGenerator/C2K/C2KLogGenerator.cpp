@@ -1,13 +1,10 @@
 #include "C2K/C2KLogGenerator.h"
 
-#include "C2K/EVDOActiveSet.h"
-#include "C2K/EVDOFingers.h"
-#include "C2K/EVDOStatus.h"
-#include "C2K/ForwardLinkRate.h"
+#include "C2K/DataRate.h"
+#include "C2K/EVDO.h"
 #include "C2K/OneXStatus.h"
 #include "C2K/OneXSystemIdentity.h"
 #include "C2K/OneXTrafficFrames.h"
-#include "C2K/ReverseLinkRate.h"
 #include "MessageFrame.h"
 #include "StateTemplate.h"
 
@@ -125,7 +122,7 @@ void C2KLogGenerator::updateFromLog(
     const MessageFrame frame(message);
     if (!frame.isComplete())
         return;
-    // Says that it drops the packet, and never has: what follows decodes whatever the type is.
+    // The line says "Dropping", but packets of other types have always been decoded.
     if (frame.logType() != MessageFrame::kTypeBaseband)
         systemLog(Priority::error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(frame.logType()));
     const auto* decoder = std::ranges::find(kDecoders, frame.logCode(), &Decoder::code);

@@ -5,8 +5,8 @@
 namespace orvex {
 
 // The generator of MRL_CDMA: 1x and EV-DO. It has no sections: the template lays out nested dictionaries
-// whose texts name internal keys, "kRxAGC0" say, and one decoder a log code publishes values under those keys
-// into every row that names them. A row is empty until then.
+// whose texts name internal keys, "kRxAGC0" say, and one decoder per log code publishes values under those
+// keys into every row that names them. A row is empty until then.
 //
 // Besides the common keys the state holds "Template" and "TemplateName", "Lookup" (see Publisher), and what
 // decoders remember between packets. "ExtraInfo" gets the counters of the data rates.

@@ -1,14 +1,35 @@
 #include "C2K/OneXStatus.h"
 
-#include "C2K/BandClass.h"
-#include "C2K/LogCode_0x119C.h"
-#include "C2K/LogCode_0x119C_ActiveSet.h"
-#include "C2K/PacketLength.h"
-#include "C2K/PilotList.h"
-#include "C2K/TrafficFER.h"
+#include "C2K/OneXTrafficFrames.h"
 #include "EnumTable.h"
+#include "RecordList.h"
+
+#include <cmath>
 
 namespace orvex {
+
+std::optional<LogCode_0x119C_ActiveSet::Pilot> LogCode_0x119C_ActiveSet::pilot(int index) const
+{
+    if (index < 0 || index >= count())
+        throw ArrayOutOfBoundsException();
+    const auto fingers = static_cast<std::size_t>(field8(9));
+    const std::size_t stride = (6 * fingers + 15) & 0xFFC;
+    const std::size_t start = 12 + static_cast<std::size_t>(index) * stride;
+    const auto pn = _subpacket.u16(start);
+    const auto energy = _subpacket.u16(start + 12 + 4 * fingers);
+    if (!pn || !energy)
+        return std::nullopt;
+    return Pilot{*pn, strengthOf(*energy)};
+}
+
+double LogCode_0x119C_ActiveSet::strengthOf(int energy) const
+{
+    const double m = field16(4);
+    const double g = field8(6);
+    const int exponent = 2 * field8(7) - 3;
+    const double strength = std::ldexp(energy, exponent) / (9 * m * m * g) - 1 / m;
+    return std::fmax(strength, kFloor); // also the floor for NaN, the result of a length of zero
+}
 
 namespace {
 
@@ -29,7 +50,7 @@ constexpr EnumText kDeviceStates[] = {
     {11, "Powerup state [11]"},
 };
 
-// Rows of what works in traffic alone.
+// Rows that have values only in traffic.
 constexpr const char* kTrafficRows[] = {"k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1", "k1xTxAGC"};
 
 DeferredText deviceStateText(int state)

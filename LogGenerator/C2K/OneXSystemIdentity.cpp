@@ -1,7 +1,5 @@
 #include "C2K/OneXSystemIdentity.h"
 
-#include "C2K/LogCode_0x134F.h"
-#include "C2K/PacketLength.h"
 #include "EnumTable.h"
 
 namespace orvex {

@@ -1,11 +1,15 @@
 #pragma once
 
+#include "PacketReader.h"
+
+#include "DeferredText.h"
 #include "Dictionary.h"
+#include "SystemLog.h"
 
 namespace orvex {
 
-// Puts values into the display by internal key, "kRxAGC0" say, and knows nothing of sections and rows: the
-// lookup leads from a key to every row that shows it, and there may be any number of them.
+// Puts values into the display by internal key, such as "kRxAGC0". The lookup leads from a key to every row
+// that shows it.
 //
 // The lookup is a dictionary: internal key to an array of {"key": the row's name, "dict": the display
 // dictionary that holds the row}.
@@ -17,14 +21,14 @@ public:
     {
     }
 
-    // One more row that shows the internal key.
+    // Adds a row that shows the internal key.
     static void addRow(Dictionary& lookup, const std::string& internalKey, const std::string& row,
         const DictionaryRef& dict);
 
-    // Makes the value the content of the rows, in the order in which they were added. A damaged entry ends
-    // it.
+    // Sets every row of the key to the value, in the order in which the rows were added, up to the first
+    // damaged entry.
     void publish(const char* internalKey, const Value& value) const;
-    // The text by a printf format.
+    // Formatted as by printf.
     template <typename... Arguments>
     void setText(const char* internalKey, PrintfFormat<std::type_identity_t<Arguments>...> format,
         Arguments... arguments) const
@@ -35,5 +39,40 @@ public:
 private:
     DictionaryRef _lookup;
 };
+
+// The rows of a list of pilots, "INDEX;PN" each: a display sorts them by the text before the semicolon and
+// shows the one after it.
+class PilotList {
+public:
+    PilotList();
+
+    void add(int index, int pn, DeferredText content);
+
+    const DictionaryRef& rows() const { return _rows; }
+    // "(none)" in place of a list without pilots.
+    Value rowsOrNone() const;
+
+private:
+    DictionaryRef _rows;
+    bool _isEmpty = true;
+};
+
+// 10 log10 of a linear ratio, and the unit. A ratio of zero shows as minus infinity.
+std::string decibelText(double ratio);
+
+// The text of a CDMA2000 band class, shared by 1x and EV-DO.
+DeferredText bandClassText(int bandClass);
+
+// True when the packet has its reader's minimum length; otherwise logs that it is too short.
+template <typename Reader>
+bool hasMinimumLength(Packet packet)
+{
+    if (packet.size() >= Reader::kMinimumLength)
+        return true;
+    systemLog(Priority::error, "Log code 0x%x is %u bytes long but must be at least %lu bytes.",
+        static_cast<unsigned>(Reader::kCode), static_cast<unsigned>(packet.size()),
+        static_cast<unsigned long>(Reader::kMinimumLength));
+    return false;
+}
 
 } // namespace orvex

@@ -14,13 +14,13 @@ std::optional<Subpacket> SubpacketWalk::find(int id) const
 {
     const int count = _packet.u8(kCount);
     std::size_t start = kFirst;
-    for (int index = 0; index < count; ++index) { // also the end of a walk over sizes of zero
+    for (int index = 0; index < count; ++index) { // also ends a walk over sizes of zero
         if (!_packet.contains(start, kHeaderLength))
             return std::nullopt;
         const int size = _packet.u16(start + 2);
         const std::size_t end = start + static_cast<std::size_t>(size);
-        // Generous by the bytes before the first subpacket: a subpacket may claim up to 16 bytes that the
-        // packet does not hold, and is found all the same.
+        // Deliberately lenient by the bytes before the first subpacket: a subpacket may claim up to 16
+        // bytes beyond the packet and is still found.
         if (end >= kFirst + _packet.size()) {
             systemLog(Priority::error, "Log code error in subpkt#%d: bad size (%d).", index, size);
             return std::nullopt;

@@ -6,7 +6,7 @@
 
 namespace orvex {
 
-// A found subpacket, to the end of its packet. A field that the packet does not hold has no value.
+// A subpacket, from its start to the end of the packet. A field that the packet does not hold has no value.
 class Subpacket {
 public:
     explicit Subpacket(PacketReader bytes)
@@ -29,7 +29,7 @@ private:
     PacketReader _bytes;
 };
 
-// The subpackets of a 1x packet, one behind the other:
+// The subpackets of a 1x packet, one after another:
 //
 //   14  u8  number of subpackets
 //   17      first subpacket
@@ -43,8 +43,8 @@ public:
     {
     }
 
-    // The first subpacket of that id. None when there is none, when a subpacket that may be it does not begin
-    // with a whole header, or, with a log line, when one claims to end far behind the packet.
+    // The first subpacket with that id. None when there is none, when the packet ends inside a header, or,
+    // with a log line, when a subpacket claims to end far beyond the packet.
     std::optional<Subpacket> find(int id) const;
 
 private:

@@ -1,6 +1,5 @@
 #include "GSM/GSMLogGenerator.h"
 
-#include "AssertionFailure.h"
 #include "StateTemplate.h"
 
 #include "Array.h"
@@ -11,7 +10,7 @@ namespace orvex {
 
 namespace {
 
-// Where the assertions have always been reported to be; crash reports are sorted by it.
+// The source position that these assertions have always reported; crash reports are sorted by it.
 constexpr const char* kFile = "LogGenerator/GSM/GSMLogGenerator";
 constexpr int kUnknownObjectLine = 78;
 constexpr int kNoPropertyListLine = 90;

@@ -1,13 +1,17 @@
 #include "GSM/MRL_GSMLogGenerator.h"
 
-#include "GSM/MRL_GSMClassIndex.h"
-
+#include "Console.h"
 #include "SystemLog.h"
 
 namespace orvex {
 
+MRL_GSMClassIndex::~MRL_GSMClassIndex()
+{
+    writeConsoleLine("Deallocing MRL_GSMClassIndex");
+}
+
 namespace {
-// Runs, and logs, before the generators below come into being.
+// Runs, and logs, before the base classes are constructed.
 std::unique_ptr<ClassIndex> makeClassIndex()
 {
     systemLog(Priority::error, "Creating MRL_GSMLogGenerator object");

@@ -19,7 +19,7 @@ constexpr CellEntry kCellEntries[] = {
     {telephony::kCellScramblingCode, "Scrambling Code", "Scrambling Code"},
 };
 
-// Of the entries that have one. Not a number when none has: then nothing was sent, and a figure would lie.
+// Over the entries that have a power. NaN when none has: nothing was sent.
 double averageTransmitPower(const LogCode_0x4031& report)
 {
     double sum = 0;
@@ -30,7 +30,7 @@ double averageTransmitPower(const LogCode_0x4031& report)
             ++count;
         }
     }
-    // 0/0 would do but for its sign, which shows on some machines.
+    // Not 0.0 / 0.0, whose sign varies between machines and would show.
     return count ? sum / count : std::numeric_limits<double>::quiet_NaN();
 }
 
@@ -57,7 +57,7 @@ void UMTSRRInfo::update(const LogCode_0x4127& report)
     row.setText("Cell ID", "%d", report.cellIdentity());
     row.setText("Downlink Frequency", "%d", report.downlinkUARFCN());
     row.setText("Uplink Frequency", "%d", report.uplinkUARFCN());
-    row.remove("UARFCN"); // the cell-monitor list's; it is of the cell before
+    row.remove("UARFCN"); // the cell-monitor list's; it belongs to the previous cell
     row.setText("URA ID", "%d", report.uraIdentity());
 }
 

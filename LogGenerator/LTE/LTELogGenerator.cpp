@@ -1,13 +1,17 @@
 #include "LTE/LTELogGenerator.h"
 
-#include "LTE/LTEClassIndex.h"
-
+#include "Console.h"
 #include "SystemLog.h"
 
 namespace orvex {
 
+LTEClassIndex::~LTEClassIndex()
+{
+    writeConsoleLine("Deallocing LTEClassIndex");
+}
+
 namespace {
-// Runs, and logs, before the generators below come into being.
+// Runs, and logs, before the base classes are constructed.
 std::unique_ptr<ClassIndex> makeClassIndex()
 {
     systemLog(Priority::error, "Creating LTELogGenerator object");

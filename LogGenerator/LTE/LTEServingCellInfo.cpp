@@ -35,8 +35,8 @@ LTEServingCellInfo::LTEServingCellInfo(ClassDictionary& dict, CodeDictionary& co
 void LTEServingCellInfo::update(const LogCode_0xB0C1& antennas)
 {
     rows().setText("Num Tx Antennas", "%d", antennas.transmitAntennas());
-    // Decoded, and yet reported: the logs of this system have always had this line for every such packet,
-    // and people's filters know it.
+    // Decoded, yet reported: this line has always been logged for every such packet, and people's log
+    // filters rely on it.
     reportUnknown(LogCode_0xB0C1::kCode);
 }
 
@@ -46,7 +46,7 @@ void LTEServingCellInfo::update(const LogCode_0xB0C2& cell)
     row.setText("Physical Cell ID", "%d", cell.physicalCellIdentity());
     row.setText("Download Frequency", "%d", cell.downlinkFrequency());
     row.setText("Upload Frequency", "%d", cell.uplinkFrequency());
-    row.remove("UARFCN"); // the cell-monitor list's; it is of the cell before
+    row.remove("UARFCN"); // the cell-monitor list's; it belongs to the previous cell
     row.setText("Download Bandwidth", bandwidthText(cell.downlinkBandwidth()));
     row.setText("Upload Bandwidth", bandwidthText(cell.uplinkBandwidth()));
     row.setText("Cell Identity", "%d", cell.cellIdentity());

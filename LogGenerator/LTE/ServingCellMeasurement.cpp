@@ -41,8 +41,7 @@ void ServingCellMeasurement::update(const LogCode_0xB17F& report)
     row.setText("Measured RSSI", "%4.2f dBm", report.measuredRSSI());
     row.setText("Qrxlevmin", "%d dBm", report.qRxLevMin());
     printPower(row, "P_Max", report.pMax());
-    // The field has 6 bits and never reaches the value that stands for none; the test is the same all the
-    // same.
+    // This field has 6 bits, so it never reaches the value that stands for none.
     printPower(row, "Max UE Tx Power", report.maximumTransmitPower());
     row.setText("Srxlev", "%d dBm", report.srxlev());
     row.setText("Num of Consecutive DRX Cycles of S < 0", "%d", report.drxCyclesBelowZero());

@@ -1,7 +1,5 @@
 #include "UTRAN/UTRANLogGenerator.h"
 
-#include "UTRAN/UTRANClassIndex.h"
-
 #include "SystemLog.h"
 
 #include <algorithm>
@@ -44,7 +42,7 @@ UTRANLogGenerator::UTRANLogGenerator(const GeneratorEnvironment& environment, Ne
 
 std::string UTRANLogGenerator::templateError(const Dictionary& state) const
 {
-    // Without any resource that would do, the one that is installed is what the user misses.
+    // No resource fits: name the one that an installation has.
     return isSetUp() ? MRLLogGenerator2::templateError(state)
                      : environment().resources.dictionaryNamed("MRL_UTRAN2").error;
 }

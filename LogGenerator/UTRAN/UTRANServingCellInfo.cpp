@@ -1,12 +1,58 @@
 #include "UTRAN/UTRANServingCellInfo.h"
 
+#include "EnumTable.h"
+
+#include "Console.h"
+#include "SystemLog.h"
 #include "TelephonyConstants.h"
+#include "TextFormat.h"
 
 namespace orvex {
 
 namespace {
 
-// The list has one UARFCN; it goes to both rows, over the two that the baseband tells apart.
+constexpr EnumText kStates[] = {{0, "Disconnected"}, {1, "Connecting"}, {2, "Cell Fach"}, {3, "Cell DCH"},
+    {4, "Cell PCH"}, {5, "Cell URA PCH"}};
+
+// {Name = text; ...}, for the console.
+std::string describe(const Dictionary* rows)
+{
+    if (!rows)
+        return "(null)";
+    std::string result = "{";
+    for (const auto& [key, value] : *rows)
+        result += key + " = " + (value.string() ? *value.string() : nameOf(value.kind())) + "; ";
+    return result + "}";
+}
+
+} // namespace
+
+RRC_State::RRC_State(ClassDictionary& dict, CodeDictionary& codeDict)
+    : Base("RRC Info", {LogCode_0xD0E0::kCode}, dict, codeDict)
+{
+}
+
+void RRC_State::updateWithData(Packet packet, LogCode logCode)
+{
+    systemLog(Priority::warning, "RRC Info");
+    if (logCode != LogCode_0xD0E0::kCode)
+        return;
+    // Logged but not rejected: a missing state reads as invalid and shows as unknown.
+    if (packet.size() < LogCode_0xD0E0::kExpectedLength) {
+        systemLog(Priority::warning, "LogCode_0xD0E0 is length is %ld expected size %ld",
+            static_cast<long>(packet.size()), static_cast<long>(LogCode_0xD0E0::kExpectedLength));
+    }
+    const int state = LogCode_0xD0E0(packet).state();
+    const char* name = textFor(state, kStates, "Unknown RRC Mode");
+    RowWriter row = rows();
+    row.setText("State", name);
+    writeConsoleLine(
+        text("Display Dict = %s, rrc mode = %d %s", describe(row.dictionary()).c_str(), state, name));
+}
+
+namespace {
+
+// The list has a single UARFCN. It goes into both rows and replaces the baseband's two.
 constexpr CellEntry kCellEntries[] = {
     {telephony::kCellLAC, "Local Area Code", "LAC"},
     {telephony::kCellID, "Cell ID", "Cell ID"},

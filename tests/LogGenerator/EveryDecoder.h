@@ -1,8 +1,8 @@
 #pragma once
 
-#include "GSM/MRL_GSMClassIndex.h"
-#include "LTE/LTEClassIndex.h"
-#include "UTRAN/UTRANClassIndex.h"
+#include "GSM/MRL_GSMLogGenerator.h"
+#include "LTE/LTELogGenerator.h"
+#include "UTRAN/UTRANLogGenerator.h"
 
 #include "C2KFixture.h"
 

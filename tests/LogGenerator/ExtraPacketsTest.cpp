@@ -1,6 +1,6 @@
 // Packets of the telephony service: SIM files, PDP contexts, and the property lists of all in both forms.
 
-#include "GSM/MRL_GSMClassIndex.h"
+#include "GSM/MRL_GSMLogGenerator.h"
 
 #include "PropertyListForms.h"
 #include "SectionCases.h"

@@ -6,7 +6,7 @@
 #include "PacketsOfCode.h"
 
 #include "CellMonitorList.h"
-#include "LogCode_0xFF0000.h"
+#include "ExtraPackets.h"
 
 #include <gtest/gtest.h>
 

@@ -1,5 +1,6 @@
 #include "MRLLogGenerator2.h"
 
+#include "Base.h"
 #include "GeneratorFixture.h"
 #include "PacketText.h"
 

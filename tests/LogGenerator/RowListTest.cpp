@@ -1,6 +1,6 @@
 // Lists that are written anew into what they held: the result is that of a list made from nothing.
 
-#include "RowList.h"
+#include "RowWriter.h"
 
 #include <gtest/gtest.h>
 

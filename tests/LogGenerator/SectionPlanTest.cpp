@@ -1,8 +1,8 @@
 // Which sections a technology has, where its template lays them out, and which packets each of them takes.
 
-#include "GSM/MRL_GSMClassIndex.h"
-#include "LTE/LTEClassIndex.h"
-#include "UTRAN/UTRANClassIndex.h"
+#include "GSM/MRL_GSMLogGenerator.h"
+#include "LTE/LTELogGenerator.h"
+#include "UTRAN/UTRANLogGenerator.h"
 
 #include "SectionCases.h"
 

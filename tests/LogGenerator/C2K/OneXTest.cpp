@@ -2,8 +2,8 @@
 
 #include "C2KFixture.h"
 
-#include "ArrayOutOfBoundsException.h"
-#include "C2K/LogCode_0x119C_ActiveSet.h"
+#include "C2K/OneXStatus.h"
+#include "RecordList.h"
 
 namespace orvex::test {
 namespace {

@@ -1,7 +1,5 @@
 #include "GSM/GSMLogGenerator.h"
 
-#include "AssertionFailure.h"
-
 #include "GeneratorFixture.h"
 #include "PropertyListForms.h"
 

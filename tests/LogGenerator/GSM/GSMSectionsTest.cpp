@@ -1,6 +1,6 @@
 // The sections of the GSM side: serving cell, neighbours, GPRS options, radio resources, mobility.
 
-#include "GSM/MRL_GSMClassIndex.h"
+#include "GSM/MRL_GSMLogGenerator.h"
 
 #include "SectionCases.h"
 

@@ -1,6 +1,6 @@
 // The sections of the WCDMA side: cell sets, radio resources, throughput.
 
-#include "GSM/MRL_GSMClassIndex.h"
+#include "GSM/MRL_GSMLogGenerator.h"
 
 #include "SectionCases.h"
 

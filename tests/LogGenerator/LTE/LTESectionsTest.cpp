@@ -1,5 +1,5 @@
-#include "LTE/LTEClassIndex.h"
-#include "LTE/LogCode_0xB186.h"
+#include "LTE/LTELogGenerator.h"
+#include "LTE/ReselectionCandidates.h"
 
 #include "SectionCases.h"
 

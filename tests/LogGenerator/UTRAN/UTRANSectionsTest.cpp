@@ -1,6 +1,6 @@
-#include "UTRAN/LogCode_0xD00C.h"
-#include "UTRAN/LogCode_0xD00E.h"
-#include "UTRAN/UTRANClassIndex.h"
+#include "UTRAN/NeighbhorMeasurements.h"
+#include "UTRAN/TransportChannels.h"
+#include "UTRAN/UTRANLogGenerator.h"
 
 #include "SectionCases.h"
 
