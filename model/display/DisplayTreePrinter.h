@@ -12,8 +12,8 @@ namespace orvex {
 // The display tree as text for a terminal or a file: one line per node, the root first, two blanks of indent
 // per level. A branch is its name, a leaf "name: value".
 //
-// Names and values come from the air and from SIM cards. What would break a line or command a terminal is
-// written visibly: a line break as \n, other control characters as \x1b.
+// Names and values come from the network and from SIM cards, so characters that would break a line or
+// control a terminal are escaped: a line break as \n, others as \x1b.
 class DisplayTreePrinter {
 public:
     static std::vector<std::string> lines(

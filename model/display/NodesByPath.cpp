@@ -14,7 +14,7 @@ std::string_view withoutSlashesAround(std::string_view name)
     return name.substr(first, name.find_last_not_of('/') - first + 1);
 }
 
-// The last node below and including this one whose path is `rest` beyond the node's own.
+// The last node, at or below this one, whose path is the node's own path plus `rest`.
 OrvexModelNodeRef lastAt(const OrvexModelNodeRef& node, std::string_view rest, bool isAtRoot)
 {
     if (rest.empty())

@@ -6,16 +6,16 @@
 
 namespace orvex {
 
-// The path dictionary of one tree: every node under its path. The root's path is "/"; a child's is that of
-// its parent and its display name without the "/" at both ends, with one "/" between the two. A name of
-// nothing else leaves the path as it is. Of two nodes with one path there is the one that a walk of the tree,
-// children before their parent, comes to last.
+// The path dictionary of one tree: every node under its path. The root's path is "/"; a child's is its
+// parent's and its own display name, without the "/" at both ends, with one "/" between. A name of nothing
+// but "/" adds nothing. Of two nodes with the same path it has the one that a walk of the tree, children
+// before their parent, reaches last.
 //
-// Nothing is stored: of the thousand nodes of a tree the screens ask for two or three before the next refresh
-// throws it away, and those are found along the names.
+// Nothing is stored: the screens ask for two or three of a tree's thousand nodes before the next refresh
+// discards it, so a look-up follows the names instead.
 class NodesByPath {
 public:
-    NodesByPath() = default; // of no tree
+    NodesByPath() = default; // without a tree
     explicit NodesByPath(OrvexModelNodeRef root)
         : _root(std::move(root))
     {

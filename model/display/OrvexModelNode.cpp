@@ -2,8 +2,6 @@
 
 #include "ArrayLock.h"
 #include "NodesByPath.h"
-#include "OrvexModelLeafNode.h"
-#include "OrvexModelTreeNode.h"
 
 #include "Array.h"
 #include "Dictionary.h"

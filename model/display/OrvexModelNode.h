@@ -42,4 +42,34 @@ private:
     std::string _name;
 };
 
+// A leaf: one value with its name.
+class OrvexModelLeafNode final : public OrvexModelNode {
+public:
+    OrvexModelLeafNode(std::string name, std::string value)
+        : OrvexModelNode(std::move(name))
+        , _string(std::move(value))
+    {
+    }
+
+    const std::string* value() const override { return &_string; }
+
+private:
+    std::string _string;
+};
+
+// A branch: a dictionary or an array of the display.
+class OrvexModelTreeNode final : public OrvexModelNode {
+public:
+    OrvexModelTreeNode(std::string name, std::vector<OrvexModelNodeRef> children)
+        : OrvexModelNode(std::move(name))
+        , _childNodes(std::move(children))
+    {
+    }
+
+    const std::vector<OrvexModelNodeRef>* childNodes() const override { return &_childNodes; }
+
+private:
+    std::vector<OrvexModelNodeRef> _childNodes;
+};
+
 } // namespace orvex

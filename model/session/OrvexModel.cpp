@@ -70,7 +70,7 @@ bool OrvexModel::createPorts()
         return false;
     }
     const auto channel = connection->createNetworkMonitorLogChannel(portName);
-    connection.reset(); // it has done its work
+    connection.reset(); // no longer needed
     if (channel.errorCode != 0) {
         systemLog(Priority::error, "_KoratServerConnectionNetworkMonitorCreateLogChannel returns error: %ld!",
             channel.errorCode);
@@ -154,8 +154,8 @@ void OrvexModel::startMonitor()
         return retryLater();
 
     systemLog(Priority::error, "Starting the display update timer");
-    // The timer dies with the model, so its task needs no hold on it; but the task itself may drop the last
-    // other hold.
+    // The timer is destroyed with the model, so its task holds no reference; but the task itself may
+    // release the last other one.
     _displayUpdateTimer = _platform.runLoop.startTimer(kRefreshPeriod, [this] {
         const auto self = shared_from_this();
         refresh();
@@ -197,9 +197,9 @@ void OrvexModel::refresh()
 {
     if (_sendPort && _recvPort && !_sendPort->isValid()) {
         const auto port = _recvPort;
-        // When the refresh is late, the last words of the service that has gone are still unread.
+        // If the refresh is late, the last messages of a service that is gone are still unread.
         port->deliverWaiting();
-        // Restarts the monitor, which lets go of the port.
+        // Restarts the monitor, which releases the port.
         port->invalidate();
     }
     if (!_updated)

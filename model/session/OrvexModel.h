@@ -13,7 +13,7 @@
 
 namespace orvex {
 
-// Told on the run loop that the display tree has to be read again.
+// Notified on the run loop when the display tree must be read again.
 class OrvexModelListener {
 public:
     virtual ~OrvexModelListener() = default;
@@ -33,7 +33,7 @@ public:
         MessagePorts& ports;
         TelephonyService& telephony;
         GeneratorEnvironment generators;
-        // Told at each start of a session that can show nothing, in one line: which template, and why.
+        // Called at each start of a session that can show nothing, with one line: which template, and why.
         std::function<void(const std::string& why)> printError = {};
     };
 
@@ -56,14 +56,14 @@ public:
     // Takes one log message.
     void updateWithData(ByteView data);
 
-    // Messages that a generator has decoded, over all sessions.
+    // Messages decoded so far, over all sessions.
     std::uint64_t decodedMessages() const { return _decodedMessages; }
 
-    // The root of the display tree, built on demand. Null while no technology is known.
+    // The root of the display tree, built on demand. Null while the technology is unknown.
     OrvexModelNodeRef topLevelNodes();
     // Null when no node has the path.
     OrvexModelNodeRef nodeAtPath(const std::string& path);
-    // What a snapshot stores. Null while no technology is known.
+    // What a snapshot stores. Null while the technology is unknown.
     ArrayRef getSaveContents() const;
 
 private:

@@ -16,8 +16,8 @@ constexpr const char* kTimestamp = "Timestamp";
 constexpr const char* kData = "Data";
 constexpr const char* kDescription = "Description";
 
-// Of a file: five history entries, each with the largest report that a session takes as it came and as it is
-// shown, inside the snapshot's own containers; or 64 MiB of raw messages, twice, in base64.
+// Enough for five history entries, each with the largest report that a session accepts, as received and as
+// shown, inside the snapshot's own containers; or for 64 MiB of raw messages, twice, in base64.
 constexpr PropertyListLimits kLimits{
     .maximumBytes = std::size_t{512} << 20, .maximumDepth = 512, .maximumNodes = 24'000'000};
 
@@ -26,7 +26,7 @@ SnapshotResult failure(const std::string& path, const std::string& reason)
     return {std::nullopt, path + ": " + reason};
 }
 
-// What would be refused anyway is not read into memory first.
+// Keeps a large file that would be refused anyway from being read into memory.
 bool isLongAndNoPropertyList(const std::string& path)
 {
     constexpr std::size_t kLong = std::size_t{1} << 20;

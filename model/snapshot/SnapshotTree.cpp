@@ -1,7 +1,6 @@
 #include "SnapshotTree.h"
 
 #include "NodesByPath.h"
-#include "NumberedRows.h"
 
 #include "TextFormat.h"
 
@@ -28,8 +27,19 @@ OrvexModelNodeRef snapshotTree(const Snapshot& snapshot)
         rows.add("DLF", text("%zu bytes", dlfBytes));
     rows.add("Description", snapshot.description.empty() ? "—" : snapshot.description);
 
-    NodesByPath paths; // nobody asks a snapshot for a path
+    NodesByPath paths; // not used: no path is looked up in a snapshot
     return OrvexModelNode::makeTreeFromObject(rows.dictionary(), paths);
+}
+
+void NumberedRows::add(const std::string& name, const Value& value)
+{
+    Value& last = _numbers.slot(name);
+    std::int64_t number = last.integer() ? *last.integer() : 1;
+    std::string free = name;
+    while (_rows->contains(free))
+        free = name + " (" + std::to_string(++number) + ')';
+    last = number;
+    _rows->set(free, value);
 }
 
 } // namespace orvex

@@ -158,5 +158,16 @@ TEST_F(MRLLogGenerator2Test, SuccessorsShareTheDisplayOfTheirTemplate)
     EXPECT_EQ(displayAfter("Other", packet(0x4116, Bytes(4))), "Second={Packet=4116, 17}");
 }
 
+TEST_F(MRLLogGenerator2Test, SuccessorsFindSectionsInsideAnArrayOfContainers)
+{
+    resources.templates["Listed"] = Dictionary::make({{"Groups",
+        Array::make({Dictionary::make({{"First", Dictionary::make()}}),
+            Dictionary::make({{"Second", Dictionary::make()}})})}});
+    for (const auto& [payload, shown] : {std::pair(0U, "13"), {2U, "15"}}) {
+        EXPECT_EQ(displayAfter("Listed", packet(0x4116, Bytes(payload))),
+            text("Groups=[First={Packet=4116, %s} | Second={Packet=4116, %s}]", shown, shown));
+    }
+}
+
 } // namespace
 } // namespace orvex::test

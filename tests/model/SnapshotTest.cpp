@@ -1,7 +1,7 @@
 #include "Snapshot.h"
 
-#include "NumberedRows.h"
 #include "PropertyList.h"
+#include "SnapshotTree.h"
 
 #include <gtest/gtest.h>
 

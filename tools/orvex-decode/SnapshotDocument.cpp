@@ -5,7 +5,6 @@
 
 #include "DisplayTreePrinter.h"
 #include "NodesByPath.h"
-#include "NumberedRows.h"
 #include "PropertyList.h"
 #include "RawMessages.h"
 #include "SnapshotTree.h"
