@@ -1,6 +1,5 @@
 #include "ClassIndex.h"
 
-#include "Console.h"
 #include "SystemLog.h"
 
 #include <algorithm>

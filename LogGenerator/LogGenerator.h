@@ -2,10 +2,10 @@
 
 #include "RawPackets.h"
 
-#include "Clock.h"
 #include "Dictionary.h"
 #include "MessagePort.h"
-#include "Resources.h"
+#include "RunLoop.h"
+#include "Storage.h"
 
 #include <memory>
 #include <optional>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Resources.h"
+#include "Storage.h"
 
 #include "Dictionary.h"
 

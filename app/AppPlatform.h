@@ -2,7 +2,7 @@
 
 #include "OrvexModel.h"
 
-#include "Preferences.h"
+#include "Storage.h"
 
 namespace orvex {
 

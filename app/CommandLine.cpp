@@ -1,6 +1,6 @@
 #include "CommandLine.h"
 
-#include "ArgumentBytes.h"
+#include "Process.h"
 
 #include <QCommandLineParser>
 #include <QRegularExpression>

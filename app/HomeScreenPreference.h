@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Preferences.h"
+#include "Storage.h"
 
 namespace orvex {
 

@@ -6,7 +6,7 @@
 #include "PaneReloader.h"
 #include "UpdateMessage.h"
 
-#include "FixedPaths.h"
+#include "Storage.h"
 
 #include <filesystem>
 

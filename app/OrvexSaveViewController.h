@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Array.h"
-#include "Clock.h"
+#include "RunLoop.h"
 #include "Screen.h"
 #include "TableList.h"
 

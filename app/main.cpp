@@ -12,19 +12,13 @@
 #include "SnapshotTree.h"
 
 #include "Accessibility.h"
-#include "ArgumentBytes.h"
-#include "FatalErrors.h"
-#include "FileResources.h"
-#include "IniPreferences.h"
+#include "FileStorage.h"
 #include "KoratTelephonyService.h"
 #include "LinuxSystemLog.h"
+#include "Process.h"
 #include "QtRunLoop.h"
 #include "SocketMessagePorts.h"
-#include "StandardStreams.h"
-#include "SystemClock.h"
-#include "TerminationSignals.h"
 
-#include "Console.h"
 #include "SystemLog.h"
 #include "VisibleText.h"
 

@@ -5,8 +5,7 @@
 #include "Benchmarks.h"
 #include "DecodeLoop.h"
 
-#include "FileSystemLog.h"
-#include "QueuedSystemLog.h"
+#include "LinuxSystemLog.h"
 
 #include <benchmark/benchmark.h>
 

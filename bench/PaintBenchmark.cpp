@@ -11,10 +11,9 @@
 #include "PacketText.h"
 
 #include "Animation.h"
-#include "FileResources.h"
+#include "FileStorage.h"
 #include "FirstPaint.h"
-#include "IniPreferences.h"
-#include "SystemClock.h"
+#include "QtRunLoop.h"
 
 #include <benchmark/benchmark.h>
 

@@ -1,8 +1,8 @@
 #include "RecordedStream.h"
 
-#include "FileResources.h"
+#include "FileStorage.h"
 #include "MessageFrame.h"
-#include "SystemClock.h"
+#include "QtRunLoop.h"
 #include "scenarios/ScenarioTable.h"
 
 #include "TelephonyConstants.h"

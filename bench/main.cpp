@@ -7,7 +7,7 @@
 #include "Benchmarks.h"
 #include "Table.h"
 
-#include "Console.h"
+#include "SystemLog.h"
 
 #include <benchmark/benchmark.h>
 

@@ -3,8 +3,7 @@
 #include "FuzzTarget.h"
 #include "MemoryFile.h"
 
-#include "Console.h"
-#include "FileResources.h"
+#include "FileStorage.h"
 #include "NodesByPath.h"
 #include "Snapshot.h"
 #include "SnapshotTree.h"

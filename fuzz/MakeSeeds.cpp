@@ -5,7 +5,7 @@
 #include "OfflineSession.h"
 
 #include "Array.h"
-#include "FileResources.h"
+#include "FileStorage.h"
 #include "PcapWriter.h"
 #include "PortFrame.h"
 #include "PropertyList.h"

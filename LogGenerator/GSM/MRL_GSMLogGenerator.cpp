@@ -1,6 +1,5 @@
 #include "GSM/MRL_GSMLogGenerator.h"
 
-#include "Console.h"
 #include "SystemLog.h"
 
 namespace orvex {

@@ -1,6 +1,5 @@
 #include "LTE/LTELogGenerator.h"
 
-#include "Console.h"
 #include "SystemLog.h"
 
 namespace orvex {

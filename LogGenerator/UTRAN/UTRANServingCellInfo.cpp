@@ -2,7 +2,6 @@
 
 #include "EnumTable.h"
 
-#include "Console.h"
 #include "SystemLog.h"
 #include "TelephonyConstants.h"
 #include "TextFormat.h"

@@ -16,10 +16,10 @@ class MessagePort {
 public:
     virtual ~MessagePort() = default;
 
-    // False once the port was invalidated or, for a remote port, its peer has gone.
+    // False once the port has been invalidated or, for a remote port, its peer has gone.
     virtual bool isValid() const = 0;
-    // Closes the port for good and then calls the invalidation callback, once. A port may be destroyed from
-    // inside its own callback if the caller of invalidate() holds a reference to it.
+    // Closes the port for good, then calls the invalidation callback, once. The callback may destroy the port
+    // if the caller of invalidate() holds a reference to it.
     virtual void invalidate() = 0;
     // An empty callback clears it.
     virtual void setInvalidationCallback(std::function<void()> callback) = 0;
@@ -28,7 +28,7 @@ public:
 // The receiving end. Messages arrive on the run loop, in the order in which their sender sent them.
 class LocalPort : public MessagePort {
 public:
-    // Hands over at once what has come already and waits for the run loop. A port that is closed drops it.
+    // Delivers now what has arrived and waits for the run loop; a port that closes drops it.
     virtual void deliverWaiting() { }
 };
 
@@ -39,28 +39,27 @@ public:
 
     struct SendResult {
         Status status = Status::success; // of the sending alone
-        std::optional<Bytes> reply;      // absent when none was asked for, or none came in time
+        std::optional<Bytes> reply;      // none when none was wanted or none came in time
     };
 
     // Sends a message that wants no reply. Waits up to the timeout while the peer does not read.
     virtual Status send(std::int32_t messageId, ByteView data, std::chrono::milliseconds sendTimeout) = 0;
-    // Sends a request and waits for its reply; nothing else of the run loop is served meanwhile.
+    // Sends a request and waits for its reply, without running the run loop.
     virtual SendResult request(std::int32_t messageId, ByteView data, std::chrono::milliseconds sendTimeout,
         std::chrono::milliseconds receiveTimeout) = 0;
-    // Bytes accepted for sending that the peer's side has not taken yet.
+    // Bytes accepted for sending that have not reached the socket yet.
     virtual std::size_t pendingBytes() const = 0;
 };
 
 // Creates ports by name.
 class MessagePorts {
 public:
-    // What a local port does with a message; for a request, the bytes returned are the reply, and none means
-    // that there is no reply.
+    // Receives a local port's messages. The bytes returned are the reply to a request; none means no reply.
     using Receiver = std::function<std::optional<Bytes>(std::int32_t messageId, ByteView data)>;
 
     struct LocalPortResult {
         std::shared_ptr<LocalPort> port; // null when it could not be created
-        bool alreadyExisted = false;     // somebody already listens under the name; the port receives nothing
+        bool alreadyExisted = false;     // the name is taken; the port receives nothing
     };
 
     virtual ~MessagePorts() = default;

@@ -2,12 +2,13 @@
 
 #include "TextFormat.h"
 
+#include <functional>
 #include <string_view>
 
 namespace orvex {
 
-// Priorities as the system log knows them, and one it does not: the two failures of the DLF writer have
-// always been logged with the value 16.
+// The priorities of the system log, and one it does not know: the DLF writer has always logged its two
+// failures with the value 16.
 enum class Priority : int { error = 3, warning = 4, notice = 5, dlfFailure = 16 };
 
 // Where log lines go. One sink serves the process; it must outlive every log call.
@@ -17,12 +18,12 @@ public:
 
     // The line as given; a trailing line break is part of the text.
     virtual void write(Priority priority, std::string_view line) = 0;
-    // False when nobody would read a line of this priority, so that it need not be made.
+    // False when lines of this priority have no reader, so that none need be formatted.
     virtual bool wants(Priority) const { return true; }
-    // Returns when all that was written has reached its destination. Called before the process ends.
+    // Returns once everything written has reached its destination. Called before the process ends.
     virtual void flush() { }
 
-    // Lines are dropped while no sink is installed. Returns the previous sink.
+    // Returns the previous sink. Without a sink, lines are dropped.
     static SystemLog* install(SystemLog* sink);
     static SystemLog* installed() { return _installed; }
     static bool isRead(Priority priority) { return _installed && _installed->wants(priority); }
@@ -38,8 +39,8 @@ inline void systemLogText(Priority priority, std::string_view line)
         SystemLog::installed()->write(priority, line);
 }
 
-// Writes one line, made by a printf format, to the installed sink. A line that nobody would read is not made:
-// sections tell of every packet.
+// Writes a line in printf format to the installed sink. Formats nothing without a reader: sections log every
+// packet.
 template <typename... Arguments>
 void systemLog(
     Priority priority, PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
@@ -51,5 +52,15 @@ void systemLog(
     appendText(line, format, arguments...);
     SystemLog::installed()->write(priority, line);
 }
+
+// The console: developer lines on standard output. A program whose standard output is a document installs a
+// sink that sends them elsewhere.
+using ConsoleSink = std::function<void(std::string_view line)>;
+
+// Lines go to standard output until a sink is installed; an empty sink restores that.
+void installConsole(ConsoleSink sink);
+
+// Writes one line; the line break is added.
+void writeConsoleLine(std::string_view line);
 
 } // namespace orvex

@@ -19,7 +19,7 @@ public:
 
     virtual ~TelephonyConnection() = default;
 
-    // Asks the service to open the network-monitor log channel towards the named local port.
+    // Asks the service to open the network-monitor log channel to the named local port.
     virtual LogChannelReply createNetworkMonitorLogChannel(const std::string& localPortName) = 0;
 };
 
@@ -27,8 +27,8 @@ class TelephonyService {
 public:
     virtual ~TelephonyService() = default;
 
-    // Null when the service is not there. The callback is called whenever the service notifies this
-    // connection of a change, for as long as the connection lives.
+    // Null when the service is not running. As long as the connection lives, the callback reports each change
+    // that the service notifies it of.
     virtual std::unique_ptr<TelephonyConnection> connect(std::function<void()> onNotification) = 0;
 };
 

@@ -1,10 +1,9 @@
 #include "KoratTelephonyService.h"
 
+#include "Dictionary.h"
 #include "PropertyList.h"
 #include "SystemLog.h"
 #include "TelephonyConstants.h"
-
-#include "Dictionary.h"
 #include "VisibleText.h"
 
 #include <cerrno>
@@ -39,7 +38,7 @@ public:
             {telephony::kPortName, localPortName},
         }));
         if (!question)
-            return failure(EINVAL, "the request for a log channel cannot be written");
+            return failure(EINVAL, "the request for a log channel cannot be encoded");
         const auto sent =
             _port->request(telephony::kCreateLogChannelMessageId, *question, kSendTimeout, kReceiveTimeout);
         switch (sent.status) {
@@ -49,7 +48,7 @@ public:
         }
         if (!sent.reply)
             return _port->isValid() ? failure(ETIMEDOUT, "no reply in time")
-                                    : failure(ECONNRESET, "it has gone without a reply");
+                                    : failure(ECONNRESET, "it ended without a reply");
         return replyFrom(*sent.reply);
     }
 

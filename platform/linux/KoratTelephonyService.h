@@ -5,10 +5,10 @@
 
 namespace orvex {
 
-// The telephony service behind its message port. The referent outlives the service and its connections.
+// The telephony service, reached through its message port. The ports outlive the service and its connections.
 //
-// The service never notifies a connection: the port it would have to do so on is the one that was asked, and
-// message ports carry nothing but replies that way. onNotification is therefore never called.
+// onNotification is never called: the service knows no port of the connection's, and message ports carry
+// nothing but replies back.
 class KoratTelephonyService final : public TelephonyService {
 public:
     explicit KoratTelephonyService(MessagePorts& ports)

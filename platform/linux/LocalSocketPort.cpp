@@ -25,10 +25,10 @@ using namespace std::chrono_literals;
 
 constexpr std::size_t kMostConnections = 16;
 constexpr std::size_t kMostPartialBytes = std::size_t{64} << 20;
-constexpr auto kIdle = 1s; // without a message, a peer may have to leave
+constexpr auto kIdle = 1s; // without a message; then a peer may be replaced
 constexpr int kBacklog = 64;
 constexpr int kPeersPerTurn = 64;
-constexpr auto kPause = 500ms; // when the process has no descriptor left for a peer
+constexpr auto kPause = 500ms; // after running out of descriptors
 
 int makeSocket()
 {
@@ -43,7 +43,7 @@ sockaddr_un addressOf(const std::string& path)
     return address;
 }
 
-// A socket that listens under the path; -1 with errno when there can be none.
+// A socket that listens under the path; -1 with errno on failure.
 int listenAt(const std::string& path)
 {
     const int listener = makeSocket();
@@ -69,7 +69,7 @@ int connectionError(const std::string& path)
     const auto* generic = reinterpret_cast<const sockaddr*>(&address);
     const int error = connect(probe, generic, sizeof address) == 0 ? 0 : errno;
     close(probe);
-    return error == EAGAIN || error == EINPROGRESS ? 0 : error; // a listener that is busy
+    return error == EAGAIN || error == EINPROGRESS ? 0 : error; // the listener is busy
 }
 
 bool isSocketFile(const std::string& path)
@@ -96,7 +96,7 @@ LocalSocketPort::ListenResult LocalSocketPort::listen()
     const auto path = _directory.socketPath(_name);
     if (!path || !_directory.isUsable())
         return ListenResult::failed;
-    const auto lock = _directory.lock(); // two starters that find the same stale file
+    const auto lock = _directory.lock(); // two processes may find the same stale file
     if (!lock)
         return ListenResult::failed;
     const int error = connectionError(*path);
@@ -124,12 +124,12 @@ void LocalSocketPort::acceptPeers()
         if (peer < 0) {
             const int error = errno;
             const bool isShort = error == EMFILE || error == ENFILE || error == ENOMEM || error == ENOBUFS;
-            if (isShort && isPeerWaiting()) // the descriptor is wanted before a peer is looked for
+            if (isShort && isPeerWaiting()) // accept4() wants a descriptor even if no peer waits
                 pauseListening(error);
-            return; // else there are no more, or this one has gone
+            return;
         }
         if (std::exchange(_isShortOfDescriptors, false))
-            systemLog(Priority::warning, "Message port %s: peers are accepted again", _name.c_str());
+            systemLog(Priority::warning, "Message port %s: accepting peers again", _name.c_str());
         auto socket = std::make_unique<QLocalSocket>();
         if (!socket->setSocketDescriptor(peer)) {
             ::close(peer);
@@ -151,9 +151,9 @@ bool LocalSocketPort::isPeerWaiting() const
 
 void LocalSocketPort::pauseListening(int error)
 {
-    // The peer goes on waiting. Without a pause the event loop would do nothing but try.
+    // The peer keeps waiting. Without a pause the event loop would spin on its attempts.
     if (!std::exchange(_isShortOfDescriptors, true))
-        systemLog(Priority::error, "Message port %s: a peer has to wait: %s", _name.c_str(),
+        systemLog(Priority::error, "Message port %s: cannot accept a peer: %s", _name.c_str(),
             std::strerror(error)); // NOLINT(concurrency-mt-unsafe)
     _listener->setEnabled(false);
     QTimer::singleShot(kPause, _listener.get(), [this] { _listener->setEnabled(true); });
@@ -179,7 +179,7 @@ bool LocalSocketPort::makeRoom()
 {
     if (_connections.size() < kMostConnections)
         return true;
-    // First those that never said anything, then the others; of both the one that is idle for longest.
+    // Those that have never sent a message go first; among equals, the one that has been idle for longest.
     const auto rank = [](const auto& connection) {
         return std::tuple(!connection->isHandling(), !connection->hasSpoken(), connection->idleTime());
     };
@@ -232,7 +232,7 @@ void LocalSocketPort::invalidate()
 
 void LocalSocketPort::deliverWaiting()
 {
-    // A receiver may close the port, and a connection may end.
+    // A receiver may close the port, and connections may end meanwhile.
     std::vector<QPointer<PortConnection>> connections;
     for (const auto& connection : _connections)
         connections.emplace_back(connection.get());
@@ -251,7 +251,7 @@ void LocalSocketPort::close()
 {
     if (!_listener)
         return;
-    // A starter that comes between the closing and the removal would lose its fresh file.
+    // Without the lock, a process that starts to listen between close and unlink would lose its new file.
     const auto lock = _directory.lock();
     const int listener = static_cast<int>(_listener->socket());
     _listener.reset();

@@ -14,23 +14,23 @@ class QLocalSocket;
 
 namespace orvex {
 
-// The receiving end of a message channel: a socket file in the port directory, and any number of peers up to
-// a limit, all of them this user or root. Messages of one peer keep their order. A new peer
-// beyond the limit replaces one that never sent a message, else the one that is idle for longest; it is
-// refused only while all are active. Partial messages are bounded in all: the one that has waited for longest
-// goes, and its peer.
+// The receiving end of a message channel: a socket file in the port directory, and a limited number of peers,
+// all of them this user or root. Messages of one peer keep their order. A peer beyond the limit replaces one
+// that has never sent a message, else the one that has been idle for longest, and is refused only while all
+// are active. Partial messages are limited in total: above that, the peer whose message has waited longest is
+// closed.
 class LocalSocketPort final : public LocalPort {
 public:
     enum class ListenResult { listening, alreadyExists, failed };
 
-    // Not valid until it listens.
+    // Not valid before listen().
     LocalSocketPort(PortDirectory directory, std::string name, MessagePorts::Receiver receiver);
     // Closes the port without calling the invalidation callback.
     ~LocalSocketPort() override;
     LocalSocketPort(const LocalSocketPort&) = delete;
     LocalSocketPort& operator=(const LocalSocketPort&) = delete;
 
-    // Takes over a socket file that nobody serves. Failures are told in the system log.
+    // Takes over a socket file that nobody serves. Failures go to the system log.
     ListenResult listen();
 
     bool isValid() const override { return _listener != nullptr; }
@@ -43,7 +43,7 @@ private:
     bool isWelcome(const QLocalSocket& socket) const;
     bool isPeerWaiting() const;
     void pauseListening(int error);
-    // Where all places are taken, makes one by closing the connection that is idle for longest.
+    // True when there is room for another connection, after closing an idle one if need be.
     bool makeRoom();
     void boundPartialMessages();
     void remove(PortConnection* connection);

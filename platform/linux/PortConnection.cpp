@@ -30,12 +30,12 @@ PortConnection::PortConnection(std::string portName, std::unique_ptr<QLocalSocke
     connect(_socket.get(), &QLocalSocket::readyRead, this, [this] { wake(); });
     connect(_socket.get(), &QLocalSocket::disconnected, this, [this] { wake(); });
     connect(_socket.get(), &QLocalSocket::bytesWritten, this, [this] { wake(); });
-    wake(); // for what came before the signals were connected
+    wake(); // for what arrived before the signals were connected
 }
 
 PortConnection::~PortConnection()
 {
-    _socket->disconnect(this); // closing the socket must not wake us
+    _socket->disconnect(this); // or closing the socket would wake this
 }
 
 void PortConnection::wake()
@@ -60,12 +60,12 @@ void PortConnection::handleWaiting()
     }
 }
 
-// Whether there were any.
+// True if there were any.
 bool PortConnection::handleMessages()
 {
     const QPointer<PortConnection> alive(this);
     const auto reader = _reader;
-    _isHandling = true; // if the receiver runs an event loop, the messages behind this one wait
+    _isHandling = true; // if the receiver runs an event loop, later messages wait
     int handled = 0;
     while (handled < kMessagesPerTurn && !isWaitingForPeer()) {
         const auto message = reader->take();
@@ -77,7 +77,7 @@ bool PortConnection::handleMessages()
         ++handled;
         _hasSpoken = true;
         if (message->kind == FrameKind::reply)
-            continue; // nobody asked
+            continue; // to nothing
         const auto receiver = _receiver;
         const auto answer = (*receiver)(message->messageId, message->payload);
         if (!alive)
@@ -95,7 +95,7 @@ bool PortConnection::handleMessages()
     if (isWaitingForPeer())
         return handled > 0;
 
-    // Everything that came is handled.
+    // Everything that arrived is handled.
     if (reader->fault())
         systemLog(
             Priority::error, "Message port %s: connection closed, %s", _portName.c_str(), reader->fault());

@@ -18,28 +18,27 @@ namespace orvex {
 
 // One peer of a local port: reads its messages, hands them to the receiver and sends the replies back.
 //
-// A turn of the event loop handles a bounded number of messages, and while a peer does not take its replies
-// no more of its messages are handled; the rest waits in the socket and slows the sender down. Messages are
-// handled from a timer and never from a signal of the socket, so a receiver may destroy the connection.
+// A turn of the event loop handles a bounded number of messages, and none while the peer does not take its
+// replies; the rest waits in the socket and slows the sender down. Messages are handled from a timer and
+// never from a signal of the socket, so a receiver may destroy the connection.
 class PortConnection final : public QObject {
 public:
     using Receiver = std::shared_ptr<const MessagePorts::Receiver>;
-    // Tells the owner to destroy the connection, which has ended.
+    // Asks the owner to destroy the connection, which has ended.
     using EndHandler = std::function<void(PortConnection*)>;
-    // Called when a frame stays incomplete. May destroy the connection.
+    // Called when the last frame is incomplete. May destroy the connection.
     using PartialHandler = std::function<void()>;
 
     PortConnection(std::string portName, std::unique_ptr<QLocalSocket> socket, Receiver receiver,
         EndHandler onEnd, PartialHandler onPartial);
     ~PortConnection() override;
 
-    // Handles what has come so far without the event loop. A peer that goes on sending does not hold it up
-    // for ever.
+    // Handles what has arrived, without the event loop. Returns even if the peer keeps sending.
     void handleWaiting();
 
-    // True when a message is being handled, so that the connection has to stay.
+    // True while a message is being handled; the connection must stay meanwhile.
     bool isHandling() const { return _isHandling; }
-    // True when it has sent a whole message.
+    // True once it has sent a whole message.
     bool hasSpoken() const { return _hasSpoken; }
     // Since its last whole message, or since it connected.
     std::chrono::milliseconds idleTime() const { return std::chrono::milliseconds(_idle.elapsed()); }
@@ -55,7 +54,7 @@ private:
 
     std::string _portName;
     std::unique_ptr<QLocalSocket> _socket;
-    std::shared_ptr<FrameReader> _reader; // shared with the call that is at work in it
+    std::shared_ptr<FrameReader> _reader; // shared with handleMessages(), which may outlive this
     Receiver _receiver;
     EndHandler _onEnd;
     PartialHandler _onPartial;

@@ -44,7 +44,7 @@ public:
     ~DirectoryLock()
     {
         if (_file >= 0)
-            close(_file); // and with it the lock
+            close(_file); // releases the lock
     }
     DirectoryLock(const DirectoryLock&) = delete;
     DirectoryLock& operator=(const DirectoryLock&) = delete;
@@ -82,7 +82,7 @@ bool PortDirectory::isUsable() const
     if (S_ISLNK(status.st_mode))
         return refuse(_path, "refused, it is a symbolic link");
     if (!S_ISDIR(status.st_mode))
-        return refuse(_path, "refused, it is no directory");
+        return refuse(_path, "refused, it is not a directory");
     if (status.st_uid != geteuid())
         return refuse(_path, "refused, it belongs to another user");
     if ((status.st_mode & kOthers) != 0)
@@ -94,7 +94,7 @@ std::optional<std::string> PortDirectory::socketPath(const std::string& portName
 {
     const std::string shown = visibleText(portName);
     if (portName.empty() || portName == "." || portName == ".." || portName.find('/') != std::string::npos
-        || shown != portName) { // what goes into the log as an escape is no name either
+        || shown != portName) { // log lines show it as it is
         systemLog(Priority::error, "\"%s\" cannot be the name of a message port", shown.c_str());
         return std::nullopt;
     }
@@ -112,7 +112,7 @@ std::shared_ptr<const void> PortDirectory::lock() const
     auto lock = std::make_shared<const DirectoryLock>(_path);
     if (lock->take())
         return lock;
-    systemLog(Priority::error, "Port directory %s: it cannot be locked: %s", _path.c_str(),
+    systemLog(Priority::error, "Port directory %s: cannot be locked: %s", _path.c_str(),
         std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
     return nullptr;
 }

@@ -6,8 +6,8 @@
 
 namespace orvex {
 
-// The directory that holds the sockets of named message ports. Whoever can write there can pretend to be any
-// port, so it must belong to this user alone.
+// The directory of the sockets of named message ports. Whoever can write to it can impersonate any port, so
+// it must belong to this user alone.
 class PortDirectory {
 public:
     // $ORVEX_PORT_DIR, else $XDG_RUNTIME_DIR/orvex, else /tmp/orvex-UID.
@@ -19,16 +19,16 @@ public:
 
     const std::string& path() const { return _path; }
 
-    // Makes the directory when it is absent. False, with a line in the system log, when it cannot be made, is
-    // a symbolic link or no directory, belongs to another user or is open to others.
+    // Creates the directory if it is absent. False, with a line in the system log, when that fails or the
+    // directory is a symbolic link, something else, another user's or open to others.
     bool isUsable() const;
 
     // The socket file of a port. None, with a line in the system log, when the name is empty, leads out of
-    // the directory or makes a path longer than a socket can have.
+    // the directory, holds characters that cannot be shown or makes a path too long for a socket.
     std::optional<std::string> socketPath(const std::string& portName) const;
 
-    // While it is held, no other process that holds one adds or removes sockets. It is released with the last
-    // reference. Null, with a line in the system log, when the directory cannot be locked.
+    // Whoever adds or removes sockets holds the lock meanwhile. The last reference releases it. Null, with a
+    // line in the system log, on failure.
     std::shared_ptr<const void> lock() const;
 
 private:

@@ -4,7 +4,10 @@
 #include <QTimer>
 
 #include <algorithm>
+#include <cmath>
+#include <ctime>
 #include <limits>
+#include <utility>
 
 namespace orvex {
 
@@ -12,7 +15,7 @@ namespace {
 std::chrono::milliseconds roundedUp(std::chrono::nanoseconds time)
 {
     using std::chrono::milliseconds;
-    constexpr milliseconds kLongest(std::numeric_limits<int>::max()); // what a Qt timer can count
+    constexpr milliseconds kLongest(std::numeric_limits<int>::max()); // the most a Qt timer takes
     return std::clamp(std::chrono::ceil<milliseconds>(time), milliseconds(0), kLongest);
 }
 
@@ -27,7 +30,7 @@ public:
 private:
     void timerEvent(QTimerEvent*) noexcept override
     {
-        const auto task = _task; // the task may destroy the timer, but not itself while it runs
+        const auto task = _task; // survives a task that destroys its timer
         (*task)();
     }
 
@@ -45,8 +48,7 @@ void QtRunLoop::post(Task task)
     _posted.push_back(std::move(task));
     if (std::exchange(_turnIsComing, true))
         return;
-    // An event posted while events are delivered is delivered in the same turn; a timer that is started then
-    // is not.
+    // A posted event may be delivered in the current turn; a timer started by it fires in the next.
     QMetaObject::invokeMethod(
         &_context, [this] { QTimer::singleShot(0, &_context, [this]() noexcept { runTurn(); }); },
         Qt::QueuedConnection);
@@ -66,7 +68,7 @@ void QtRunLoop::runTurn()
         {
             const std::lock_guard lock(_mutex);
             if (_posted.empty())
-                return; // a task ran an event loop of its own, which ran the rest
+                return; // a task ran an event loop of its own, and that ran the rest
             task = std::move(_posted.front());
             _posted.pop_front();
         }
@@ -83,6 +85,25 @@ void QtRunLoop::postAfter(std::chrono::nanoseconds delay, Task task)
 std::unique_ptr<RunLoop::Timer> QtRunLoop::startTimer(std::chrono::nanoseconds period, Task task)
 {
     return std::make_unique<QtTimer>(roundedUp(period), std::move(task));
+}
+
+Date SystemClock::now() const
+{
+    const auto sinceEpoch = std::chrono::system_clock::now().time_since_epoch(); // 1970 UTC
+    return {std::chrono::duration<double>(sinceEpoch).count()};
+}
+
+Clock::Zone SystemClock::zoneAt(Date moment) const
+{
+    // Well inside what localtime_r can represent.
+    constexpr double kFarthest = 1e15;
+    const double seconds = std::isnan(moment.secondsSince1970) ? 0 : std::floor(moment.secondsSince1970);
+    const auto time = static_cast<std::time_t>(std::clamp(seconds, -kFarthest, kFarthest));
+    std::tm local{};
+    tzset(); // localtime_r need not read $TZ itself
+    if (!localtime_r(&time, &local))
+        return {};
+    return {static_cast<int>(local.tm_gmtoff), local.tm_isdst > 0};
 }
 
 } // namespace orvex

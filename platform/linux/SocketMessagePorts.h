@@ -8,10 +8,10 @@
 namespace orvex {
 
 // Message ports between processes of one user, on Unix-domain stream sockets with the frames of PortFrame.h.
-// Everything runs on the event loop of the thread that creates the ports.
+// They run on the event loop of the thread that creates them.
 class SocketMessagePorts final : public MessagePorts {
 public:
-    // In the port directory that the environment names.
+    // Uses the port directory that the environment names.
     SocketMessagePorts() = default;
     explicit SocketMessagePorts(std::string directory)
         : _directory(std::move(directory))

@@ -6,7 +6,7 @@
 
 #include "C2KFixture.h"
 
-#include "Console.h"
+#include "SystemLog.h"
 #include "TelephonyConstants.h"
 
 #include <charconv>

@@ -2,8 +2,8 @@
 #include "GSM/MRL_GSMLogGenerator.h"
 #include "LTE/LTELogGenerator.h"
 
-#include "Console.h"
 #include "GeneratorFixture.h"
+#include "SystemLog.h"
 
 #include <gmock/gmock.h>
 

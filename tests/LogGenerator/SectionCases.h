@@ -5,7 +5,7 @@
 #include "Shown.h"
 
 #include "ClassIndex.h"
-#include "Console.h"
+#include "SystemLog.h"
 
 #include <gtest/gtest.h>
 

@@ -6,7 +6,7 @@
 
 #include "SectionCases.h"
 
-#include "FileResources.h"
+#include "FileStorage.h"
 
 #include <algorithm>
 #include <set>

@@ -5,7 +5,7 @@
 #include "StatusPrinter.h"
 #include "UpdateMessage.h"
 
-#include "FixedPaths.h"
+#include "Storage.h"
 
 #include <QLocale>
 #include <QScreen>

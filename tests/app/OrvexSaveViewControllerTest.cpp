@@ -8,8 +8,8 @@
 #include "SessionFixture.h"
 #include "Snapshot.h"
 
-#include "FixedPaths.h"
 #include "RecordingLog.h"
+#include "Storage.h"
 
 #include <QLineEdit>
 

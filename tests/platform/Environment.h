@@ -4,7 +4,7 @@
 
 namespace orvex::test {
 
-// Sets or, with null, unsets a variable, before there are threads.
+// Sets a variable or, with null, unsets it. Not safe beside other threads.
 inline void setEnvironment(const char* name, const char* value)
 {
     value ? setenv(name, value, 1) : unsetenv(name); // NOLINT(concurrency-mt-unsafe)

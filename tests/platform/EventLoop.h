@@ -8,7 +8,7 @@
 
 namespace orvex::test {
 
-// Turns the event loop until the condition holds; false when it did not within the time.
+// Runs the event loop until the condition holds; false if it does not within the time.
 template <typename Condition>
 bool waitUntil(Condition condition, std::chrono::milliseconds longest = std::chrono::seconds(10))
 {
@@ -23,7 +23,7 @@ bool waitUntil(Condition condition, std::chrono::milliseconds longest = std::chr
     return true;
 }
 
-// Turns the event loop for a while, for what must not happen.
+// Runs the event loop for a while, to see that nothing happens.
 inline void turnFor(std::chrono::milliseconds time)
 {
     waitUntil([] { return false; }, time);

@@ -1,5 +1,8 @@
+// The event loop, and the clock.
+
 #include "QtRunLoop.h"
 
+#include "Environment.h"
 #include "EventLoop.h"
 
 #include <gtest/gtest.h>
@@ -20,7 +23,7 @@ TEST(QtRunLoop, RunsPostedTasksLaterAndInOrder)
     loop.post([&] {
         order += 'a';
         loop.post([&] { order += 'd'; });
-        waitUntil([&] { return order.size() == 4; }); // also by an event loop inside a task
+        waitUntil([&] { return order.size() == 4; }); // an event loop inside a task runs them too
         order += 'e';
     });
     loop.post([&] { order += 'b'; });
@@ -30,7 +33,7 @@ TEST(QtRunLoop, RunsPostedTasksLaterAndInOrder)
     EXPECT_EQ(order, "abcde");
 }
 
-TEST(QtRunLoop, DelaysAreNeverShortNorHeldUpByATaskThatAlwaysPostsItself)
+TEST(QtRunLoop, DelaysAreNeverShortAndATaskThatRepostsItselfDoesNotHoldThemUp)
 {
     QtRunLoop loop;
     int turns = 0;
@@ -53,11 +56,10 @@ TEST(QtRunLoop, TimerStopsWhenItsOwnTaskDestroysIt)
     QtRunLoop loop;
     int ticks = 0;
     std::unique_ptr<RunLoop::Timer> timer;
-    // The capture is looked at after the timer has gone: it must still be there.
     timer = loop.startTimer(5ms, [&timer, &ticks, marker = std::string(100, 'x')] {
         if (++ticks == 3)
             timer.reset();
-        EXPECT_EQ(marker, std::string(100, 'x'));
+        EXPECT_EQ(marker, std::string(100, 'x')) << "captures outlive the timer";
     });
     EXPECT_TRUE(waitUntil([&] { return !timer; }));
     turnFor(40ms);
@@ -68,18 +70,31 @@ TEST(QtRunLoop, TasksThatHaveNotRunDieWithTheLoop)
 {
     const auto witness = std::make_shared<int>();
     int runs = 0;
-    {
-        QtRunLoop loop;
-        loop.post([&runs, witness] { ++runs; });
-        loop.postAfter(1ms, [&runs, witness] { ++runs; });
-    }
     auto loop = std::make_unique<QtRunLoop>();
+    loop->postAfter(1ms, [&runs, witness] { ++runs; });
     loop->post([&loop] { loop.reset(); });
     loop->post([&runs, witness] { ++runs; });
     turnFor(50ms);
     EXPECT_FALSE(loop);
     EXPECT_EQ(runs, 0);
-    EXPECT_EQ(witness.use_count(), 1) << "a dropped task is destroyed, not kept";
+    EXPECT_EQ(witness.use_count(), 1) << "a dropped task is destroyed";
+}
+
+TEST(SystemClock, ZoneIsThatOfTheMoment)
+{
+    // POSIX zone strings, which need no installed zones.
+    const SystemClock clock;
+    const auto zoneAt = [&clock](const char* zone, double moment) {
+        test::setEnvironment("TZ", zone);
+        const auto [seconds, isDaylightSaving] = clock.zoneAt({moment});
+        return std::to_string(seconds) + (isDaylightSaving ? " in summer" : "");
+    };
+    const char* central = "CET-1CEST,M3.5.0,M10.5.0/3";
+    EXPECT_EQ(zoneAt(central, 1774745999.9), "3600");         // 2026-03-29 00:59:59.9 UTC
+    EXPECT_EQ(zoneAt(central, 1774746000), "7200 in summer"); // 01:00:00
+    EXPECT_EQ(zoneAt("NST3:30NDT,M3.2.0,M11.1.0", 1794808471), "-12600");
+    EXPECT_EQ(zoneAt("UTC0", -1e300), "0");
+    EXPECT_NEAR(clock.now().secondsSince1970, static_cast<double>(std::time(nullptr)), 60);
 }
 
 } // namespace

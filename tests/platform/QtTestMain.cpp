@@ -1,4 +1,4 @@
-// Test programs whose subjects need Qt's event loop.
+// The main function of tests that need Qt's event loop.
 
 #include <gmock/gmock.h>
 

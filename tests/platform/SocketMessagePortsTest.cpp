@@ -1,22 +1,37 @@
+// Message ports, their directory, and the telephony service behind one.
+
+#include "KoratTelephonyService.h"
+#include "TelephonyConstants.h"
+
+#include "Environment.h"
 #include "PortTest.h"
 
+#include <cstdlib>
+#include <filesystem>
 #include <fstream>
 
 namespace orvex {
 namespace {
 
 using namespace std::chrono_literals;
+using namespace std::string_literals;
 using test::bytesOf;
 using test::RawPeer;
 using test::ServedPort;
+using test::setEnvironment;
 using test::turnFor;
 using test::waitUntil;
+using testing::AllOf;
+using testing::Each;
+using testing::ElementsAre;
+using testing::HasSubstr;
 using testing::IsEmpty;
+using testing::SizeIs;
 using Status = RemotePort::Status;
 
 class SocketMessagePortsTest : public test::PortTest { };
 
-TEST_F(SocketMessagePortsTest, PartOfAMessageIsWaitedForWithoutHoldingUpOthers)
+TEST_F(SocketMessagePortsTest, AMessageInPiecesDoesNotHoldUpOtherPeers)
 {
     const auto local = ports.createLocalPort("a", [&](std::int32_t messageId, ByteView data) {
         collector()(messageId, data);
@@ -33,10 +48,10 @@ TEST_F(SocketMessagePortsTest, PartOfAMessageIsWaitedForWithoutHoldingUpOthers)
     for (std::size_t i = 0; i < bytes.size(); ++i) {
         slow.write(ByteView(&bytes[i], 1));
         expected += i == 18 ? "-2:abc " : i == 56 ? "16909060: " : "";
-        ASSERT_TRUE(waitUntil([&] { return received == expected; })) << received;
+        ASSERT_TRUE(receives(expected)) << received;
         other.say(2, "quick");
         expected += "2:quick ";
-        ASSERT_TRUE(waitUntil([&] { return received == expected; })) << received;
+        ASSERT_TRUE(receives(expected)) << received;
     }
     EXPECT_EQ(slow.read(), (Bytes{1, 0, 0, 0, 0xFE, 0xFF, 0xFF, 0xFF, 2, 0, 0, 0, 4, 3, 2, 0x81, 0xFF}));
 }
@@ -55,7 +70,7 @@ TEST_F(SocketMessagePortsTest, RequestsGetTheirOwnReplies)
     });
     const auto remote = ports.createRemotePort("a");
     EXPECT_FALSE(remote->request(1, bytesOf("late"), 1s, 50ms).reply);
-    // Slow as well, so that the late reply comes first and alone.
+    // Slow as well, so that the late reply comes first.
     EXPECT_EQ(remote->request(1, bytesOf("after late"), 1s, 5s).reply, bytesOf("after late!"));
     EXPECT_EQ(remote->send(0, bytesOf("one-way"), 1s), Status::success);
     const auto none = remote->request(2, bytesOf("none"), 1s, 50ms);
@@ -65,14 +80,14 @@ TEST_F(SocketMessagePortsTest, RequestsGetTheirOwnReplies)
     const std::string large(kLargestPayload - 1, 'x');
     EXPECT_TRUE(remote->request(0, bytesOf(large), 5s, 20s).reply == bytesOf(large + '!'));
     EXPECT_EQ(remote->send(0, bytesOf(large + "xx"), 5s), Status::transportError);
-    EXPECT_EQ(log.take().size(), 1U);
+    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("too long")));
 
     service.reset();
     EXPECT_FALSE(remote->request(0, bytesOf("x"), 1s, 20s).reply);
     EXPECT_FALSE(remote->isValid());
 }
 
-TEST_F(SocketMessagePortsTest, NameIsServedOnce)
+TEST_F(SocketMessagePortsTest, ANameIsServedOnce)
 {
     EXPECT_FALSE(ports.createRemotePort("a"));
     auto first = ports.createLocalPort("a", collector()).port;
@@ -81,7 +96,7 @@ TEST_F(SocketMessagePortsTest, NameIsServedOnce)
     EXPECT_FALSE(second.port->isValid());
     second.port->invalidate();
     ASSERT_EQ(ports.createRemotePort("a")->send(7, bytesOf("x"), 1s), Status::success);
-    EXPECT_TRUE(waitUntil([&] { return received == "7:x "; }));
+    EXPECT_TRUE(receives("7:x "));
 
     int invalidations = 0;
     first->setInvalidationCallback([&] {
@@ -96,9 +111,9 @@ TEST_F(SocketMessagePortsTest, NameIsServedOnce)
     EXPECT_THAT(log.take(), IsEmpty());
 }
 
-TEST_F(SocketMessagePortsTest, StaleSocketIsTakenOverByOneStarter)
+TEST_F(SocketMessagePortsTest, OneOfManyStartersTakesOverAStaleSocket)
 {
-    // Leaves a socket file behind at which nobody listens.
+    // A link to its socket outlives port b, and nobody listens there.
     ASSERT_TRUE(
         ports.createLocalPort("b", collector()).port && link(pathOf("b").c_str(), pathOf("a").c_str()) == 0);
     constexpr int kStarters = 4;
@@ -135,7 +150,6 @@ TEST_F(SocketMessagePortsTest, RemotePortNoticesThatItsPeerHasGone)
     turnFor(20ms);
     local.reset();
     EXPECT_EQ(busy->send(0, bytesOf("x"), 1s), Status::transportError);
-    EXPECT_FALSE(busy->isValid());
     EXPECT_EQ(busy->send(0, bytesOf("x"), 1s), Status::invalid);
     EXPECT_TRUE(waitUntil([&] { return !idle->isValid(); }));
 }
@@ -167,7 +181,7 @@ TEST_F(SocketMessagePortsTest, SendingWaitsForAPeerThatDoesNotReadAndLosesNothin
     EXPECT_EQ(arrived, accepted) << "a message that was not accepted must not arrive";
 }
 
-TEST_F(SocketMessagePortsTest, WhatWaitsIsDeliveredWithoutTheEventLoop)
+TEST_F(SocketMessagePortsTest, WaitingMessagesAreDeliveredWithoutTheEventLoop)
 {
     std::shared_ptr<LocalPort> port;
     const auto receiver = [&](std::int32_t messageId, ByteView data) {
@@ -180,23 +194,114 @@ TEST_F(SocketMessagePortsTest, WhatWaitsIsDeliveredWithoutTheEventLoop)
     const RawPeer present(pathOf("a"));
     const RawPeer last(pathOf("a"));
     last.say(9, "here");
-    ASSERT_TRUE(waitUntil([&] { return received == "9:here "; })); // all are known to the port
+    ASSERT_TRUE(receives("9:here ")); // the port knows all three
 
     std::string expected = received;
-    for (int i = 1; i <= 150; ++i) { // more than a turn of the event loop takes
+    for (int i = 1; i <= 150; ++i) { // more than one turn takes
         gone->say(i, "x");
         expected += std::to_string(i) + ":x ";
     }
     gone.reset();
     present.say(7, "y");
-    present.write(Bytes{1, 0, 0}); // the beginning of another
+    present.write(Bytes{1, 0, 0}); // the beginning of the next
     port->deliverWaiting();
     EXPECT_EQ(received, expected + "7:y ");
-    present.write(Bytes{0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 'e'}); // at which the receiver closes its port
+    present.write(Bytes{0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 'e'}); // closes the port
     last.say(8, "z");
     port->deliverWaiting();
     EXPECT_EQ(received, expected + "7:y 0:e ");
     EXPECT_FALSE(port->isValid());
+}
+
+TEST_F(SocketMessagePortsTest, ReceiverMayInvalidateOrDestroyItsPort)
+{
+    for (const bool destroys : {false, true}) {
+        std::shared_ptr<LocalPort> local;
+        int messages = 0;
+        const auto receiver = [&, marker = Bytes(100, 'm')](auto, ByteView data) {
+            ++messages;
+            destroys ? local.reset() : local->invalidate();
+            // The message and the receiver itself outlive the call.
+            EXPECT_EQ(data[2], 'e');
+            EXPECT_EQ(marker, Bytes(100, 'm'));
+            return Bytes{1};
+        };
+        local = ports.createLocalPort("a", receiver).port;
+        const RawPeer peer(pathOf("a"));
+        peer.say(0, "bye");
+        peer.say(0, "bye");
+        EXPECT_TRUE(waitUntil([&] { return peer.isClosedByOther(); }));
+        EXPECT_EQ(messages, 1);
+        EXPECT_NE(access(pathOf("a").c_str(), F_OK), 0);
+    }
+}
+
+TEST_F(SocketMessagePortsTest, DirectoryIsTheOwnersAlone)
+{
+    ASSERT_TRUE(PortDirectory(directory()).isUsable());
+    EXPECT_EQ(std::filesystem::status(directory()).permissions(), std::filesystem::perms::owner_all);
+    EXPECT_TRUE(PortDirectory(directory()).isUsable()) << "it exists already";
+    const std::pair<const char*, std::string> cases[] = {
+        // why, and what makes the directory
+        {"open to other users", "mkdir -m 770 "},
+        {"open to other users", "mkdir -m 701 "},
+        {"symbolic link", "ln -s /tmp "},
+        {"not a directory", "touch "},
+        {"another user", "install -d -m 700 -o 65534 "},
+    };
+    for (const auto& [reason, command] : cases) {
+        const auto shell = "rm -rf " + directory() + " && " + command + directory();
+        // Only root can give a directory away.
+        if (std::system(shell.c_str()) != 0 && geteuid() != 0) // NOLINT(cert-env33-c,concurrency-mt-unsafe)
+            continue;
+        EXPECT_FALSE(ports.createLocalPort("a", collector()).port) << command;
+        EXPECT_FALSE(ports.createRemotePort("a")) << command;
+        EXPECT_THAT(log.take(), AllOf(SizeIs(2), Each(HasSubstr(reason)))) << command;
+    }
+    EXPECT_FALSE(SocketMessagePorts(directory() + "/no/where").createRemotePort("a"));
+    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("No such file")));
+}
+
+TEST_F(SocketMessagePortsTest, NamesThatLeadElsewhereAreRefused)
+{
+    for (const std::string& name : {""s, "."s, ".."s, "a/b"s, "a\0b"s, std::string(108, 'x')}) {
+        EXPECT_FALSE(ports.createLocalPort(name, collector()).port) << name;
+        EXPECT_FALSE(ports.createRemotePort(name)) << name;
+        EXPECT_THAT(log.take(), SizeIs(2)) << name;
+    }
+}
+
+TEST_F(SocketMessagePortsTest, EnvironmentNamesTheDirectory)
+{
+    setEnvironment("ORVEX_PORT_DIR", "/chosen");
+    setEnvironment("XDG_RUNTIME_DIR", "/run/user/7");
+    EXPECT_EQ(PortDirectory().path(), "/chosen");
+    setEnvironment("ORVEX_PORT_DIR", "");
+    EXPECT_EQ(PortDirectory().path(), "/run/user/7/orvex");
+    setEnvironment("XDG_RUNTIME_DIR", nullptr);
+    EXPECT_EQ(PortDirectory().path(), "/tmp/orvex-" + std::to_string(geteuid()));
+}
+
+TEST_F(SocketMessagePortsTest, TelephonyServiceSaysWhyThereIsNoChannel)
+{
+    KoratTelephonyService telephony(ports);
+    EXPECT_FALSE(telephony.connect({})) << "nobody is there";
+    const std::pair<std::string, long> cases[] = {
+        // the reply, and what is wrong with it
+        {"", ETIMEDOUT},
+        {"huh", EPROTO},
+        {"<array/>", EPROTO},
+        {"<dict><key>ErrorCode</key><string>0</string></dict>", EPROTO},
+    };
+    for (const auto& [reply, code] : cases) {
+        const ServedPort service(directory(), telephony::kServicePortName, [&](auto, auto) {
+            return reply.empty() ? std::nullopt : std::optional(bytesOf(test::xmlList(reply)));
+        });
+        const auto answer = telephony.connect({})->createNetworkMonitorLogChannel("my.port");
+        EXPECT_EQ(answer.errorCode, code) << reply;
+        EXPECT_FALSE(answer.remotePortName) << reply;
+        EXPECT_THAT(log.take(), ElementsAre(HasSubstr(code == EPROTO ? "its reply" : "no reply in time")));
+    }
 }
 
 } // namespace

@@ -1,13 +1,12 @@
-#include "FatalErrors.h"
-#include "FileSystemLog.h"
 #include "LinuxSystemLog.h"
-#include "QueuedSystemLog.h"
+#include "Process.h"
 
 #include "Environment.h"
 #include "TemporaryFile.h"
 
 #include <gmock/gmock.h>
 
+#include <csignal>
 #include <cstdarg>
 #include <fstream>
 #include <future>
@@ -15,7 +14,7 @@
 
 #include <unistd.h>
 
-// In the place of the C library's, to see what reaches it.
+// Replaces the C library's, to show what reaches it.
 extern "C" [[gnu::format(printf, 2, 3)]] void syslog(int priority, const char* format, ...);
 
 void syslog(int priority, const char* format, ...)
@@ -32,7 +31,7 @@ namespace {
 
 using test::setEnvironment;
 
-// Ends the process, well unless the writing does not.
+// Exits with 0 unless writing ends the process first.
 void writeTo(const char* destination, const std::function<void(SystemLog&)>& write)
 {
     setEnvironment("ORVEX_LOG", destination);
@@ -55,7 +54,7 @@ TEST(LinuxSystemLogDeathTest, SyslogGetsItsOwnPrioritiesAndStandardErrorGetsLine
     EXPECT_EXIT(writeTo("stderr", write), well, "^<3>one\n<16>100% %s\n<5>\n$");
 }
 
-TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
+TEST(QueuedSystemLog, NobodyWaitsForASlowWriterAndLossesAreCounted)
 {
     std::promise<void> stuck;
     std::promise<void> go;
@@ -69,7 +68,7 @@ TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
             for (const auto& line : lines)
                 written.emplace_back(line.text);
         });
-        // The writer is stuck with the first line; of the others those are kept that fit the queue.
+        // While the writer is stuck with the first line, the queue fills up.
         log.write(Priority::notice, "0");
         stuck.get_future().wait();
         for (std::size_t i = 1; i < QueuedSystemLog::kMostLines + 8; ++i)
@@ -85,7 +84,23 @@ TEST(QueuedSystemLog, SlowWriterIsNotWaitedForAndLossesAreCounted)
     EXPECT_EQ(written.back(), "at the end") << "the destructor writes what is queued";
 }
 
-TEST(FileSystemLog, KeepsEveryLineAndTellsOfAFullDisk)
+// Signal handlers run on the main thread.
+TEST(QueuedSystemLog, ItsThreadTakesNoSignals)
+{
+    sigset_t blocked{};
+    {
+        QueuedSystemLog log([&blocked](const auto&) { pthread_sigmask(SIG_SETMASK, nullptr, &blocked); });
+        log.write(Priority::notice, "x");
+    }
+    sigset_t own{};
+    pthread_sigmask(SIG_SETMASK, nullptr, &own);
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGALRM, SIGCHLD, SIGUSR1}) {
+        EXPECT_EQ(sigismember(&blocked, signal), 1) << signal;
+        EXPECT_EQ(sigismember(&own, signal), 0) << signal;
+    }
+}
+
+TEST(FileSystemLog, KeepsEveryLineAndReportsAFullDisk)
 {
     const test::TemporaryFile temporary;
     std::string expected = "<3>ends by itself\n";

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Clock.h"
+#include "RunLoop.h"
 
 namespace orvex::test {
 

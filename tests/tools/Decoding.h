@@ -1,10 +1,10 @@
 #pragma once
 
 #include "Array.h"
-#include "Console.h"
-#include "FileResources.h"
+#include "FileStorage.h"
 #include "FixedClock.h"
 #include "LogGenerator.h"
+#include "SystemLog.h"
 
 #include <memory>
 

@@ -2,12 +2,11 @@
 
 #include "KoratProgram.h"
 
-#include "FileResources.h"
+#include "FileStorage.h"
 #include "KoratTelephonyService.h"
 #include "OrvexModel.h"
 #include "QtRunLoop.h"
 #include "SocketMessagePorts.h"
-#include "SystemClock.h"
 
 #include <gtest/gtest.h>
 

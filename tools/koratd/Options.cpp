@@ -1,7 +1,7 @@
 #include "Options.h"
 
-#include "ArgumentBytes.h"
 #include "FileConflict.h"
+#include "Process.h"
 
 #include <QCommandLineParser>
 

@@ -3,13 +3,10 @@
 #include "service/KoratService.h"
 #include "service/Report.h"
 
-#include "ArgumentBytes.h"
-#include "FatalErrors.h"
 #include "LinuxSystemLog.h"
+#include "Process.h"
 #include "QtRunLoop.h"
 #include "SocketMessagePorts.h"
-#include "StandardStreams.h"
-#include "TerminationSignals.h"
 
 #include <QCoreApplication>
 

@@ -1,7 +1,7 @@
 #include "DecodeOptions.h"
 
-#include "ArgumentBytes.h"
 #include "LogGenerator.h"
+#include "Process.h"
 #include "RegularFile.h"
 
 #include <QCommandLineParser>

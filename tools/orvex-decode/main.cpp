@@ -10,15 +10,14 @@
 #include "TreeJson.h"
 
 #include "DisplayTreePrinter.h"
-#include "FatalErrors.h"
-#include "FileResources.h"
-#include "FileSystemLog.h"
+#include "FileStorage.h"
+#include "LinuxSystemLog.h"
 #include "NodesByPath.h"
-#include "StandardStreams.h"
-#include "SystemClock.h"
+#include "Process.h"
+#include "QtRunLoop.h"
 
-#include "Console.h"
 #include "Snapshot.h"
+#include "SystemLog.h"
 #include "TextFormat.h"
 
 #include <filesystem>

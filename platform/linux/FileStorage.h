@@ -1,28 +1,50 @@
 #pragma once
 
-#include "Preferences.h"
+#include "Storage.h"
 
 #include <map>
 #include <memory>
+#include <string>
+#include <utility>
 
 class QSettings;
 
 namespace orvex {
 
+// The plist files of one directory, read anew at every call.
+class FileResources final : public Resources {
+public:
+    explicit FileResources(std::string directory)
+        : _directory(std::move(directory))
+    {
+    }
+
+    // The first of: $ORVEX_RESOURCES; the data directory of the installation that the program is part of,
+    // wherever that has moved; for a program run from the build tree, the source tree's resources; the data
+    // directory chosen at configuration.
+    static std::string defaultDirectory();
+
+    std::vector<std::string> propertyListPaths() const override;
+    DictionaryResult dictionaryNamed(const std::string& baseName) const override;
+
+private:
+    std::string _directory;
+};
+
 // Preferences as INI files, DOMAIN.ini in the user's configuration directory. Failures go to the system log.
 class IniPreferences final : public Preferences {
 public:
     IniPreferences();
-    // What was set is brought to storage.
+    // Writes pending changes.
     ~IniPreferences() override;
     IniPreferences(const IniPreferences&) = delete;
     IniPreferences& operator=(const IniPreferences&) = delete;
 
-    // Scalars and data only: other values have no form in such a file.
+    // Takes scalars and data only; an INI file has no form for other values.
     void setValue(const std::string& domain, const std::string& key, const Value& value) override;
     void synchronize(const std::string& domain) override;
     // Sends the signal Changed(domain, key) of org.orvex.Preferences at /org/orvex/Preferences on the session
-    // bus; nothing where none runs.
+    // bus, if one runs.
     void postChanged(const std::string& domain, const std::string& key) override;
 
 private:
