@@ -1,5 +1,7 @@
 #include "FileConflict.h"
 
+#include "OutputFile.h"
+
 #include <filesystem>
 #include <optional>
 #include <tuple>
@@ -11,19 +13,10 @@ namespace orvex {
 namespace {
 namespace fs = std::filesystem;
 
-// Device, inode and, for a file that does not exist yet, its name in the directory that these stand for.
+// Device and inode of a file, or of the directory of a file that does not exist yet, and then its name.
 using Identity = std::tuple<dev_t, ino_t, std::string>;
 
-fs::path withoutLinks(fs::path path)
-{
-    constexpr int kMostLinks = 40; // as many as the kernel follows
-    std::error_code error;
-    for (int i = 0; i < kMostLinks && fs::is_symlink(path, error); ++i)
-        path = path.parent_path() / fs::read_symlink(path, error);
-    return path;
-}
-
-// None for what may be opened twice, or cannot be opened at all.
+// None for what may be opened more than once, or not at all.
 std::optional<Identity> identityOf(const std::string& path)
 {
     struct stat status { };
@@ -31,7 +24,7 @@ std::optional<Identity> identityOf(const std::string& path)
         const bool isStream = S_ISCHR(status.st_mode) || S_ISFIFO(status.st_mode) || S_ISSOCK(status.st_mode);
         return isStream ? std::nullopt : std::optional(Identity(status.st_dev, status.st_ino, {}));
     }
-    const fs::path file = withoutLinks(path);
+    const fs::path file = followLinks(path, FollowedLinks::all).path;
     const fs::path directory = file.has_parent_path() ? file.parent_path() : fs::path(".");
     if (::stat(directory.c_str(), &status) != 0)
         return std::nullopt;

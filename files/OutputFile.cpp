@@ -15,9 +15,7 @@
 namespace orvex {
 
 namespace {
-
 constexpr mode_t kOwnerOnly = S_IRUSR | S_IWUSR;
-constexpr int kMostLinks = 40; // as many as the kernel follows
 
 class Descriptor {
 public:
@@ -72,7 +70,7 @@ bool isLinkToOpenFile(const Descriptor& link)
     return ::fstatfs(link.number(), &system) == 0 && system.f_type == PROC_SUPER_MAGIC;
 }
 
-// Where a link leads to, seen from where its own path is.
+// Where a link leads, relative to its own path.
 std::string targetOf(const Descriptor& link, const std::string& path)
 {
     std::array<char, PATH_MAX> buffer; // NOLINT(cppcoreguidelines-pro-type-member-init)
@@ -81,7 +79,7 @@ std::string targetOf(const Descriptor& link, const std::string& path)
     return target.starts_with('/') ? target : path.substr(0, path.rfind('/') + 1) + target;
 }
 
-// Opens what was looked at, whatever has taken its place meanwhile.
+// Opens the file that was found, even if another has taken its place since.
 OutputFile reopen(const Descriptor& found, bool isRedirection)
 {
     struct stat status { };
@@ -103,32 +101,42 @@ OutputFile reopen(const Descriptor& found, bool isRedirection)
 
 } // namespace
 
+LinkEnd followLinks(const std::string& path, FollowedLinks links)
+{
+    constexpr int kMostLinks = 40; // as many as the kernel follows
+    LinkEnd end{path, false, {}};
+    for (int i = 0; i <= kMostLinks; ++i) {
+        const Descriptor found(::open(end.path.c_str(), O_PATH | O_NOFOLLOW | O_CLOEXEC));
+        struct stat status { };
+        if (!found.isOpen() || ::fstat(found.number(), &status) != 0 || !S_ISLNK(status.st_mode))
+            return end;
+        if (links == FollowedLinks::trusted && !isTrusted(status)) {
+            end.error = "a link that belongs to another user";
+            return end;
+        }
+        end.isOpenFile = isLinkToOpenFile(found);
+        if (end.isOpenFile)
+            return end;
+        end.path = targetOf(found, end.path);
+    }
+    end.error = std::strerror(ELOOP); // NOLINT(concurrency-mt-unsafe)
+    return end;
+}
+
 OutputFile openOutputFile(const std::string& path)
 {
-    std::string place = path;
-    for (int links = 0; links <= kMostLinks; ++links) {
-        Descriptor created(::open(
-            place.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC | O_NOCTTY, kOwnerOnly));
-        if (created.isOpen())
-            return streamOf(created);
-        if (errno != EEXIST)
-            return fail();
-        const Descriptor found(::open(place.c_str(), O_PATH | O_NOFOLLOW | O_CLOEXEC));
-        struct stat status { };
-        if (!found.isOpen() || ::fstat(found.number(), &status) != 0)
-            return fail();
-        if (!S_ISLNK(status.st_mode))
-            return reopen(found, false);
-        if (!isTrusted(status))
-            return fail("a link that belongs to another user");
-        if (isLinkToOpenFile(found)) {
-            const Descriptor behind(::open(place.c_str(), O_PATH | O_CLOEXEC));
-            return behind.isOpen() ? reopen(behind, true) : fail();
-        }
-        place = targetOf(found, place);
-    }
-    errno = ELOOP;
-    return fail();
+    const LinkEnd end = followLinks(path, FollowedLinks::trusted);
+    if (!end.error.empty())
+        return {nullptr, end.error};
+    // A link that takes the place from now on is refused: neither call follows it.
+    Descriptor created(::open(
+        end.path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC | O_NOCTTY, kOwnerOnly));
+    if (created.isOpen())
+        return streamOf(created);
+    if (errno != EEXIST)
+        return fail();
+    const Descriptor found(::open(end.path.c_str(), O_PATH | O_CLOEXEC | (end.isOpenFile ? 0 : O_NOFOLLOW)));
+    return found.isOpen() ? reopen(found, end.isOpenFile) : fail();
 }
 
 std::string closeOutputFile(FilePointer file)
