@@ -154,6 +154,31 @@ TEST_F(SocketMessagePortsTest, RemotePortNoticesThatItsPeerHasGone)
     EXPECT_TRUE(waitUntil([&] { return !idle->isValid(); }));
 }
 
+TEST_F(SocketMessagePortsTest, ConnectionsLeaveNoDescriptorsOrThreadsBehind)
+{
+    const auto held = [] {
+        const auto entries = [](const char* folder) {
+            return std::distance(std::filesystem::directory_iterator(folder), {});
+        };
+        return entries("/proc/self/fd") + 1000 * entries("/proc/self/task");
+    };
+    const auto connect = [&] {
+        const auto local = ports.createLocalPort("a", collector()).port;
+        const auto remote = ports.createRemotePort("a");
+        EXPECT_EQ(remote->send(0, bytesOf("x"), 1s), Status::success);
+        EXPECT_TRUE(receives("0:x "));
+        received.clear();
+        remote->invalidate();
+        ports.createRemotePort("nobody");
+        turnFor(1ms);
+    };
+    connect(); // Qt opens what it keeps
+    const auto before = held();
+    for (int i = 0; i < 3; ++i)
+        connect();
+    EXPECT_EQ(held(), before);
+}
+
 TEST_F(SocketMessagePortsTest, SendingWaitsForAPeerThatDoesNotReadAndLosesNothing)
 {
     const auto dataOf = [](std::int32_t i) {
