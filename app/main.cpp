@@ -1,6 +1,6 @@
 // orvex: the window, or with --console the terminal, on the handset's baseband.
 
-#include "CommandLine.h"
+#include "AppOptions.h"
 #include "FirstPaint.h"
 #include "OrvexApp.h"
 #include "OrvexConsole.h"
@@ -43,7 +43,6 @@ namespace {
 using namespace orvex;
 
 constexpr int kExitFailure = 1;
-constexpr int kExitWrongUsage = 2;
 
 void printError(const std::string& why)
 {
@@ -140,9 +139,9 @@ int runConsole(int argc, char** argv, const std::string& resourceDirectory)
     return status;
 }
 
-std::optional<QSize> windowSize(const CommandLine& commandLine)
+std::optional<QSize> windowSize(const AppOptions& options)
 {
-    return commandLine.windowSizeOn(QGuiApplication::primaryScreen()->size());
+    return options.windowSizeOn(QGuiApplication::primaryScreen()->size());
 }
 
 // Runs the body with an application object that can open windows.
@@ -162,21 +161,21 @@ int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<in
     return body();
 }
 
-int runWindow(int argc, char** argv, const std::string& resourceDirectory, const CommandLine& commandLine)
+int runWindow(int argc, char** argv, const std::string& resourceDirectory, const AppOptions& options)
 {
-    return runInWindow(argc, argv, commandLine.theme, [&resourceDirectory, &commandLine] {
+    return runInWindow(argc, argv, options.theme, [&resourceDirectory, &options] {
         LinuxPlatform platform(resourceDirectory);
-        const auto app = OrvexApp::create(platform.forApp(), windowSize(commandLine));
+        const auto app = OrvexApp::create(platform.forApp(), windowSize(options));
         std::optional<StandardOutput> output;
         std::optional<StatusPrinter> statusPrinter;
-        if (commandLine.printsStatus) {
+        if (options.printsStatus) {
             installConsole(writeConsoleToStandardError);
             output.emplace([](int) {}); // the window stays when nobody reads
             statusPrinter.emplace(*app, *output);
         }
         const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
         std::optional<FirstPaint> firstPaint;
-        if (commandLine.endsWhenPainted) {
+        if (options.endsWhenPainted) {
             firstPaint.emplace([] {
                 std::puts("painted");
                 std::fflush(stdout);
@@ -191,23 +190,23 @@ int runWindow(int argc, char** argv, const std::string& resourceDirectory, const
 }
 
 // The file's tree, on the terminal or in a window of its own.
-int showSnapshot(int argc, char** argv, const CommandLine& commandLine)
+int showSnapshot(int argc, char** argv, const AppOptions& options)
 {
-    const std::string& path = *commandLine.snapshot;
+    const std::string& path = *options.snapshot;
     const auto [snapshot, error] = readSnapshot(path);
     if (!snapshot) {
         printError(error);
         return kExitFailure;
     }
-    if (commandLine.action == CommandLine::Action::console) {
+    if (options.usesConsole) {
         const std::string tree = DisplayTreePrinter::text(*snapshotTree(*snapshot));
         const bool written = std::printf("%s\n%s", snapshotMessage(*snapshot).c_str(), tree.c_str()) >= 0
             && std::fflush(stdout) == 0;
         return written ? EXIT_SUCCESS : kExitFailure;
     }
-    return runInWindow(argc, argv, commandLine.theme, [&, &shown = *snapshot] {
+    return runInWindow(argc, argv, options.theme, [&, &shown = *snapshot] {
         const SnapshotViewer viewer(
-            shown, std::filesystem::path(path).filename().string(), windowSize(commandLine));
+            shown, std::filesystem::path(path).filename().string(), windowSize(options));
         const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
         return QApplication::exec();
     });
@@ -218,28 +217,20 @@ int showSnapshot(int argc, char** argv, const CommandLine& commandLine)
 int main(int argc, char** argv)
 {
     occupyStandardStreams();
-    const CommandLine commandLine = CommandLine::parse(argumentTexts(argc, argv));
-    switch (commandLine.action) {
-    case CommandLine::Action::wrongUsage:
-        printError(commandLine.error + " Try 'orvex --help'.");
-        return kExitWrongUsage;
-    case CommandLine::Action::help: std::fputs(CommandLine::usage().c_str(), stdout); return EXIT_SUCCESS;
-    case CommandLine::Action::version: std::puts("orvex " ORVEX_VERSION); return EXIT_SUCCESS;
-    case CommandLine::Action::window:
-    case CommandLine::Action::console: break;
-    }
+    const auto options = AppOptions::parse(argc, argv);
+    if (options.ending)
+        return options.ending->print();
 
     std::signal(SIGPIPE, SIG_IGN); // a reader that goes is told by the write that fails
     const auto log = makeLinuxSystemLog("orvex");
     SystemLog::install(log.get());
     installFatalErrorHandler();
-    const std::string directory = commandLine.resources.value_or(FileResources::defaultDirectory());
+    const std::string directory = options.resources.value_or(FileResources::defaultDirectory());
     const auto run = [&] {
-        if (commandLine.snapshot)
-            return showSnapshot(argc, argv, commandLine);
-        return commandLine.action == CommandLine::Action::console
-            ? runConsole(argc, argv, directory)
-            : runWindow(argc, argv, directory, commandLine);
+        if (options.snapshot)
+            return showSnapshot(argc, argv, options);
+        return options.usesConsole ? runConsole(argc, argv, directory)
+                                   : runWindow(argc, argv, directory, options);
     };
     const int status = run();
     SystemLog::install(nullptr);

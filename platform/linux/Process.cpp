@@ -107,7 +107,7 @@ std::string descriptionOfCurrentException()
 }
 } // namespace
 
-QStringList argumentTexts(int count, char** arguments)
+QStringList argumentTexts(int count, const char* const* arguments)
 {
     QStringList texts;
     for (int i = 0; i < count; ++i)

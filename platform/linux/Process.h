@@ -13,7 +13,7 @@ namespace orvex {
 
 // The command line for QCommandLineParser, which takes texts, while file names are bytes in any encoding or
 // none. Each byte becomes one character; argumentBytes() gives the bytes back, whatever the locale.
-QStringList argumentTexts(int count, char** arguments);
+QStringList argumentTexts(int count, const char* const* arguments);
 std::string argumentBytes(const QString& text);
 
 // Called first. If the program was started without a standard input, output or error, the next files it opens

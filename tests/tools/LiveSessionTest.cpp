@@ -144,7 +144,6 @@ TEST_F(LiveSession, FileNamesAreBytes)
         {"cp $RESOURCES/LTE.plist $ODD; $DECODE --technology MRL_LTE --resources $ODD --output $ODD/tree"
          " --log $ODD/log --snapshot $ODD/snapshot $ODD/capture && cat $ODD/tree && test -s $ODD/log",
             0, "Orvex: (unknown)"},
-        {"$DECODE --technology MRL_LTE --jobs 2 --resources $ODD $ODD/capture", 0, "Orvex: (unknown)"},
         {"$DECODE --dlf $ODD/dlf $ODD/snapshot && test -s $ODD/dlf", 0, "DLF binary (161 bytes)"},
         {"$ORVEX --console --open $ODD/snapshot", 0, "Saved "},
         {"$ORVEX --console $ODD", 2, R"(\xff\xe4'.)"},

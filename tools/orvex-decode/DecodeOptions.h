@@ -1,5 +1,7 @@
 #pragma once
 
+#include "CommandLine.h"
+
 #include <cstddef>
 #include <optional>
 #include <string>
@@ -9,28 +11,24 @@ namespace orvex {
 
 // What the user asked of the decoder.
 struct DecodeOptions {
-    enum class Action { decode, help, version, wrongUsage };
     enum class Format { tree, json };
 
-    Action action = Action::decode;
-    std::string error; // with wrongUsage: one line
+    // The arguments as the program got them, its own name first.
+    static DecodeOptions parse(int count, const char* const* arguments);
 
-    std::string technology; // may be empty when all captures are snapshots
+    std::optional<CommandLine::Ending> ending; // instead of decoding; nothing else is valid then
+
+    std::string technology; // may be empty when all inputs are snapshots
     Format format = Format::tree;
-    std::size_t refreshEvery = 0;          // messages; 0 asks for the display at the end alone
-    std::optional<std::string> resources;  // a directory in place of the default one
+    std::size_t refreshEvery = 0;          // messages; 0 asks for the display only at the end
+    std::optional<std::string> resources;  // absent: the default directory
     std::optional<std::string> outputFile; // absent: standard output
     std::optional<std::string> logFile;
-    std::optional<std::string> snapshotFile; // of captures: what to save the session as
-    std::string description;                 // the user's words in it
-    std::optional<std::string> dlfFile;      // of a snapshot: where its binary log goes
-    std::vector<std::string> captures;
-    std::size_t jobs = 0;      // 0: one session takes all captures; else each has its own, so many at a time
-    bool areSnapshots = false; // the captures, all of them
-
-    // The arguments as the program got them, its own name first.
-    static DecodeOptions parse(int count, char** arguments);
-    static const char* usage();
+    std::optional<std::string> snapshotFile; // where to save the session; captures only
+    std::string description;                 // the user's words in the snapshot
+    std::optional<std::string> dlfFile;      // where the binary log of a snapshot goes
+    std::vector<std::string> inputs;
+    bool areSnapshots = false; // the inputs; else they are captures
 };
 
 } // namespace orvex

@@ -25,17 +25,6 @@ void JsonWriter::string(std::string_view text)
     _stream << Json(text).dump(-1, ' ', false, Json::error_handler_t::replace);
 }
 
-void JsonWriter::text(std::string_view piece)
-{
-    // A string holds no line break as such.
-    for (std::size_t end = piece.find('\n'); end != std::string_view::npos; end = piece.find('\n')) {
-        _stream << piece.substr(0, end);
-        beginLine();
-        piece.remove_prefix(end + 1);
-    }
-    _stream << piece;
-}
-
 void JsonWriter::open(char bracket)
 {
     beginValue();

@@ -27,9 +27,6 @@ public:
         key(name);
         string(text);
     }
-    // A value that is JSON already, indented from the left margin on. May come in pieces.
-    void beginText() { beginValue(); }
-    void text(std::string_view piece);
     // After the outermost value.
     void endDocument() { _stream << '\n'; }
 

@@ -35,17 +35,7 @@ Progress::~Progress()
 
 void Progress::advance(std::size_t messageLength)
 {
-    advanceBy(messageLength + kPcapRecordHeader);
-}
-
-void Progress::advanceOverFile(const std::string& capture)
-{
-    advanceBy(sizeOf(capture));
-}
-
-void Progress::advanceBy(std::uintmax_t bytes)
-{
-    _bytes += bytes;
+    _bytes += messageLength + kPcapRecordHeader;
     if (!_isShown || _bytes < _nextShown)
         return;
     _nextShown = _bytes + kStep;

@@ -18,11 +18,8 @@ public:
 
     // One more message of this length was taken.
     void advance(std::size_t messageLength);
-    // All of a capture was taken.
-    void advanceOverFile(const std::string& capture);
 
 private:
-    void advanceBy(std::uintmax_t bytes);
     void show() const;
 
     std::uintmax_t _totalBytes = 0;

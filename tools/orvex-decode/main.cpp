@@ -1,4 +1,3 @@
-#include "CaptureJobs.h"
 #include "CaptureReader.h"
 #include "DecodeOptions.h"
 #include "FileConflict.h"
@@ -29,32 +28,24 @@ using namespace orvex;
 namespace {
 
 constexpr int kFailure = 1;
-constexpr int kWrongUsage = 2;
-
-// Ahead of the decoding, but for jobs, which have other cores busy already.
-std::unique_ptr<CaptureReader> openCapture(const std::string& path, const DecodeOptions& options)
-{
-    auto reader = CaptureReader::open(path);
-    return options.jobs > 0 ? std::move(reader) : std::make_unique<ReadAhead>(std::move(reader));
-}
 
 // Feeds the messages of one capture. False, after a line on standard error, when it could not be read whole.
-bool feed(OfflineSession& session, const std::string& path, const DecodeOptions& options, Progress& progress)
+bool feed(OfflineSession& session, const std::string& path, Progress& progress)
 {
-    const auto reader = openCapture(path, options);
+    ReadAhead reader(CaptureReader::open(path));
     const std::size_t before = session.messageCount();
-    CaptureReader::Status status = reader->next();
-    for (; status == CaptureReader::Status::message; status = reader->next()) {
-        session.take(reader->message());
-        progress.advance(reader->message().size());
+    CaptureReader::Status status = reader.next();
+    for (; status == CaptureReader::Status::message; status = reader.next()) {
+        session.take(reader.message());
+        progress.advance(reader.message().size());
     }
-    if (const std::string omissions = reader->omissions(); !omissions.empty())
+    if (const std::string omissions = reader.omissions(); !omissions.empty())
         printError(path + ": " + omissions);
     if (status == CaptureReader::Status::end)
         return true;
     const std::size_t whole = session.messageCount() - before;
     return printError(
-        reader->error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
+        reader.error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
 }
 
 // A terminal gets the beginning of a text that is too long for it, a file or another program all of it.
@@ -89,7 +80,7 @@ std::string resourcesOf(const DecodeOptions& options)
 std::string conflictOf(const DecodeOptions& options)
 {
     std::vector<FileInUse> inputs;
-    for (const std::string& capture : options.captures)
+    for (const std::string& capture : options.inputs)
         inputs.push_back({"the input " + capture, capture});
     const std::string resources = resourcesOf(options);
     for (const std::string& name : FileResources(resources).propertyListPaths())
@@ -155,9 +146,9 @@ int decodeCaptures(const DecodeOptions& options)
     bool isGood = hasTemplate(*generator);
     OfflineSession session(std::move(generator), options.refreshEvery);
     {
-        Progress progress(options.captures);
-        for (const std::string& capture : options.captures)
-            isGood = feed(session, capture, options, progress) && isGood;
+        Progress progress(options.inputs);
+        for (const std::string& capture : options.inputs)
+            isGood = feed(session, capture, progress) && isGood;
     }
     // What could be read is shown, whatever could not; but nothing at all is no document.
     if (!isGood && session.messageCount() == 0)
@@ -171,7 +162,7 @@ int decodeCaptures(const DecodeOptions& options)
 bool extractDlf(const SnapshotDocument& document, const DecodeOptions& options)
 {
     if (!document.dlf())
-        return printError(options.captures.front() + ": holds no binary log");
+        return printError(options.inputs.front() + ": holds no binary log");
     return writeFile(
         *options.dlfFile, {reinterpret_cast<const char*>(document.dlf()->data()), document.dlf()->size()});
 }
@@ -199,7 +190,7 @@ int showSnapshots(const DecodeOptions& options)
     const Platform platform(options);
     std::vector<SnapshotDocument> documents;
     bool isGood = true;
-    for (const std::string& path : options.captures) {
+    for (const std::string& path : options.inputs) {
         const auto [snapshot, error] = readSnapshot(path);
         if (!snapshot) {
             isGood = printError(error);
@@ -253,21 +244,14 @@ int main(int argc, char** argv)
 {
     occupyStandardStreams();
     const DecodeOptions options = DecodeOptions::parse(argc, argv);
-    switch (options.action) {
-    case DecodeOptions::Action::help: std::cout << DecodeOptions::usage(); return 0;
-    case DecodeOptions::Action::version: std::cout << "orvex-decode " ORVEX_VERSION "\n"; return 0;
-    case DecodeOptions::Action::wrongUsage:
-        printError(options.error);
-        std::cerr << DecodeOptions::usage();
-        return kWrongUsage;
-    case DecodeOptions::Action::decode: break;
-    }
+    if (options.ending)
+        return options.ending->print();
     if (const std::string conflict = conflictOf(options); !conflict.empty()) {
         printError(conflict);
-        return kWrongUsage;
+        return CommandLine::kWrongUsage;
     }
 
     installConsole([](std::string_view) {}); // standard output carries the document alone
     installFatalErrorHandler();
-    return options.jobs > 0 ? decodeInJobs(options, decode) : decode(options);
+    return decode(options);
 }

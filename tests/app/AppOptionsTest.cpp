@@ -1,0 +1,87 @@
+#include "AppOptions.h"
+
+#include <gmock/gmock.h>
+
+namespace orvex::test {
+namespace {
+
+AppOptions parse(std::vector<const char*> arguments)
+{
+    arguments.insert(arguments.begin(), "orvex");
+    return AppOptions::parse(static_cast<int>(arguments.size()), arguments.data());
+}
+
+TEST(AppOptions, ReadsEachOption)
+{
+    AppOptions options = parse({});
+    EXPECT_FALSE(options.ending);
+    EXPECT_FALSE(options.usesConsole);
+    EXPECT_EQ(options.theme, Theme::Mode::system);
+    options = parse({"--resources", "/\xff b", "--dark", "--print-status", "--until-painted"});
+    EXPECT_EQ(options.resources, "/\xff b");
+    EXPECT_EQ(options.theme, Theme::Mode::dark);
+    EXPECT_TRUE(options.printsStatus);
+    EXPECT_TRUE(options.endsWhenPainted);
+    options = parse({"--open", "a", "--light"});
+    EXPECT_EQ(options.snapshot, "a");
+    EXPECT_EQ(options.theme, Theme::Mode::light);
+    EXPECT_TRUE(parse({"--open", "a", "--console"}).usesConsole);
+}
+
+TEST(AppOptions, EndsForHelpVersionAndWrongUsage)
+{
+    const struct {
+        std::vector<const char*> arguments;
+        int status;
+        const char* text;
+    } cases[] = {
+        {{"-h"}, 0, "Usage: "},
+        {{"--light", "--dark", "--help"}, 0, "  --open <FILE> "},
+        {{"--version", "--console"}, 0, "orvex "},
+        {{"--no-such"}, 2, "orvex: Unknown option 'no-such'. Try 'orvex --help'.\n"},
+        {{"file"}, 2, "orvex: Unexpected argument 'file'. Try 'orvex --help'.\n"},
+        {{"--open", "a", "--open", "a"}, 2, "--open is given more than once."},
+        {{"--light", "--dark"}, 2, "--light cannot be combined with --dark."},
+        {{"--console", "--light"}, 2, "--console cannot"},
+        {{"--console", "--dark"}, 2, "--console cannot"},
+        {{"--console", "--print-status"}, 2, "--console cannot"},
+        {{"--console", "--until-painted"}, 2, "--console cannot"},
+        {{"--console", "--size", "1x1"}, 2, "--console cannot"},
+        {{"--open", "a", "--resources", "/r"}, 2, "--open cannot"},
+        {{"--open", "a", "--print-status"}, 2, "--open cannot"},
+        {{"--open", "a", "--until-painted"}, 2, "--open cannot"},
+    };
+    for (const auto& [arguments, status, text] : cases) {
+        const auto ending = parse(arguments).ending;
+        ASSERT_TRUE(ending) << text;
+        EXPECT_EQ(ending->status, status) << text;
+        EXPECT_THAT(ending->text, testing::HasSubstr(text));
+    }
+}
+
+TEST(AppOptions, OpensTheWindowAtTheSizeAskedFor)
+{
+    constexpr QSize screens[] = {{1280, 800}, {601, 900}, {600, 960}};
+    const struct {
+        const char* value;
+        std::optional<QSize> sizes[3]; // on each of the screens
+    } cases[] = {
+        {"300x500", {{{300, 500}}, {{300, 500}}, {{300, 500}}}},
+        {"9999x1", {{{9999, 1}}, {{9999, 1}}, {{9999, 1}}}},
+        {"handset", {{{375, 667}}, {{375, 667}}, std::nullopt}},
+    };
+    for (const auto& [value, sizes] : cases) {
+        const AppOptions result = parse({"--size", value});
+        for (int i = 0; i < 3; ++i)
+            EXPECT_EQ(result.windowSizeOn(screens[i]), sizes[i]) << value;
+    }
+    EXPECT_EQ(parse({}).windowSizeOn({1280, 800}), std::nullopt);
+    for (const char* malformed : {"", "375", "375x", "x667", "375X667", "0x667", "-1x5", " 1x1", "1x1\n",
+             "10000x1", "1x1x1", "phone"}) {
+        const auto ending = parse({"--size", malformed}).ending;
+        EXPECT_TRUE(ending && ending->status == CommandLine::kWrongUsage) << malformed;
+    }
+}
+
+} // namespace
+} // namespace orvex::test
