@@ -1,10 +1,8 @@
 #include "OrvexApp.h"
 
-#include "HomeScreenPreference.h"
+#include "AppPlatform.h"
 #include "OrvexPaneController.h"
 #include "OrvexSaveViewController.h"
-#include "PaneReloader.h"
-#include "UpdateMessage.h"
 
 #include "Storage.h"
 
@@ -13,7 +11,7 @@
 namespace orvex {
 
 namespace {
-// A handset has it; elsewhere it is made. When that fails, so will the save, and say it.
+// A handset has it; elsewhere it is created. If that fails, the save fails too and reports it.
 std::string reportDirectory()
 {
     namespace fs = std::filesystem;
@@ -40,7 +38,7 @@ OrvexApp::OrvexApp(const AppPlatform& platform, const std::optional<QSize>& wind
 
 OrvexApp::~OrvexApp()
 {
-    // A retry that waits on the run loop may hold the model for longer.
+    // A retry queued on the run loop may keep the model alive.
     if (_model)
         _model->setListener(nullptr);
 }
@@ -54,7 +52,7 @@ void OrvexApp::applicationDidFinishLaunching()
     _updateMessage = kConnectingMessage;
 
     auto root = std::make_unique<OrvexPaneController>(*this, nullptr, "/");
-    // Without the dots: these come with the first answer of the session.
+    // Without the dots, which come with the first status of the session.
     root->setStatus("Connecting", true);
     auto stack = std::make_unique<NavigationStack>(std::move(root));
     stack->setDelegate(this);
@@ -115,7 +113,7 @@ void OrvexApp::showSaveView()
 {
     if (!_window || saveViewController())
         return;
-    // In a later turn: the screen must not go inside the action of its own button.
+    // Later: the screen must not be deleted inside the action of its own button.
     auto close = [&runLoop = _platform.session.runLoop, app = weak_from_this()] {
         runLoop.post([app] {
             if (const auto self = app.lock())

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "AppPlatform.h"
-#include "PaneHost.h"
+#include "OrvexPaneController.h"
 
 #include "NavigationStack.h"
 #include "Window.h"
@@ -14,13 +14,13 @@ namespace orvex {
 
 class OrvexPaneController;
 
-// The application with its window: one session, a stack of list screens, the status line of each.
+// The application with its window: a session, a stack of list screens, the status line of each.
 class OrvexApp final : public std::enable_shared_from_this<OrvexApp>,
                        public OrvexModelListener,
                        public NavigationStack::Delegate,
                        public PaneHost {
 public:
-    // The window fills the main screen unless it is to open with another size.
+    // Without a size the window fills the main screen.
     static std::shared_ptr<OrvexApp> create(
         const AppPlatform& platform, const std::optional<QSize>& windowSize = std::nullopt);
     ~OrvexApp() override;
@@ -40,10 +40,10 @@ public:
     bool allowSaveButton() const { return _allowSaveButton; }
     void getSaveButtonPref();
     bool offersSaveButton() const override { return _allowSaveButton; }
-    // Opens the snapshot screen over everything, unless it is open.
+    // Opens the snapshot screen unless it is open.
     void showSaveView() override;
     void closeSaveView();
-    // Null while it is not shown.
+    // Null unless it is shown.
     Screen* saveViewController() const { return _window ? _window->modalScreen() : nullptr; }
 
     void setGSMRSSI(bool shown);

@@ -2,13 +2,31 @@
 
 #include "TableCell.h"
 
+#include <QRectF>
+#include <QSizeF>
+
 namespace orvex {
 
 class TextLabel;
 
-// A row of a list screen. It is made as a branch, with a name only, or as a leaf, with name and value in a
-// view that scrolls sideways, and stays what it was made as even when it is reused for a row of the other
-// kind: a branch cell shows no value then.
+// The layout of a row, in points of the content view. Both texts are measured in the bold system font of size
+// 15, though the value is drawn in the regular one.
+
+// A branch has only a name.
+QRectF branchCellKeyFrame(const QRectF& bounds, const QSizeF& keySize);
+
+// A leaf has name and value in a view that scrolls sideways when the two do not fit. key and value are in the
+// coordinates of the scrolled content.
+struct LeafCellLayout {
+    QRectF key;
+    QRectF value;
+    QRectF view;
+    QSizeF contentSize;
+};
+LeafCellLayout leafCellLayout(const QRectF& bounds, const QSizeF& keySize, const QSizeF& valueSize);
+
+// A row of a list screen. A cell keeps the kind it is created with, even when it is reused for a row of the
+// other kind: a branch cell then shows no value.
 class OrvexCell final : public TableCell {
 public:
     enum class Kind { branch, leaf };
@@ -20,10 +38,10 @@ public:
     SidewaysScrollView* view() const { return _view; } // null in branch cells
 
     void setKey(const QString& text);
-    // Nothing to a branch cell.
+    // Does nothing in a branch cell.
     void setValue(const QString& text);
 
-    // Lay the row out as a branch or as a leaf, from now on at every change of size too.
+    // Lay the row out as a branch or as a leaf, now and after every change of size.
     void setLayoutKey();
     void setLayout();
 

@@ -1,10 +1,9 @@
 #include "OrvexPaneController.h"
 
-#include "OrvexCell.h"
-
-#include "ActivityIndicator.h"
+#include "Indicators.h"
 #include "NavigationStack.h"
 #include "NodesByPath.h"
+#include "OrvexCell.h"
 #include "TextLabel.h"
 #include "Theme.h"
 #include "VisibleText.h"
@@ -15,12 +14,13 @@
 namespace orvex {
 
 namespace {
-// One identifier for branches and leaves. A cell keeps the kind it was made as, so in a list of both kinds a
-// reused cell may be of the other kind than its row.
+
+// Shared by branches and leaves, although a cell keeps its kind: in a list of both, a reused cell may be of
+// the other kind than its row.
 constexpr const char* kCellIdentifier = "OrvexPaneControllerCell";
 constexpr int kStatusFontSize = 14;
 
-// The child with the name, at its former place if it is still there.
+// The row of the child with the name: the former row if it still has that name, else the first that does.
 std::optional<int> rowNamed(const std::string& name, const OrvexModelNode* node, int formerRow)
 {
     const auto* const children = node ? node->childNodes() : nullptr;
@@ -35,6 +35,7 @@ std::optional<int> rowNamed(const std::string& name, const OrvexModelNode* node,
         return std::nullopt;
     return static_cast<int>(found - children->begin());
 }
+
 } // namespace
 
 OrvexPaneController::OrvexPaneController(PaneHost& host, OrvexModelNodeRef node, std::string path)
@@ -112,7 +113,7 @@ std::unique_ptr<TableCell> OrvexPaneController::cellForRow(TableList& list, int 
         reused = std::make_unique<OrvexCell>(
             isBranch ? OrvexCell::Kind::branch : OrvexCell::Kind::leaf, kCellIdentifier);
 
-    auto& cell = static_cast<OrvexCell&>(*reused); // this screen makes no others
+    auto& cell = static_cast<OrvexCell&>(*reused); // the only kind this screen makes
     cell.setKey(QString::fromStdString(child.displayName()));
     if (isBranch) {
         cell.setAccessory(TableCell::Accessory::disclosureIndicator);
@@ -133,7 +134,7 @@ void OrvexPaneController::didSelectRow(TableList& list, std::optional<int> row)
     const OrvexModelNodeRef child = _nodes->childNodes()->at(static_cast<std::size_t>(*row));
     if (!child->childNodes())
         return list.deselectRow();
-    // A row can be released after its screen was popped or covered.
+    // A press may end after the screen was popped or covered.
     if (!navigationStack() || &navigationStack()->topScreen() != this)
         return;
     auto screen =
@@ -164,6 +165,18 @@ void OrvexPaneController::createToolbarItems()
         items.push_back(
             ToolbarItem::button(QStringLiteral("Save"), [host = &_host] { host->showSaveView(); }));
     setToolbarItems(std::move(items), true);
+}
+
+void reloadPanes(NavigationStack& stack, const OrvexModelNodeRef& root,
+    const std::function<OrvexModelNodeRef(const std::string& path)>& nodeAtPath)
+{
+    for (int index = 0; index < stack.count(); ++index) {
+        auto& pane = static_cast<OrvexPaneController&>(stack.screenAt(index)); // the only kind on this stack
+        OrvexModelNodeRef node = index == 0 ? root : nodeAtPath(pane.path());
+        if (!node && index > 0)
+            return stack.popTo(index - 1, true);
+        pane.reloadWithNode(std::move(node));
+    }
 }
 
 } // namespace orvex

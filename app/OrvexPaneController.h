@@ -1,7 +1,5 @@
 #pragma once
 
-#include "PaneHost.h"
-
 #include "OrvexModelNode.h"
 #include "Screen.h"
 #include "TableList.h"
@@ -9,13 +7,26 @@
 #include <QLabel>
 #include <QPointer>
 
+#include <functional>
 #include <optional>
 #include <string>
 
 namespace orvex {
 
-// The list screen of one node of the display tree: a row for every child. A branch opens a screen of its own,
-// a leaf shows name and value. Keeps its node, and so keeps its rows, until it is given another one.
+class NavigationStack;
+
+// What a list screen needs of the application.
+class PaneHost {
+public:
+    virtual ~PaneHost() = default;
+
+    // Whether the toolbar has a Save button.
+    virtual bool offersSaveButton() const = 0;
+    virtual void showSaveView() = 0;
+};
+
+// The list screen of a node of the display tree: a row for each child. A branch opens a screen of its own, a
+// leaf shows name and value. Keeps its node, and so its rows, until it gets another.
 class OrvexPaneController final : public Screen, public TableList::DataSource {
 public:
     // The node is null on the root screen until there is a tree. The host outlives the screen.
@@ -24,11 +35,11 @@ public:
     const std::string& path() const { return _keyPath; }
     const std::string& status() const { return _status; }
     bool isLoading() const { return _isLoading; }
-    // Shows the status in the toolbar; each change of the toolbar brings another.
+    // The status in the toolbar. Every change of the toolbar makes a new label.
     const QLabel* statusLabel() const { return _statusLabel; }
     TableList& tableList() const { return *_list; }
 
-    // No status is an empty one.
+    // An absent status counts as empty.
     void setStatus(const std::optional<std::string>& status, bool isLoading);
     void reloadWithNode(OrvexModelNodeRef node);
 
@@ -56,5 +67,10 @@ private:
     QPointer<QLabel> _statusLabel; // the toolbar row's
     TableList* _list;              // child
 };
+
+// Gives every list screen of the stack its node in the new tree, from the root up. Pops the first screen
+// whose path is gone and all above it, animated. The root screen gets the root even if that is null.
+void reloadPanes(NavigationStack& stack, const OrvexModelNodeRef& root,
+    const std::function<OrvexModelNodeRef(const std::string& path)>& nodeAtPath);
 
 } // namespace orvex

@@ -25,7 +25,7 @@ OrvexSaveViewController::OrvexSaveViewController(
     , _reportDirectory(std::move(reportDirectory))
     , _close(std::move(close))
     , _timeStamp(clock.now())
-    // All the way down: sections go on changing while the screen is open.
+    // A deep copy: sections go on changing while the screen is open.
     , _saveHistory(saveHistory ? Value(saveHistory).deepCopy().array() : Array::make())
     , _ui(std::make_unique<Ui::OrvexSaveViewController>())
 {

@@ -17,14 +17,13 @@ namespace Ui {
 class OrvexSaveViewController;
 }
 
-// Saves a snapshot: lists what it will hold, takes the user's words about it and writes the file. What it
-// saves is what there was when the screen was opened. Its layout is resources/OrvexSaveViewController.ui,
-// which also says which of the actions below belongs to which button.
+// Saves a snapshot: lists its contents, as they were when the screen opened, takes a description and writes
+// the file. Layout and connections of the buttons are in resources/OrvexSaveViewController.ui.
 class OrvexSaveViewController final : public Screen, public TableList::DataSource {
 public:
-    // `saveHistory` is what the session's generator gives to keep, a dictionary with a "Description" each;
-    // null is taken for none. `close` is called by Save and Cancel; it may not delete the screen at once. The
-    // clock outlives the screen.
+    // `saveHistory` holds the generator's entries, each a dictionary with a "Description"; null counts as
+    // empty. Save and Cancel call `close`, which must not delete the screen at once. The clock outlives the
+    // screen.
     OrvexSaveViewController(const ArrayRef& saveHistory, const Clock& clock, std::string reportDirectory,
         std::function<void()> close);
     ~OrvexSaveViewController() override;
@@ -33,16 +32,16 @@ public:
     QLineEdit& saveDescription() const;
     QWidget& firstResponder() override;
 
-    // Writes the snapshot and closes the screen, also when the file could not be written: then with a line in
-    // the system log and an alert that stays.
+    // Writes the snapshot and closes the screen. If the file cannot be written, logs that and shows an alert,
+    // which stays.
     void savePressed();
     void cancelPressed() { _close(); }
-    // Takes the keyboard away from the description.
+    // Takes the focus from the description.
     void backgroundTouched();
 
     int numberOfRows(const TableList& list) const override;
     std::unique_ptr<TableCell> cellForRow(TableList& list, int row) override;
-    // A touch beside the field; what will be saved cannot be chosen.
+    // Just a touch beside the field: entries cannot be chosen.
     void didSelectRow(TableList& list, std::optional<int> row) override;
 
 protected:

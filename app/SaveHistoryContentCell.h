@@ -6,7 +6,7 @@ namespace orvex {
 
 class TextLabel;
 
-// One thing that a snapshot will hold.
+// An entry of the snapshot to be saved.
 class SaveHistoryContentCell final : public TableCell {
 public:
     explicit SaveHistoryContentCell(std::string reuseIdentifier);

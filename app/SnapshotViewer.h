@@ -1,6 +1,6 @@
 #pragma once
 
-#include "PaneHost.h"
+#include "OrvexPaneController.h"
 #include "Snapshot.h"
 
 #include <QSize>
@@ -14,10 +14,10 @@ namespace orvex {
 class NavigationStack;
 class Window;
 
-// Shows a saved snapshot on the list screens. There is no session: nothing moves, nothing can be saved.
+// Shows a saved snapshot on the list screens, without a session.
 class SnapshotViewer final : public PaneHost {
 public:
-    // The name stands in the title of the window, which fills the main screen unless another size is given.
+    // The name goes into the window's title. Without a size the window fills the main screen.
     SnapshotViewer(const Snapshot& snapshot, const std::string& name,
         const std::optional<QSize>& windowSize = std::nullopt);
     ~SnapshotViewer() override;
@@ -35,7 +35,7 @@ private:
     NavigationStack* _navController; // the window's
 };
 
-// What the status line says under a snapshot.
+// The status line of a snapshot.
 std::string snapshotMessage(const Snapshot& snapshot);
 
 } // namespace orvex

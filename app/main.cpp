@@ -1,17 +1,15 @@
-// orvex: the window, or with --console the terminal, on the handset's baseband.
+// orvex: shows what the handset's baseband reports, in a window or on the terminal.
 
 #include "AppOptions.h"
-#include "FirstPaint.h"
+#include "ConsoleOutput.h"
 #include "OrvexApp.h"
 #include "OrvexConsole.h"
 #include "SnapshotViewer.h"
-#include "StandardOutput.h"
-#include "StatusPrinter.h"
+#include "Window.h"
 
 #include "DisplayTreePrinter.h"
 #include "SnapshotTree.h"
 
-#include "Accessibility.h"
 #include "FileStorage.h"
 #include "KoratTelephonyService.h"
 #include "LinuxSystemLog.h"
@@ -49,7 +47,7 @@ void printError(const std::string& why)
     std::fprintf(stderr, "orvex: %s\n", visibleText(why).c_str());
 }
 
-// The platform's implementations, in the order in which they need each other.
+// The implementations of the platform, in the order of their dependencies.
 struct LinuxPlatform {
     explicit LinuxPlatform(const std::string& resourceDirectory)
         : resources(resourceDirectory)
@@ -88,8 +86,8 @@ bool displayIsNamed()
     });
 }
 
-// While the application object comes into being, Qt's only fatal message is that no display can be opened;
-// it would abort the process after it. The warnings before it say the same at length.
+// While the application object is constructed, Qt's only fatal message is that it cannot open a display; Qt
+// would then abort. The warnings before it say the same at length.
 void endWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString&)
 {
     if (type != QtFatalMsg)
@@ -98,13 +96,13 @@ void endWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString&
     std::_Exit(kExitFailure);
 }
 
-// Qt takes the user's locale, which may have decimal commas. Values and property lists have points.
+// Qt sets the user's locale, which may have decimal commas. Values and property lists have points.
 void keepDecimalPoints()
 {
     std::setlocale(LC_NUMERIC, "C");
 }
 
-// For programs whose standard output is for others to read.
+// For programs whose standard output is read by other programs.
 void writeConsoleToStandardError(std::string_view line)
 {
     std::fprintf(stderr, "%.*s\n", static_cast<int>(line.size()), line.data());
@@ -114,7 +112,7 @@ int runConsole(int argc, char** argv, const std::string& resourceDirectory)
 {
     const QCoreApplication application(argc, argv);
     keepDecimalPoints();
-    // Standard output is the tree's. A terminal that is redrawn in place has no room for other lines at all.
+    // Standard output is for the tree alone, and a terminal redrawn in place has no room for other lines.
     const bool wouldDisturb = ::isatty(STDOUT_FILENO) && ::isatty(STDERR_FILENO);
     installConsole([wouldDisturb](std::string_view line) {
         if (!wouldDisturb)
@@ -128,7 +126,7 @@ int runConsole(int argc, char** argv, const std::string& resourceDirectory)
                 std::string("standard output: ") + std::strerror(error)); // NOLINT(concurrency-mt-unsafe)
             status = kExitFailure;
         }
-        installConsole([](std::string_view) {});        // nobody is left to read about the end
+        installConsole([](std::string_view) {});        // nobody reads them any more
         QTimer::singleShot(0, &QCoreApplication::quit); // the event loop may not run yet
     });
     OrvexConsole console(platform.forApp(), output);
@@ -170,7 +168,7 @@ int runWindow(int argc, char** argv, const std::string& resourceDirectory, const
         std::optional<StatusPrinter> statusPrinter;
         if (options.printsStatus) {
             installConsole(writeConsoleToStandardError);
-            output.emplace([](int) {}); // the window stays when nobody reads
+            output.emplace([](int) {}); // the window stays even if nobody reads
             statusPrinter.emplace(*app, *output);
         }
         const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
@@ -189,7 +187,7 @@ int runWindow(int argc, char** argv, const std::string& resourceDirectory, const
     });
 }
 
-// The file's tree, on the terminal or in a window of its own.
+// Shows the tree of the file, on the terminal or in a window.
 int showSnapshot(int argc, char** argv, const AppOptions& options)
 {
     const std::string& path = *options.snapshot;
@@ -221,7 +219,7 @@ int main(int argc, char** argv)
     if (options.ending)
         return options.ending->print();
 
-    std::signal(SIGPIPE, SIG_IGN); // a reader that goes is told by the write that fails
+    std::signal(SIGPIPE, SIG_IGN); // the failing write reports a reader that has gone
     const auto log = makeLinuxSystemLog("orvex");
     SystemLog::install(log.get());
     installFatalErrorHandler();

@@ -12,8 +12,8 @@
 
 #include "Animation.h"
 #include "FileStorage.h"
-#include "FirstPaint.h"
 #include "QtRunLoop.h"
+#include "Window.h"
 
 #include <benchmark/benchmark.h>
 

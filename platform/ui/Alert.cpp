@@ -1,6 +1,6 @@
 #include "Alert.h"
 
-#include "BarButton.h"
+#include "Bar.h"
 #include "TextLabel.h"
 #include "Theme.h"
 
@@ -104,7 +104,7 @@ void Alert::paintEvent(QPaintEvent*)
     painter.fillRect(QRect(card().left(), _button->y() - 1, card().width(), 1), theme.barSeparator);
 }
 
-// What lies below must not see it.
+// Swallowed: nothing below the alert may see it.
 void Alert::mousePressEvent(QMouseEvent*) { }
 
 void Alert::keyPressEvent(QKeyEvent* event)

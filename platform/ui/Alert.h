@@ -8,11 +8,11 @@ namespace orvex {
 class BarButton;
 class TextLabel;
 
-// A message with one button, on a card over everything else in its window. It takes all input until the
-// button is pressed, by Return or Escape too, and stays when the screen that showed it goes.
+// A message with one button, on a card over everything else in its window. It takes all input until it is
+// dismissed, by the button, Return or Escape, and outlives the screen that showed it.
 class Alert final : public QWidget {
 public:
-    // Shows an alert over the window of the widget and does not wait. It deletes itself.
+    // Shows an alert over the widget's window and returns at once. The alert deletes itself.
     static Alert& show(QWidget& over, const QString& title, const QString& message, const QString& button);
 
     TextLabel& title() const { return *_title; }
@@ -30,7 +30,7 @@ private:
     Alert(QWidget& window, const QString& title, const QString& message, const QString& button);
 
     void dismiss();
-    // Keeps the keyboard, whoever asks for it meanwhile; that one gets it afterwards.
+    // Keeps the focus. A widget that asks for it meanwhile gets it afterwards.
     void holdFocus(QWidget* now);
     QRect card() const;
 

@@ -8,12 +8,11 @@ class QVariantAnimation;
 
 namespace orvex {
 
-// Whether slides and fades take time. Switched off, every transition is finished when the call that starts
-// it returns.
+// Whether slides and fades take time. If not, every transition has finished when start() returns.
 bool animationsEnabled();
 void setAnimationsEnabled(bool enabled);
 
-// One transition at a time, from 0 to 1 with a soft landing.
+// Runs one transition at a time, from 0 to 1, slowing down at the end.
 class Transition : public QObject {
 public:
     using Step = std::function<void(double progress)>;
@@ -24,10 +23,9 @@ public:
     {
     }
 
-    // Runs the step with 0, on the way, and with 1, then the end. A transition still running is finished
-    // first.
+    // Calls the step with 0, values in between and 1, then the end. Finishes a running transition first.
     void start(int milliseconds, Step step, End end);
-    // Jumps to the end. Nothing happens when nothing is running.
+    // Jumps to the end of a running transition.
     void finish();
     bool isRunning() const { return static_cast<bool>(_end); }
 

@@ -1,10 +1,27 @@
 #include "Bar.h"
 
+#include "TextLabel.h"
 #include "Theme.h"
 
 #include <QPainter>
 
+#include <algorithm>
+
 namespace orvex {
+
+namespace {
+
+constexpr int kButtonHeight = 36;
+constexpr int kPadding = 8;
+constexpr int kChevronWidth = 8;
+constexpr int kChevronHeight = 15;
+constexpr int kChevronGap = 7;
+
+constexpr int kSideMargin = 4;
+constexpr int kTitleMargin = 10;
+constexpr double kBackButtonShare = 0.4; // of the bar, which it may take even if the title must give way
+
+} // namespace
 
 Bar::Bar(QWidget* parent, Line line)
     : QWidget(parent)
@@ -19,6 +36,101 @@ void Bar::paintEvent(QPaintEvent*)
     painter.fillRect(rect(), Theme::current().bar);
     const int top = _line == Line::above ? 0 : height() - kLineHeight;
     painter.fillRect(QRect(0, top, width(), kLineHeight), Theme::current().barSeparator);
+}
+
+BarButton::BarButton(Style style, const QString& title, QWidget* parent)
+    : QAbstractButton(parent)
+    , _style(style)
+{
+    setText(title);
+    setFont(style == Style::back ? Theme::systemFont(15) : Theme::boldSystemFont(15));
+    setFocusPolicy(Qt::TabFocus);
+    setCursor(Qt::PointingHandCursor);
+}
+
+int BarButton::textLeft() const
+{
+    return _style == Style::back ? kPadding + kChevronWidth + kChevronGap : kPadding;
+}
+
+QSize BarButton::sizeHint() const
+{
+    return {textLeft() + fontMetrics().horizontalAdvance(text()) + kPadding, kButtonHeight};
+}
+
+QSize BarButton::minimumSizeHint() const
+{
+    return {textLeft() + kPadding, kButtonHeight};
+}
+
+void BarButton::paintEvent(QPaintEvent*)
+{
+    QPainter painter(this);
+    QColor color = Theme::current().tint;
+    if (isDown())
+        color.setAlphaF(0.4F);
+    if (hasFocus()) {
+        painter.setRenderHint(QPainter::Antialiasing);
+        painter.setPen(QPen(Theme::current().tint, 1.5));
+        painter.drawRoundedRect(QRectF(rect()).adjusted(1, 2, -1, -2), 6, 6);
+    }
+    if (_style == Style::back) {
+        const QRectF chevron(kPadding, (height() - kChevronHeight) / 2.0, kChevronWidth, kChevronHeight);
+        drawChevron(painter, chevron, ChevronDirection::left, color, 2.4);
+    }
+    painter.setPen(color);
+    const QRect place(textLeft(), 0, width() - textLeft() - kPadding, height());
+    const auto side = _style == Style::back ? Qt::AlignLeft : Qt::AlignHCenter;
+    // Eliding counts fractions of a pixel, which the size hint rounds off.
+    const bool fits = fontMetrics().horizontalAdvance(text()) <= place.width();
+    const QString fitted = fits ? text() : fontMetrics().elidedText(text(), Qt::ElideRight, place.width());
+    painter.drawText(place, static_cast<int>(side | Qt::AlignVCenter) | Qt::TextSingleLine, fitted);
+}
+
+NavigationBar::NavigationBar(QWidget* parent)
+    : Bar(parent)
+    , _titleLabel(new TextLabel(Theme::boldSystemFont(17), this))
+    , _backButton(new BarButton(BarButton::Style::back, {}, this))
+{
+    _backButton->hide();
+}
+
+void NavigationBar::setTitles(const QString& title, const QString& backTitle, bool showsBackButton)
+{
+    _title = title;
+    _backButton->setText(backTitle);
+    _backButton->setAccessibleName(showsBackButton ? QStringLiteral("Back to %1").arg(backTitle) : QString());
+    _backButton->setVisible(showsBackButton);
+    layoutTitle();
+}
+
+// The title is centred, moves aside for a broad back button and is elided only when that is not enough.
+void NavigationBar::layoutTitle()
+{
+    int left = kTitleMargin;
+    if (!_backButton->isHidden()) {
+        const int besideTitle =
+            (width() - sizeOfLine(_title, _titleLabel->font()).width()) / 2 - kTitleMargin - kSideMargin;
+        const int widest = std::max(besideTitle, static_cast<int>(width() * kBackButtonShare));
+        const QSize size = _backButton->sizeHint();
+        _backButton->setGeometry(
+            kSideMargin, (height() - size.height()) / 2, std::min(size.width(), widest), size.height());
+        left = _backButton->geometry().right() + kTitleMargin;
+    }
+    const int room = std::max(0, width() - kTitleMargin - left);
+    const QFontMetrics metrics(_titleLabel->font());
+    const QString fitted = metrics.elidedText(_title, Qt::ElideRight, room);
+    const int titleWidth = sizeOfLine(fitted, _titleLabel->font()).width();
+    const int centred = (width() - titleWidth) / 2;
+    _titleLabel->setLine(fitted);
+    _titleLabel->setAccessibleName(_title);
+    _titleLabel->setGeometry(std::clamp(centred, left, std::max(left, width() - kTitleMargin - titleWidth)),
+        0, titleWidth, height() - 1);
+}
+
+void NavigationBar::resizeEvent(QResizeEvent*)
+{
+    layoutTitle();
 }
 
 } // namespace orvex

@@ -1,7 +1,6 @@
 #include "NavigationStack.h"
 
-#include "BarButton.h"
-#include "NavigationBar.h"
+#include "Bar.h"
 #include "Theme.h"
 #include "Toolbar.h"
 
@@ -60,7 +59,7 @@ void NavigationStack::popTo(int index, bool animated)
         Screen& popped = screenAt(above);
         popped._stack = nullptr;
         if (&popped == &leaving)
-            continue; // still to slide out
+            continue; // slides out first
         popped.hide();
         popped.deleteLater();
     }
@@ -89,12 +88,12 @@ void NavigationStack::slide(Screen& leaving, Direction direction, bool animated)
     _edge->raise();
     _edge->show();
     arriving.firstResponder().setFocus();
-    // A second tap that was meant for the screen below must not fall upon the one that slides in.
+    // A second tap meant for the old screen must not hit the new one.
     _pages->setAttribute(Qt::WA_TransparentForMouseEvents);
 
     const auto step = [this, &leaving, &arriving, isPush](double progress) {
         const double covered =
-            isPush ? progress : 1 - progress; // share of the width that the upper one covers
+            isPush ? progress : 1 - progress; // share of the width that the upper screen covers
         const int upper = qRound((1 - covered) * _pages->width());
         const int lower = qRound(-covered * kParallax * _pages->width());
         _edge->setGeometry(upper - 1, 0, 1, _pages->height());
@@ -154,7 +153,7 @@ void NavigationStack::showEvent(QShowEvent* event)
     if (!_rootHasAppeared) {
         _rootHasAppeared = true;
         topScreen().viewWillAppear(false);
-        // In a turn of its own: whoever shows the stack for the first time has yet to set up what it shows.
+        // Later: whoever shows the stack has yet to set up what it shows.
         const auto announceRoot = [this] {
             if (_delegate && count() == 1)
                 _delegate->willShowScreen(*this, topScreen(), false);
@@ -164,7 +163,7 @@ void NavigationStack::showEvent(QShowEvent* event)
     QWidget::showEvent(event);
 }
 
-// Not by a focus proxy: the Tab key takes the stack for its proxy and never reaches the back button.
+// Not a focus proxy: with one, the Tab key never reaches the back button.
 void NavigationStack::focusInEvent(QFocusEvent*)
 {
     topScreen().firstResponder().setFocus();

@@ -11,21 +11,21 @@ namespace orvex {
 class NavigationBar;
 class Toolbar;
 
-// A stack of screens of which the top one is seen, between a title bar with a way back and a toolbar. Pushes
-// and pops slide; one that comes during another finishes that first. Escape, Backspace and the back key pop.
+// Shows the top screen of a stack, between a title bar with a back button and a toolbar. Pushes and pops
+// slide; a new one finishes a running one first. Escape, Backspace and the back key pop.
 class NavigationStack final : public QWidget {
 public:
     class Delegate {
     public:
         virtual ~Delegate() = default;
-        // The screen comes into view: by a push or a pop, or as the root of a stack that is shown for the
-        // first time, which is told in the next turn of the event loop.
+        // The screen comes into view: by a push or a pop, or as the root of a stack shown for the first time,
+        // then in the next turn of the event loop.
         virtual void willShowScreen(NavigationStack& stack, Screen& screen, bool animated) = 0;
     };
 
     explicit NavigationStack(std::unique_ptr<Screen> root, QWidget* parent = nullptr);
 
-    // Held by address: clear it before it goes.
+    // Not owned: clear it before it is deleted.
     void setDelegate(Delegate* delegate) { _delegate = delegate; }
 
     int count() const { return static_cast<int>(_screens.size()); }
@@ -36,14 +36,14 @@ public:
     void push(std::unique_ptr<Screen> screen, bool animated);
     // The root stays.
     void pop(bool animated) { popTo(count() - 2, animated); }
-    // Drops every screen above the index. The screens live on until the slide is over and control is back in
-    // the event loop, so that a screen may pop itself.
+    // Drops every screen above the index. Screens are deleted in the event loop after the slide, so a screen
+    // may pop itself.
     void popTo(int index, bool animated);
     bool isAnimating() const { return _slide.isRunning(); }
 
     void setToolbarHidden(bool hidden);
 
-    // Told by screens.
+    // Called by screens.
     void titleChanged();
     void toolbarRowChanged(const Screen& screen, const ToolbarRow* replaced);
 

@@ -41,4 +41,10 @@ void Screen::paintEvent(QPaintEvent* event)
     QPainter(this).fillRect(event->rect(), Theme::current().background);
 }
 
+TouchArea::TouchArea(QWidget* parent)
+    : QAbstractButton(parent)
+{
+    setFocusPolicy(Qt::NoFocus);
+}
+
 } // namespace orvex

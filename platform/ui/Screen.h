@@ -1,7 +1,8 @@
 #pragma once
 
-#include "ToolbarRow.h"
+#include "Toolbar.h"
 
+#include <QAbstractButton>
 #include <QPointer>
 #include <QWidget>
 
@@ -21,7 +22,7 @@ public:
     void setTitle(const QString& title);
 
     void setToolbarItems(std::vector<ToolbarItem> items, bool animated);
-    // Null until items were set.
+    // Null until items are set.
     ToolbarRow* toolbarRow() const { return _toolbarRow; }
 
     // The stack the screen is on; null before its push and after its pop.
@@ -31,7 +32,7 @@ public:
     virtual void viewWillAppear(bool /*animated*/) { }
     virtual void viewWillDisappear(bool /*animated*/) { }
 
-    // What gets the keyboard when the screen comes into view.
+    // The widget to focus when the screen comes into view.
     virtual QWidget& firstResponder() { return *this; }
 
 protected:
@@ -43,6 +44,20 @@ private:
     QString _title;
     QPointer<ToolbarRow> _toolbarRow; // owned; its parent is whichever bar shows it
     NavigationStack* _stack = nullptr;
+};
+
+// An invisible background that emits pressed() for a touch beside the widgets it holds.
+class TouchArea final : public QAbstractButton {
+public:
+    explicit TouchArea(QWidget* parent);
+
+protected:
+    void paintEvent(QPaintEvent*) override { }
+    // Keys that its widgets ignore are for the screen, not for the button.
+    // NOLINTBEGIN(bugprone-parent-virtual-call)
+    void keyPressEvent(QKeyEvent* event) override { QWidget::keyPressEvent(event); }
+    void keyReleaseEvent(QKeyEvent* event) override { QWidget::keyReleaseEvent(event); }
+    // NOLINTEND(bugprone-parent-virtual-call)
 };
 
 } // namespace orvex

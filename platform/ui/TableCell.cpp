@@ -1,7 +1,5 @@
 #include "TableCell.h"
 
-#include "Chevron.h"
-#include "SidewaysScrollView.h"
 #include "Theme.h"
 
 #include <QPainter>
@@ -13,6 +11,7 @@
 namespace orvex {
 
 namespace {
+
 constexpr int kSeparatorLeft = 10;
 constexpr double kChevronWidth = 6.5;
 constexpr double kChevronHeight = 12;
@@ -20,8 +19,39 @@ constexpr double kChevronRight = 14; // from the chevron's tip to the edge
 constexpr double kDotRadius = 1;
 constexpr double kDotDistance = 3.2;
 constexpr QSizeF kCheckmarkSize(13, 10);
-constexpr int kAccessoryWidth = 20; // what chevron or checkmark take from the content view
+constexpr int kAccessoryWidth = 20; // taken from the content view by a chevron or checkmark
+
 } // namespace
+
+SidewaysScrollView::SidewaysScrollView(QWidget* parent)
+    : QWidget(parent)
+    , _content(new QWidget(this))
+{
+}
+
+void SidewaysScrollView::setContentSize(const QSize& size)
+{
+    _content->resize(size);
+    setOffset(_offset);
+}
+
+bool SidewaysScrollView::hidesContentAtRight() const
+{
+    return _content->childrenRect().right() + _content->x() >= width();
+}
+
+void SidewaysScrollView::setOffset(int offset, int overshoot)
+{
+    _offset = std::clamp(offset, 0, maximumOffset());
+    _content->move(-_offset - overshoot, 0);
+    if (parentWidget() && parentWidget()->parentWidget())
+        parentWidget()->parentWidget()->update(); // the row draws the mark for hidden content
+}
+
+void SidewaysScrollView::resizeEvent(QResizeEvent*)
+{
+    setOffset(_offset);
+}
 
 TableCell::TableCell(std::string reuseIdentifier)
     : _reuseIdentifier(std::move(reuseIdentifier))
@@ -90,7 +120,7 @@ void TableCell::drawCheckmark(QPainter& painter) const
     painter.restore();
 }
 
-// Three dots beside the content: a value may be wholly out of sight, and nobody would look for it.
+// Three dots: without them nobody would look for a value that is entirely out of view.
 void TableCell::drawMoreMark(QPainter& painter) const
 {
     painter.setRenderHint(QPainter::Antialiasing);

@@ -1,17 +1,65 @@
 #include "TableList.h"
 
-#include "ScrollIndicator.h"
-#include "SidewaysScrollView.h"
+#include "Indicators.h"
+#include "TableCell.h"
 #include "Theme.h"
 
+#include <QGuiApplication>
 #include <QPaintEvent>
 #include <QPainter>
 #include <QScroller>
+#include <QStyleHints>
 
 #include <algorithm>
+#include <cmath>
+#include <iterator>
 #include <vector>
 
 namespace orvex {
+
+void CellReuseQueue::append(std::unique_ptr<TableCell> cell)
+{
+    _cells.push_back(std::move(cell));
+}
+
+void CellReuseQueue::prepend(std::vector<std::unique_ptr<TableCell>> cells)
+{
+    _cells.insert(
+        _cells.begin(), std::make_move_iterator(cells.begin()), std::make_move_iterator(cells.end()));
+}
+
+std::unique_ptr<TableCell> CellReuseQueue::take(std::string_view identifier)
+{
+    const auto found = std::ranges::find_if(
+        _cells, [identifier](const auto& cell) { return cell->reuseIdentifier() == identifier; });
+    if (found == _cells.end())
+        return nullptr;
+    auto cell = std::move(*found);
+    _cells.erase(found);
+    return cell;
+}
+
+void CellReuseQueue::hideAll()
+{
+    for (const auto& cell : _cells)
+        cell->hide();
+}
+
+bool TableDrag::moveTo(const QPointF& position)
+{
+    const QPointF travel = position - _start;
+    if (_axis == Axis::undecided) {
+        const double slop = QGuiApplication::styleHints()->startDragDistance();
+        if (travel.manhattanLength() < slop)
+            return false;
+        _axis = std::abs(travel.x()) > std::abs(travel.y()) ? Axis::horizontal : Axis::vertical;
+        const double along = _axis == Axis::horizontal ? travel.x() : travel.y();
+        _slack = std::clamp(along, -slop, slop);
+    }
+    _fed = _axis == Axis::horizontal ? _start + QPointF(travel.x() - _slack, 0)
+                                     : _start + QPointF(0, travel.y() - _slack);
+    return true;
+}
 
 TableList::TableList(DataSource& source, QWidget* parent)
     : TableList(parent)
@@ -49,7 +97,7 @@ void TableList::reloadData(const RowMove& move)
 {
     _rowCount = _source ? _source->numberOfRows(*this) : 0;
     updateGeometry();
-    // Before whatever else waits for reuse, so that each row finds its own cell first.
+    // Ahead of other cells to reuse, so that each row gets its own.
     std::vector<std::unique_ptr<TableCell>> inView;
     for (auto& [row, cell] : _cells)
         inView.push_back(std::move(cell));
@@ -108,7 +156,7 @@ void TableList::layoutRows()
     const int first = std::clamp(top / _rowHeight, 0, _rowCount);
     const int end = std::clamp((top + height() + _rowHeight - 1) / _rowHeight, first, _rowCount);
 
-    // Cells that leave come first, so that a row that enters can have one of them.
+    // Cells that leave first, so that rows that enter can reuse them.
     for (auto it = _cells.begin(); it != _cells.end();) {
         if (it->first >= first && it->first < end) {
             ++it;

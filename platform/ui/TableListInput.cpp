@@ -1,6 +1,6 @@
-// What fingers, mouse, wheel and keys do to a table list.
+// How a table list handles fingers, mouse, wheel and keys.
 
-#include "SidewaysScrollView.h"
+#include "TableCell.h"
 #include "TableList.h"
 
 #include <QApplication>
@@ -17,8 +17,8 @@ namespace orvex {
 
 namespace {
 constexpr int kSidewaysKeyStep = 40; // pixels
-constexpr int kWheelLine = 20;       // pixels for one line of the wheel's setting
-constexpr double kWheelNotch = 120;  // angle units of one notch
+constexpr int kWheelLine = 20;       // pixels for a line of the wheel setting
+constexpr double kWheelNotch = 120;  // angle units in a notch
 
 qint64 millisecondsOf(const QMouseEvent& event)
 {
@@ -35,7 +35,7 @@ QPoint distanceOf(const QWheelEvent& event)
 }
 } // namespace
 
-// The scroller asks what can be scrolled from where a gesture begins, and then tells where to scroll to.
+// The scroller asks what a gesture can scroll, then where to scroll.
 bool TableList::event(QEvent* event)
 {
     if (event->type() == QEvent::ScrollPrepare) {
@@ -93,7 +93,7 @@ void TableList::mouseReleaseEvent(QMouseEvent* event)
     _drag.reset();
     QScroller::scroller(this)->handleInput(
         QScroller::InputRelease, drag.scrollPosition(), millisecondsOf(*event));
-    const auto row = _pressedRow; // a reload may have moved it away from the finger
+    const auto row = _pressedRow; // a reload may have moved it since the press
     setPressedRow(std::nullopt);
     if (!drag.isTap())
         return;

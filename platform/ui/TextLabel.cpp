@@ -1,5 +1,7 @@
 #include "TextLabel.h"
 
+#include "Theme.h"
+
 #include <QFontMetrics>
 #include <QPainter>
 
@@ -8,6 +10,7 @@
 namespace orvex {
 
 namespace {
+
 constexpr int kFadeLength = 22;
 
 QString inOneLine(QString text)
@@ -19,6 +22,11 @@ QString inOneLine(QString text)
     std::ranges::replace_if(text, breaksLine, QLatin1Char(' '));
     return text;
 }
+
+constexpr int kFontSize = 15;
+constexpr int kTextMargin = 8;
+constexpr int kCornerRadius = 6;
+
 } // namespace
 
 TextLabel::TextLabel(const QFont& font, QWidget* parent)
@@ -36,7 +44,7 @@ void TextLabel::setLine(const QString& text)
     setText(inOneLine(text));
 }
 
-// Text that a view cuts off fades away at the edge.
+// Text that a scroll view cuts off fades out at the edge.
 void TextLabel::paintEvent(QPaintEvent*)
 {
     const int room = parentWidget() ? std::min(width(), parentWidget()->width() - x()) : width();
@@ -60,6 +68,30 @@ QSize sizeOfLine(const QString& text, const QFont& font)
 {
     const QFontMetrics metrics(font);
     return {metrics.horizontalAdvance(inOneLine(text)), metrics.height()};
+}
+
+TextField::TextField(QWidget* parent)
+    : QLineEdit(parent)
+{
+    setFont(Theme::systemFont(kFontSize));
+    QPalette colours = palette();
+    colours.setColor(QPalette::Base, Qt::transparent);
+    setPalette(colours);
+    setFrame(false);
+    setTextMargins(kTextMargin, 0, kTextMargin, 0);
+}
+
+// The frame of Qt's styles is invisible on a dark background.
+void TextField::paintEvent(QPaintEvent* event)
+{
+    const Theme& theme = Theme::current();
+    QPainter painter(this);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setBrush(theme.bar);
+    painter.setPen(hasFocus() ? QPen(theme.tint, 1.5) : QPen(theme.barSeparator, 1));
+    painter.drawRoundedRect(QRectF(rect()).adjusted(1, 1, -1, -1), kCornerRadius, kCornerRadius);
+    painter.end();
+    QLineEdit::paintEvent(event);
 }
 
 } // namespace orvex

@@ -1,11 +1,12 @@
 #pragma once
 
 #include <QLabel>
+#include <QLineEdit>
 
 namespace orvex {
 
-// One line of plain text. What a network or a SIM sends is shown as it is, never read as markup, and a line
-// break in it does not break the row. Text that runs beyond the label or its parent ends in an ellipsis.
+// One line of plain text: text from a network or a SIM is never read as markup, and its line breaks become
+// blanks. Text too long for the label or its parent ends in an ellipsis.
 class TextLabel final : public QLabel {
 public:
     explicit TextLabel(QWidget* parent)
@@ -22,5 +23,14 @@ protected:
 
 // The size of one line of text as a label draws it, in whole pixels.
 QSize sizeOfLine(const QString& text, const QFont& font);
+
+// A one-line text field in the colours of the theme.
+class TextField final : public QLineEdit {
+public:
+    explicit TextField(QWidget* parent);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+};
 
 } // namespace orvex

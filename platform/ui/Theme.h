@@ -2,11 +2,13 @@
 
 #include <QColor>
 #include <QFont>
+#include <QRectF>
+
+class QPainter;
 
 namespace orvex {
 
-// Colours and fonts of all screens. Everything is drawn from these, so a light and a dark variant are two
-// rows of one table.
+// Colours and fonts of all screens, in a light and a dark variant.
 struct Theme {
     enum class Mode { system, light, dark };
 
@@ -21,13 +23,18 @@ struct Theme {
     QColor tint; // what can be tapped
 
     static const Theme& current();
-    // Chooses the variant for the whole application and gives it the matching palette. Mode::system follows
-    // the window colour of the palette that the desktop gave to the application.
+    // Sets variant and palette of the whole application. Mode::system follows the window colour of the
+    // desktop's palette.
     static void use(Mode mode);
 
     // One point of the design is one device-independent pixel.
     static QFont systemFont(int points);
     static QFont boldSystemFont(int points);
 };
+
+// Draws a chevron that fills the rectangle, pointing left or right.
+enum class ChevronDirection { left, right };
+void drawChevron(QPainter& painter, const QRectF& rectangle, ChevronDirection direction, const QColor& color,
+    double lineWidth);
 
 } // namespace orvex

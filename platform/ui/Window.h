@@ -3,15 +3,17 @@
 #include "Animation.h"
 #include "Screen.h"
 
+#include <QObject>
 #include <QPointer>
 #include <QWidget>
 
+#include <functional>
 #include <memory>
 #include <optional>
 
 namespace orvex {
 
-// The application's window: a root view that fills it, and at most one modal screen that slides up over it.
+// The application's window: a root view that fills it, and at most one modal screen that slides in over it.
 class Window final : public QWidget {
 public:
     // With the bounds of the main screen unless another size is given.
@@ -32,5 +34,19 @@ private:
     QPointer<Screen> _modal;  // child
     Transition _slide{this};
 };
+
+// Calls back once, when the application's first window has been painted.
+class FirstPaint final : public QObject {
+public:
+    explicit FirstPaint(std::function<void()> onPainted);
+
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    std::function<void()> _onPainted; // empty once the call is queued
+};
+
+// Tells assistive technology which widgets are lists, rows and progress indicators. Call it once.
+void installAccessibility();
 
 } // namespace orvex

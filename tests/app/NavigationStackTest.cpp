@@ -1,7 +1,6 @@
 #include "NavigationStack.h"
 
-#include "BarButton.h"
-#include "NavigationBar.h"
+#include "Bar.h"
 #include "Toolbar.h"
 
 #include <QApplication>
@@ -34,7 +33,7 @@ public:
     NavigationStack stack{screen("Root")};
 };
 
-TEST_F(NavigationStackTest, TheBackButtonBearsTheTitleOfTheScreenBelow)
+TEST_F(NavigationStackTest, TheBackButtonShowsTheTitleOfTheScreenBelow)
 {
     EXPECT_TRUE(back().isHidden());
     EXPECT_EQ(back().accessibleName(), "");
@@ -55,18 +54,18 @@ TEST_F(NavigationStackTest, TheBackButtonBearsTheTitleOfTheScreenBelow)
     EXPECT_EQ(back().text(), "Root");
 }
 
-TEST_F(NavigationStackTest, EscapeBackspaceAndTheBackKeyPop)
+TEST_F(NavigationStackTest, EscapeBackspaceAndTheBackKeyPopAllButTheRoot)
 {
     for (const auto key : {Qt::Key_Escape, Qt::Key_Backspace, Qt::Key_Back}) {
         stack.push(screen("A"), false);
-        for (int time = 0; time < 2; ++time) { // the root stays
+        for (int time = 0; time < 2; ++time) {
             QTest::keyClick(&stack.topScreen(), key);
             EXPECT_EQ(stack.count(), 1);
         }
     }
 }
 
-TEST_F(NavigationStackTest, APushSlidesInAndTheNextOneOrAResizeFinishesItFirst)
+TEST_F(NavigationStackTest, APushOrAResizeFinishesARunningSlide)
 {
     setAnimationsEnabled(true);
     Screen& root = stack.topScreen();
@@ -94,7 +93,7 @@ TEST_F(NavigationStackTest, APushSlidesInAndTheNextOneOrAResizeFinishesItFirst)
     EXPECT_TRUE(root.isVisible());
 }
 
-TEST_F(NavigationStackTest, AClickThatARefreshFallsIntoStillCounts)
+TEST_F(NavigationStackTest, ARefreshDuringAClickDoesNotLoseTheClick)
 {
     int clicks = 0;
     const auto setItems = [&] {

@@ -1,9 +1,9 @@
 #include "OrvexCell.h"
-#include "OrvexCellLayout.h"
 
-#include "SidewaysScrollView.h"
 #include "TextLabel.h"
 #include "Theme.h"
+
+#include <QImage>
 
 #include <gtest/gtest.h>
 
@@ -55,11 +55,11 @@ TEST(OrvexCell, MeasuresTheValueInTheBoldFontAndScrollsByBothWidths)
     EXPECT_EQ(cell.view()->offset(), keyWidth + valueWidth);
 
     cell.resize(2000, 44);
-    EXPECT_EQ(cell.value()->x(), 2000 - 10 - valueWidth); // 10 points are kept free at the right
+    EXPECT_EQ(cell.value()->x(), 2000 - 10 - valueWidth); // 10 points stay free at the right
     EXPECT_EQ(cell.view()->offset(), 0);
 }
 
-TEST(OrvexCell, ShowsTextsFromTheAirAsOnePlainLine)
+TEST(OrvexCell, ShowsNetworkTextAsOnePlainLine)
 {
     OrvexCell cell(OrvexCell::Kind::leaf, "cell");
     cell.setKey("Name");
@@ -67,6 +67,37 @@ TEST(OrvexCell, ShowsTextsFromTheAirAsOnePlainLine)
     EXPECT_EQ(cell.value()->text(), "<b>One</b> Two");
     EXPECT_EQ(cell.value()->textFormat(), Qt::PlainText);
     EXPECT_EQ(cell.accessibleName(), "Name, <b>One</b> Two");
+}
+
+TEST(OrvexCell, PaintsHighlightAccessoriesAndTheMarkOfHiddenText)
+{
+    using Accessory = TableCell::Accessory;
+    const auto painted = [](Accessory accessory, bool isHighlighted, int valueLength = 1) {
+        OrvexCell cell(OrvexCell::Kind::leaf, "cell");
+        cell.setValue(QString(valueLength, ' ')); // only its length is to be seen
+        cell.setAccessory(accessory);
+        cell.setHighlighted(isHighlighted);
+        cell.setLayout();
+        cell.resize(200, 44);
+        return cell.grab().toImage();
+    };
+    const auto pixelsOf = [](const QImage& image, const QColor& color) {
+        int count = 0;
+        for (int x = 0; x < image.width(); ++x) {
+            for (int y = 0; y < image.height(); ++y)
+                count += image.pixelColor(x, y) == color ? 1 : 0;
+        }
+        return count;
+    };
+    const Theme& theme = Theme::current();
+    const QImage plain = painted(Accessory::none, false);
+    EXPECT_EQ(pixelsOf(plain, theme.separator), 190);
+    EXPECT_EQ(pixelsOf(plain, theme.tint), 0);
+    EXPECT_EQ(pixelsOf(plain, theme.accessory), 0);
+    EXPECT_EQ(pixelsOf(painted(Accessory::none, true), theme.rowHighlight), 200 * 44 - 190);
+    EXPECT_GT(pixelsOf(painted(Accessory::checkmark, false), theme.tint), 10);
+    EXPECT_GT(pixelsOf(painted(Accessory::disclosureIndicator, false), theme.accessory), 5);
+    EXPECT_NE(painted(Accessory::none, false, 200), plain);
 }
 
 } // namespace

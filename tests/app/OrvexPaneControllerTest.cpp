@@ -1,8 +1,7 @@
 #include "PaneFixture.h"
 
-#include "ActivityIndicator.h"
-#include "BarButton.h"
-#include "NavigationBar.h"
+#include "Bar.h"
+#include "Indicators.h"
 
 #include <QApplication>
 
@@ -46,26 +45,16 @@ TEST_F(OrvexPaneControllerTest, ShowsItsStatusAndTheSaveButtonInItsToolbar)
     EXPECT_FALSE(static_cast<ActivityIndicator*>(items[0].widget)->isTicking());
 }
 
-TEST_F(OrvexPaneControllerTest, OnlyTheToolbarRowOfTheScreenOnTopIsShown)
-{
-    show(Tree(rows({{"A", rows({{"B", rows({})}})}})));
-    const auto expectOneRow = [this] {
-        for (const auto* widget : stack->findChildren<QWidget*>()) {
-            const auto* const row = dynamic_cast<const ToolbarRow*>(widget);
-            EXPECT_TRUE(!row || row == top().toolbarRow() || !row->isVisible());
-        }
-        EXPECT_TRUE(top().toolbarRow()->isVisible());
-    };
-    for (int level = 0; level < 2; ++level) {
-        tapRow(top().tableList(), 0);
-        expectOneRow();
-    }
-    stack->pop(false);
-    expectOneRow();
-}
-
 TEST_F(OrvexPaneControllerTest, OpensBranchesByTapAndByKeyAndComesBack)
 {
+    const auto visibleRows = [this] {
+        std::vector<const QWidget*> rows;
+        for (const auto* widget : stack->findChildren<QWidget*>()) {
+            if (dynamic_cast<const ToolbarRow*>(widget) && widget->isVisible())
+                rows.push_back(widget);
+        }
+        return rows;
+    };
     show(lteTree());
     top().setStatus("Updated", false);
     EXPECT_EQ(shownAt(top(), 0), "Serving Cell Info");
@@ -76,12 +65,14 @@ TEST_F(OrvexPaneControllerTest, OpensBranchesByTapAndByKeyAndComesBack)
     for (const auto pressed : {Qt::Key_Down, Qt::Key_Down, Qt::Key_Return})
         key(pressed);
     EXPECT_EQ(pathsOn(*stack), (Paths{"/", "/Neighbor Cells List", "/Neighbor Cells List/1"}));
+    EXPECT_EQ(visibleRows(), std::vector<const QWidget*>{top().toolbarRow()});
     EXPECT_EQ(top().tableList().rowCount(), 0); // a branch without children
     key(Qt::Key_Escape);
+    EXPECT_EQ(visibleRows(), std::vector<const QWidget*>{top().toolbarRow()});
     key(Qt::Key_Escape);
     EXPECT_EQ(QApplication::focusWidget(), &top().tableList());
 
-    tapRow(top().tableList(), 2); // of a leaf only clears its highlight
+    tapRow(top().tableList(), 2); // a leaf
     top().didSelectRow(top().tableList(), std::nullopt);
     EXPECT_EQ(pathsOn(*stack), Paths{"/"});
     EXPECT_EQ(top().tableList().selectedRow(), std::nullopt);
@@ -91,37 +82,29 @@ TEST_F(OrvexPaneControllerTest, AReusedCellKeepsTheKindItWasMadeAs)
 {
     show(Tree(rows({{"A", rows({})}, {"B", "leaf"}})));
     reload(Tree(rows({{"A", "value"}, {"B", rows({})}})));
-    // The branch cell has no place for the value, and shows no arrow any more.
+    // The branch cell has no label for a value.
     EXPECT_EQ(shownAt(top(), 0), "A");
     EXPECT_EQ(top().tableList().cellAtRow(0)->accessory(), TableCell::Accessory::none);
-    // The leaf cell keeps its scroll view, without a value.
     EXPECT_EQ(shownAt(top(), 1), "B");
     EXPECT_EQ(top().tableList().cellAtRow(1)->accessory(), TableCell::Accessory::disclosureIndicator);
 }
 
-TEST_F(OrvexPaneControllerTest, PopsBackToTheLastScreenWhosePathIsLeft)
+TEST_F(OrvexPaneControllerTest, PopsTheFirstScreenWhosePathIsGone)
 {
-    const struct {
-        const char* name;
-        Value display;
-        Paths paths;
-    } cases[] = {
-        {"all there", rows({{"Z", "new"}, {"A", rows({{"B", rows({{"C", "new"}})}})}}), {"/", "/A", "/A/B"}},
-        {"/A/B gone, /A a leaf", rows({{"Z", "new"}, {"A", "x"}}), {"/", "/A"}},
-        {"/A gone", rows({{"Z", "new"}}), {"/"}},
-        {"no display", Value(), {"/"}},
+    const std::pair<Value, Paths> cases[] = {
+        {rows({{"Z", "new"}, {"A", rows({{"B", rows({{"C", "new"}})}})}}), {"/", "/A", "/A/B"}},
+        {rows({{"Z", "new"}, {"A", "a leaf now"}}), {"/", "/A"}},
+        {rows({{"Z", "new"}}), {"/"}},
+        {Value(), {"/"}},
     };
-    for (const auto& test : cases) {
-        SCOPED_TRACE(test.name);
+    for (const auto& [display, paths] : cases) {
         show(Tree(rows({{"Z", "old"}, {"A", rows({{"B", rows({{"C", "old"}})}})}})));
         tapRow(top().tableList(), 1);
         tapRow(top().tableList(), 0);
         ASSERT_EQ(pathsOn(*stack), (Paths{"/", "/A", "/A/B"}));
-        reload(Tree(test.display));
-        EXPECT_EQ(pathsOn(*stack), test.paths);
-        if (!test.display.isNull()) {
-            EXPECT_EQ(shownAt(paneAt(*stack, 0), 0), "Z=new");
-        }
+        reload(Tree(display));
+        EXPECT_EQ(pathsOn(*stack), paths);
+        EXPECT_EQ(shownAt(paneAt(*stack, 0), 0), display.isNull() ? "(no cell)" : "Z=new");
     }
 }
 
@@ -157,29 +140,29 @@ TEST_F(OrvexPaneControllerTest, AReloadKeepsTheHighlightOnTheRowOfTheSameName)
     }
 }
 
-TEST_F(OrvexPaneControllerTest, TabReachesBackButtonListAndToolbar)
+TEST_F(OrvexPaneControllerTest, TabReachesBackButtonListAndSave)
 {
+    using Widgets = std::set<const QWidget*>;
     host.offersSave = true;
     show(lteTree());
-    const auto reached = [this](Qt::Key tab) {
-        std::set<const QWidget*> widgets;
-        for (int step = 0; step < 8; ++step) {
-            QTest::keyClick(QApplication::focusWidget(), tab);
-            widgets.insert(QApplication::focusWidget());
-        }
-        return widgets;
-    };
+    const auto save = [this] { return top().toolbarRow()->items().back().widget; };
     for (const auto tab : {Qt::Key_Tab, Qt::Key_Backtab}) {
-        const auto save = [this] { return top().toolbarRow()->items().back().widget; };
-        EXPECT_EQ(reached(tab), (std::set<const QWidget*>{&top().tableList(), save()}));
+        const auto reached = [tab] {
+            Widgets widgets;
+            for (int step = 0; step < 8; ++step) {
+                QTest::keyClick(QApplication::focusWidget(), tab);
+                widgets.insert(QApplication::focusWidget());
+            }
+            return widgets;
+        };
+        EXPECT_EQ(reached(), (Widgets{&top().tableList(), save()}));
         tapRow(top().tableList(), 1);
-        EXPECT_EQ(reached(tab),
-            (std::set<const QWidget*>{&stack->navigationBar().backButton(), &top().tableList(), save()}));
+        EXPECT_EQ(reached(), (Widgets{&stack->navigationBar().backButton(), &top().tableList(), save()}));
         stack->pop(false);
     }
 }
 
-TEST_F(OrvexPaneControllerTest, ARowReleasedAfterItsScreenWasPoppedOrCoveredOpensNothing)
+TEST_F(OrvexPaneControllerTest, APressThatEndsAfterItsScreenWasPoppedOrCoveredOpensNothing)
 {
     const Tree tree(rows({{"A", rows({{"B", rows({})}})}}));
     const Tree without(rows({{"C", "value"}}));
@@ -204,7 +187,7 @@ TEST_F(OrvexPaneControllerTest, ARowReleasedAfterItsScreenWasPoppedOrCoveredOpen
 
 TEST_F(OrvexPaneControllerTest, KeepsItsRowsUntilItIsReloaded)
 {
-    show(lteTree()); // which goes at once
+    show(lteTree()); // whose Tree is deleted at once
     top().tableList().reloadData();
     EXPECT_EQ(shownAt(top(), 2), "RRC State=Connected");
     reloadPanes(*stack, nullptr, [](const std::string&) { return nullptr; });

@@ -1,7 +1,7 @@
 #include "OrvexSaveViewController.h"
 
 #include "Alert.h"
-#include "BarButton.h"
+#include "Bar.h"
 #include "OrvexApp.h"
 #include "PaneFixture.h"
 #include "SaveHistoryContentCell.h"
@@ -40,7 +40,7 @@ protected:
         const auto* const cell = screen.saveContentTable().cellAtRow(row);
         return static_cast<const SaveHistoryContentCell*>(cell)->text().text().toStdString();
     }
-    // Keys are the alert's; null while there is none.
+    // Null while there is none: an alert takes the focus.
     static Alert* shownAlert() { return dynamic_cast<Alert*>(QApplication::focusWidget()); }
     // Where a save at this second goes.
     static std::string pathAt(double seconds)
@@ -52,7 +52,7 @@ protected:
     RecordingLog log;
 };
 
-TEST_F(OrvexSaveViewControllerTest, SavesWhatThereWasWhenItWasOpened)
+TEST_F(OrvexSaveViewControllerTest, SavesTheContentsFromWhenItWasOpened)
 {
     clock.moment.secondsSince1970 = 1'709'647'629; // 2024-03-05 14:07:09 UTC
     OrvexSaveViewController& screen = open();
@@ -63,7 +63,7 @@ TEST_F(OrvexSaveViewControllerTest, SavesWhatThereWasWhenItWasOpened)
     QTest::keyClicks(&screen.saveDescription(), "Under the <bridge> & ");
     screen.saveDescription().insert(QStringLiteral("ü"));
     clock.moment.secondsSince1970 += 60;
-    deliverNeighbors(2); // not in the snapshot any more
+    deliverNeighbors(2); // too late for the snapshot
     QTest::mouseClick(screen.findChild<QAbstractButton*>(QStringLiteral("saveButton")), Qt::LeftButton);
     EXPECT_EQ(app->saveViewController(), &screen) << "not inside the action of its own button";
     runLoop.runPosted();
@@ -80,21 +80,12 @@ TEST_F(OrvexSaveViewControllerTest, SavesWhatThereWasWhenItWasOpened)
     EXPECT_EQ(entry["DisplayState"].data()->size(), 41U);
     EXPECT_EQ((*(*saved->data)[1].dictionary())["DLF"].data()->size(), 201U);
 
-    namespace fs = std::filesystem; // it names the subscriber
+    namespace fs = std::filesystem; // private: it identifies the subscriber
     EXPECT_EQ(fs::status(paths::diagnosticReports()).permissions(), fs::perms(0700));
     EXPECT_EQ(fs::status(pathAt(1'709'647'689)).permissions(), fs::perms(0600));
 }
 
-TEST_F(OrvexSaveViewControllerTest, CancelSavesNothing)
-{
-    const auto& screen = open();
-    QTest::mouseClick(screen.findChild<QAbstractButton*>(QStringLiteral("cancelButton")), Qt::LeftButton);
-    runLoop.runPosted();
-    EXPECT_EQ(app->saveViewController(), nullptr);
-    EXPECT_TRUE(std::filesystem::is_empty(paths::diagnosticReports()));
-}
-
-TEST_F(OrvexSaveViewControllerTest, SaysThatTheFileCouldNotBeWrittenAndTheSessionGoesOn)
+TEST_F(OrvexSaveViewControllerTest, ReportsThatTheFileCouldNotBeWritten)
 {
     OrvexSaveViewController& screen = open();
     std::filesystem::remove_all(paths::diagnosticReports());
@@ -105,7 +96,7 @@ TEST_F(OrvexSaveViewControllerTest, SaysThatTheFileCouldNotBeWrittenAndTheSessio
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 
     Alert* const alert = shownAlert();
-    ASSERT_NE(alert, nullptr) << "stays when the screen goes";
+    ASSERT_NE(alert, nullptr) << "outlives the screen";
     EXPECT_EQ(alert->title().text(), "File Error");
     EXPECT_EQ(alert->message().text(), "Unable to write file to disk");
     EXPECT_EQ(alert->button().text(), "Close");
@@ -118,7 +109,7 @@ TEST_F(OrvexSaveViewControllerTest, SaysThatTheFileCouldNotBeWrittenAndTheSessio
     EXPECT_FALSE(alert->isVisible());
 }
 
-TEST_F(OrvexSaveViewControllerTest, ATouchBesideTheFieldTakesTheKeyboardAway)
+TEST_F(OrvexSaveViewControllerTest, ATouchBesideTheFieldTakesTheFocusFromIt)
 {
     OrvexSaveViewController& screen = open();
     QLineEdit& field = screen.saveDescription();
@@ -139,12 +130,25 @@ TEST_F(OrvexSaveViewControllerTest, ATouchBesideTheFieldTakesTheKeyboardAway)
     EXPECT_EQ(screen.saveContentTable().selectedRow(), 0);
     for (const auto* button : screen.findChildren<QAbstractButton*>())
         EXPECT_FALSE(button->isDown());
-    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
-    runLoop.runPosted();
-    EXPECT_EQ(app->saveViewController(), nullptr);
 }
 
-TEST_F(OrvexSaveViewControllerTest, WithoutContentsSavesAnEmptyListAndNoWords)
+TEST_F(OrvexSaveViewControllerTest, CancelAndEscapeSaveNothing)
+{
+    const std::function<void(QWidget&)> cancels[] = {
+        [](QWidget& screen) {
+            QTest::mouseClick(screen.findChild<QWidget*>("cancelButton"), Qt::LeftButton);
+        },
+        [](QWidget&) { QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape); },
+    };
+    for (const auto& cancel : cancels) {
+        cancel(open());
+        runLoop.runPosted();
+        EXPECT_EQ(app->saveViewController(), nullptr);
+        EXPECT_TRUE(std::filesystem::is_empty(paths::diagnosticReports()));
+    }
+}
+
+TEST_F(OrvexSaveViewControllerTest, SavesAnEmptyListWithoutADescription)
 {
     bool isClosed = false;
     std::filesystem::create_directories(paths::diagnosticReports());

@@ -2,7 +2,6 @@
 
 #include "OrvexCell.h"
 #include "OrvexPaneController.h"
-#include "PaneReloader.h"
 
 #include "Array.h"
 #include "Dictionary.h"

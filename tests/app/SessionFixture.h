@@ -17,7 +17,7 @@
 
 namespace orvex::test {
 
-// Keeps what is done to the preferences, in order.
+// Records what is done to the preferences.
 class RecordingPreferences final : public Preferences {
 public:
     void setValue(const std::string& domain, const std::string& key, const Value& value) override
@@ -52,7 +52,7 @@ inline const std::vector<std::string> kHomeScreenWrite = {
     "changed org.orvex.HomeScreen HXShowGSMRSSI",
 };
 
-// A platform on which a real session decodes LTE packets.
+// A platform whose session decodes LTE packets.
 struct SessionFixture {
     SessionFixture()
     {
@@ -71,7 +71,7 @@ struct SessionFixture {
             .preferences = preferences};
     }
 
-    // An idle-mode neighbour report, on frequency 6300, with so many neighbours.
+    // An idle-mode neighbour report on frequency 6300.
     void deliverNeighbors(std::size_t count)
     {
         Bytes payload = {0x03, 0, 0, 0, 0x9C, 0x18, 0xC0, 0x07};
@@ -80,7 +80,7 @@ struct SessionFixture {
     }
     // One refresh of the session.
     void refresh() { runLoop.advance(std::chrono::seconds(2)); }
-    // The service is gone, and is not there again when asked.
+    // The service has gone and is still absent at the next look-up.
     void loseService()
     {
         telephony.serviceIsAbsent = true;

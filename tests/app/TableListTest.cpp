@@ -1,7 +1,7 @@
 #include "TableList.h"
 
 #include "OrvexCell.h"
-#include "SidewaysScrollView.h"
+#include "TableCell.h"
 
 #include <QApplication>
 #include <QScroller>
@@ -46,7 +46,7 @@ protected:
     void drag(QPoint from, QPoint by)
     {
         QTest::mousePress(&list, Qt::LeftButton, {}, from);
-        // In ten steps, and then standing still before the release, so that nothing is flung.
+        // Ten steps, then a rest before the release, so that nothing is flung.
         for (int step = 1; step <= 20; ++step)
             QTest::mouseMove(&list, from + by * std::min(step, 10) / 10, 25);
         QTest::qWait(50); // the scroller moves at the rate of frames
@@ -64,12 +64,12 @@ protected:
     TableList list{rows, nullptr};
 };
 
-TEST_F(TableListTest, OnlyTheRowsInViewHaveCellsWhateverItsSize)
+TEST_F(TableListTest, OnlyRowsInViewHaveCells)
 {
     EXPECT_EQ(list.cellAtRow(10), nullptr);
     for (int offset = 0; offset <= list.maximumOffset(); offset += 30)
         list.setContentOffset(offset);
-    EXPECT_EQ(rows.made, 12); // between two whole rows eleven are in view, six of them of one kind
+    EXPECT_EQ(rows.made, 12); // up to eleven in view, six of them of one kind
     EXPECT_EQ(list.cellAtRow(95)->geometry(), QRect(0, 95 * 44 - list.contentOffset(), 300, 44));
 
     list.setContentOffset(list.maximumOffset());
@@ -79,10 +79,10 @@ TEST_F(TableListTest, OnlyTheRowsInViewHaveCellsWhateverItsSize)
         EXPECT_EQ(list.cellAtRow(row)->width(), 500);
 }
 
-TEST_F(TableListTest, ReloadingHandsEachRowItsOwnCellAndScrollingAnothersWithoutItsSidewaysPlace)
+TEST_F(TableListTest, AReloadGivesEachRowItsOwnCellAndScrollingResetsIt)
 {
     list.setContentOffset(20); // an eleventh cell
-    list.setContentOffset(0);  // which now waits for reuse
+    list.setContentOffset(0);  // spare now
     const std::vector before = {list.cellAtRow(0), list.cellAtRow(1), list.cellAtRow(9)};
     for (int time = 0; time < 3; ++time)
         list.reloadData();
@@ -90,13 +90,13 @@ TEST_F(TableListTest, ReloadingHandsEachRowItsOwnCellAndScrollingAnothersWithout
     EXPECT_EQ(rows.made, 11);
 
     list.cellAtRow(0)->sidewaysScrollView()->setOffset(70);
-    list.setContentOffset(4 * 44); // row 10 gets the cell that waits
+    list.setContentOffset(4 * 44); // row 10 gets the spare cell
     EXPECT_EQ(list.cellAtRow(11), before[1]);
     EXPECT_EQ(list.cellAtRow(12), before[0]);
     EXPECT_EQ(sidewaysAt(12), 0);
 }
 
-TEST_F(TableListTest, ReloadingKeepsThePlaceAsFarAsItExists)
+TEST_F(TableListTest, AReloadKeepsOffsetAndSelectionAsFarAsTheyExist)
 {
     list.setContentOffset(1000);
     list.selectRow(24);
@@ -135,10 +135,10 @@ TEST_F(TableListTest, ATapOpensAndADragDoesNot)
     EXPECT_EQ(rows.opened, (std::vector{2, -1}));
 }
 
-TEST_F(TableListTest, AGestureKeepsToTheAxisInWhichItBegan)
+TEST_F(TableListTest, AGestureKeepsToItsFirstAxis)
 {
     drag({150, 350}, {-30, -200});
-    EXPECT_NEAR(list.contentOffset(), 200, 15); // less the stretch that made it a drag
+    EXPECT_NEAR(list.contentOffset(), 200, 15); // less the distance that made it a drag
     EXPECT_EQ(sidewaysAt(list.contentOffset() / 44 + 7), 0);
 
     list.setContentOffset(440);
@@ -150,7 +150,7 @@ TEST_F(TableListTest, AGestureKeepsToTheAxisInWhichItBegan)
     EXPECT_TRUE(rows.opened.empty());
 }
 
-TEST_F(TableListTest, AFlingGoesOnAndAPressThatStopsItOpensNothing)
+TEST_F(TableListTest, APressThatStopsAFlingOpensNothing)
 {
     QTest::mousePress(&list, Qt::LeftButton, {}, {150, 400});
     for (int y = 380; y > 100; y -= 40)
@@ -166,7 +166,7 @@ TEST_F(TableListTest, AFlingGoesOnAndAPressThatStopsItOpensNothing)
     EXPECT_TRUE(rows.opened.empty());
 }
 
-TEST_F(TableListTest, TheWheelScrollsTheListAndSidewaysTheRowBelowIt)
+TEST_F(TableListTest, TheWheelScrollsTheListOrTheRowBelowThePointer)
 {
     wheel({0, -120}, {50, 100});
     EXPECT_GT(list.contentOffset(), 0);
@@ -200,7 +200,7 @@ TEST_F(TableListTest, KeysMoveTheSelectionThroughTheWholeList)
     EXPECT_EQ(rows.opened, std::vector{0});
     list.deselectRow();
     QTest::keyClick(&list, Qt::Key_Down);
-    EXPECT_EQ(list.selectedRow(), 1); // goes on from the row that was deselected
+    EXPECT_EQ(list.selectedRow(), 1); // goes on from the deselected row
 }
 
 } // namespace

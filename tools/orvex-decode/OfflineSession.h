@@ -3,6 +3,7 @@
 #include "LogGenerator.h"
 
 #include <memory>
+#include <utility>
 
 namespace orvex {
 
@@ -10,17 +11,27 @@ namespace orvex {
 // the refresh of a live session does.
 class OfflineSession {
 public:
-    // With `refreshEvery` 0 the display is asked for by display() alone.
-    OfflineSession(std::unique_ptr<LogGenerator> generator, std::size_t refreshEvery);
+    // With `refreshEvery` 0, only display() asks for the display.
+    OfflineSession(std::unique_ptr<LogGenerator> generator, std::size_t refreshEvery)
+        : _generator(std::move(generator))
+        , _refreshEvery(refreshEvery)
+    {
+    }
 
-    void take(ByteView message);
+    void take(ByteView message)
+    {
+        _generator->updateState(_state, message);
+        ++_messageCount;
+        if (_refreshEvery != 0 && _messageCount % _refreshEvery == 0)
+            _generator->generateLogUsingState(_state);
+    }
+    std::size_t messageCount() const { return _messageCount; }
+
     // Asks for the display once more.
     Value display() { return _generator->generateLogUsingState(_state); }
     // What a snapshot of the session stores.
     ArrayRef saveContents() const { return _generator->getSaveContentsFromState(_state); }
     std::size_t droppedRawBytes() const { return _generator->droppedRawBytes(); }
-
-    std::size_t messageCount() const { return _messageCount; }
 
 private:
     std::unique_ptr<LogGenerator> _generator;

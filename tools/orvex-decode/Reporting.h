@@ -2,20 +2,42 @@
 
 #include "DecodeOptions.h"
 
+#include <cstddef>
+#include <cstdint>
 #include <functional>
 #include <ostream>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace orvex {
 
-// What the decoder says and writes. All return whether it is well.
-
-// One line on standard error. False, always.
+// Prints a line on standard error. Returns false.
 bool printError(const std::string& message);
-// Replaces the file.
+// Replaces the file. Returns false, after an error line, when that fails.
 bool writeFile(const std::string& path, std::string_view content);
-// Where the options want the document to go.
+// Writes the document where the options say. Returns false, after an error line, when that fails.
 bool printDocument(const std::function<void(std::ostream&)>& write, const DecodeOptions& options);
+
+// Shows the progress of a large job on a terminal.
+class Progress {
+public:
+    // The captures to be read. Their sizes decide whether the job is large.
+    explicit Progress(const std::vector<std::string>& captures);
+    ~Progress();
+    Progress(const Progress&) = delete;
+    Progress& operator=(const Progress&) = delete;
+
+    // Counts a message of this length.
+    void advance(std::size_t messageLength);
+
+private:
+    void show() const;
+
+    std::uintmax_t _totalBytes = 0;
+    std::uintmax_t _bytes = 0;
+    std::uintmax_t _nextShown = 0;
+    bool _isShown = false;
+};
 
 } // namespace orvex

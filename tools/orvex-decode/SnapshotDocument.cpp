@@ -1,7 +1,6 @@
 #include "SnapshotDocument.h"
 
 #include "OfflineSession.h"
-#include "TreeJson.h"
 
 #include "DisplayTreePrinter.h"
 #include "NodesByPath.h"
@@ -16,7 +15,7 @@ namespace orvex {
 
 namespace {
 
-// Feeds the messages that an entry keeps. Returns the number of bytes that make none.
+// Feeds the messages kept in an entry. Returns the number of bytes that are not part of one.
 std::size_t feed(OfflineSession& session, const Value& kept)
 {
     if (const BytesRef packets = kept.data()) {
@@ -25,11 +24,11 @@ std::size_t feed(OfflineSession& session, const Value& kept)
             session.take(*message);
         return messages.rest();
     }
-    // A technology whose messages are property lists keeps the last one as what it says.
+    // A technology whose messages are property lists keeps the last one, parsed.
     const auto message = propertyListXML(kept);
     if (!message)
         return 0;
-    if (message->size() > PropertyListLimits().maximumBytes) // no session takes it
+    if (message->size() > PropertyListLimits().maximumBytes) // too large for a session
         return message->size();
     session.take(*message);
     return 0;
@@ -65,7 +64,7 @@ void SnapshotDocument::decodeAnew(std::unique_ptr<LogGenerator> generator)
         if (const std::size_t rest = feed(session, entry.messages))
             _omissions.push_back(
                 text("%s: %zu bytes that make no message were left out", entry.description.c_str(), rest));
-        entry.decoded = session.display().deepCopy(); // the next entry goes on writing into it
+        entry.decoded = session.display().deepCopy(); // decoding the next entry changes it
     }
 }
 

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "JsonWriter.h"
 #include "LogGenerator.h"
 #include "Snapshot.h"
+#include "TreeJson.h"
 
 #include <memory>
 #include <string>
@@ -10,8 +10,8 @@
 
 namespace orvex {
 
-// What is printed of a snapshot: when it was saved, the user's words, and of every history entry date,
-// description and display, as it was stored and, if wanted, decoded anew from the entry's raw messages.
+// What is printed of a snapshot: timestamp, description and, for every history entry, date, description,
+// stored display and, if wanted, the display decoded again from the entry's raw messages.
 class SnapshotDocument {
 public:
     explicit SnapshotDocument(const Snapshot& snapshot);
@@ -19,26 +19,25 @@ public:
     // Feeds the raw messages of all entries to the generator, oldest first.
     void decodeAnew(std::unique_ptr<LogGenerator> generator);
 
-    // The snapshot as a tree, its entries beside each other.
-    // The tree as text, names and values cut to the longest.
+    // The snapshot as a tree in text, with names and values cut to the longest.
     std::string tree(std::size_t longestText = std::string::npos) const;
     // {"timestamp": …, "description": …, "entries": [{"description": …, "date": …, "display": TREE,
-    // "decoded": TREE}, …]}, the trees as those of captures. An entry without display has none, one without
-    // messages is not decoded.
+    // "decoded": TREE}, …]}, the trees like those of captures. "display" and "decoded" are left out where an
+    // entry has no display or no messages.
     void writeJson(JsonWriter& json) const;
 
     // The binary log; null when the snapshot holds none.
     const BytesRef& dlf() const { return _dlf; }
-    // What could not be decoded anew, a line each.
+    // A line for each thing that could not be decoded again.
     const std::vector<std::string>& omissions() const { return _omissions; }
 
 private:
     struct Entry {
         std::string description;
-        Value date;    // text, as a rule
-        Value display; // null when the entry has none, like that of the binary log
+        Value date;    // usually text
+        Value display; // null when the entry has none, such as that of the binary log
         Value messages;
-        Value decoded; // null until it is decoded anew
+        Value decoded; // null until decodeAnew()
     };
 
     std::string _timestamp;

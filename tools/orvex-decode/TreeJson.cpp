@@ -3,11 +3,16 @@
 #include "NodesByPath.h"
 
 #include <algorithm>
+#include <iterator>
+#include <nlohmann/json.hpp>
 #include <string>
+#include <utility>
 
 namespace orvex {
 
 namespace {
+
+constexpr std::size_t kIndentation = 2;
 
 constexpr std::size_t kLevelsWithPaths = 32;
 
@@ -21,7 +26,7 @@ std::size_t levelsBelow(const OrvexModelNode& node)
     return levels;
 }
 
-// Without paths when there is none.
+// A null path writes none, here and below.
 void writeNode(JsonWriter& json, const OrvexModelNode& node, const std::string* path)
 {
     json.beginObject();
@@ -43,6 +48,53 @@ void writeNode(JsonWriter& json, const OrvexModelNode& node, const std::string* 
 }
 
 } // namespace
+
+void JsonWriter::key(std::string_view name)
+{
+    string(name);
+    _stream << (_isCompact ? ":" : ": ");
+    _followsKey = true;
+}
+
+void JsonWriter::string(std::string_view text)
+{
+    using Json = nlohmann::json;
+    beginValue();
+    _stream << Json(text).dump(-1, ' ', false, Json::error_handler_t::replace);
+}
+
+void JsonWriter::open(char bracket)
+{
+    beginValue();
+    _stream << bracket;
+    _isEmpty.push_back(true);
+}
+
+void JsonWriter::close(char bracket)
+{
+    const bool wasEmpty = _isEmpty.back();
+    _isEmpty.pop_back();
+    if (!wasEmpty && !_isCompact)
+        beginLine();
+    _stream << bracket;
+}
+
+void JsonWriter::beginValue()
+{
+    if (std::exchange(_followsKey, false) || _isEmpty.empty())
+        return;
+    if (!_isEmpty.back())
+        _stream << ',';
+    _isEmpty.back() = false;
+    if (!_isCompact)
+        beginLine();
+}
+
+void JsonWriter::beginLine()
+{
+    _stream << '\n';
+    std::fill_n(std::ostreambuf_iterator<char>(_stream), kIndentation * _isEmpty.size(), ' ');
+}
 
 void writeTreeJson(JsonWriter& json, const OrvexModelNode& root)
 {

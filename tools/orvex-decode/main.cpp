@@ -2,7 +2,6 @@
 #include "DecodeOptions.h"
 #include "FileConflict.h"
 #include "OfflineSession.h"
-#include "Progress.h"
 #include "ReadAhead.h"
 #include "Reporting.h"
 #include "SnapshotDocument.h"
@@ -29,7 +28,7 @@ namespace {
 
 constexpr int kFailure = 1;
 
-// Feeds the messages of one capture. False, after a line on standard error, when it could not be read whole.
+// Feeds the messages of a capture. Returns false, after an error line, unless it could be read to its end.
 bool feed(OfflineSession& session, const std::string& path, Progress& progress)
 {
     ReadAhead reader(CaptureReader::open(path));
@@ -48,7 +47,7 @@ bool feed(OfflineSession& session, const std::string& path, Progress& progress)
         reader.error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
 }
 
-// A terminal gets the beginning of a text that is too long for it, a file or another program all of it.
+// Cuts long texts for a terminal, but not for a file or another program.
 std::size_t longestText(const DecodeOptions& options)
 {
     return !options.outputFile && ::isatty(STDOUT_FILENO) ? kLongestVisibleText : std::string::npos;
@@ -76,7 +75,7 @@ std::string resourcesOf(const DecodeOptions& options)
     return options.resources.value_or(FileResources::defaultDirectory());
 }
 
-// Why the files that the options name cannot be used together; empty when they can.
+// Returns why the files cannot be used together; empty when they can.
 std::string conflictOf(const DecodeOptions& options)
 {
     std::vector<FileInUse> inputs;
@@ -102,7 +101,7 @@ std::string conflictOf(const DecodeOptions& options)
     return fileConflict(inputs, outputs);
 }
 
-// What decoding takes from the platform.
+// What decoding needs of the platform.
 struct Platform {
     explicit Platform(const DecodeOptions& options)
         : resources(resourcesOf(options))
@@ -118,10 +117,10 @@ struct Platform {
 
     FileResources resources;
     SystemClock clock;
-    std::size_t rawPacketLimit; // only a snapshot needs them
+    std::size_t rawPacketLimit; // bytes; only a snapshot needs raw packets
 };
 
-// False, after a line on standard error, when there is no template to lay the display out.
+// Returns false, after an error line, when there is no template for the display.
 bool hasTemplate(const LogGenerator& generator)
 {
     const std::string error = generator.templateError({});
@@ -150,7 +149,7 @@ int decodeCaptures(const DecodeOptions& options)
         for (const std::string& capture : options.inputs)
             isGood = feed(session, capture, progress) && isGood;
     }
-    // What could be read is shown, whatever could not; but nothing at all is no document.
+    // Whatever could be read is shown. With no message at all there is no document.
     if (!isGood && session.messageCount() == 0)
         return kFailure;
     isGood = print(session.display(), options) && isGood;
@@ -214,7 +213,7 @@ int showSnapshots(const DecodeOptions& options)
     return isGood ? 0 : kFailure;
 }
 
-// Decodes what the options name, with the log that they want.
+// Decodes the inputs, with a log if there is to be one.
 int decode(const DecodeOptions& options)
 {
     std::unique_ptr<FileSystemLog> log;
@@ -251,7 +250,7 @@ int main(int argc, char** argv)
         return CommandLine::kWrongUsage;
     }
 
-    installConsole([](std::string_view) {}); // standard output carries the document alone
+    installConsole([](std::string_view) {}); // standard output is for the document alone
     installFatalErrorHandler();
     return decode(options);
 }

@@ -1,4 +1,10 @@
-#include "StandardOutput.h"
+#include "ConsoleOutput.h"
+
+#include "OrvexApp.h"
+#include "OrvexPaneController.h"
+
+#include <QCoreApplication>
+#include <QEvent>
 
 #include <cerrno>
 #include <poll.h>
@@ -47,6 +53,32 @@ std::optional<TerminalSize> StandardOutput::terminalSize() const
     if (::ioctl(STDOUT_FILENO, TIOCGWINSZ, &size) != 0 || size.ws_col == 0 || size.ws_row == 0)
         return TerminalSize{};
     return TerminalSize{.columns = size.ws_col, .rows = size.ws_row};
+}
+
+StatusPrinter::StatusPrinter(const OrvexApp& app, ConsoleOutput& output)
+    : _app(app)
+    , _output(output)
+{
+    QCoreApplication::instance()->installEventFilter(this);
+}
+
+StatusPrinter::~StatusPrinter()
+{
+    QCoreApplication::instance()->removeEventFilter(this);
+}
+
+bool StatusPrinter::eventFilter(QObject* watched, QEvent* event)
+{
+    if (event->type() != QEvent::Paint || !_app.navigationStack() || !_app.model())
+        return false;
+    const auto& screen = static_cast<OrvexPaneController&>(_app.navigationStack()->topScreen());
+    const QLabel* const label = screen.statusLabel();
+    // Old labels are drawn too while they dissolve.
+    if (watched != label || label->text() == _last)
+        return false;
+    _last = label->text();
+    _output.write(std::to_string(_app.model()->decodedMessages()) + ' ' + _last.toStdString() + '\n');
+    return false;
 }
 
 } // namespace orvex

@@ -1,26 +1,34 @@
-#include "ActivityIndicator.h"
+#include "Indicators.h"
 
 #include "Theme.h"
 
 #include <QPainter>
 #include <QTimerEvent>
 
+#include <algorithm>
 #include <chrono>
 
 namespace orvex {
 
 namespace {
+
 constexpr int kSide = 20;
 constexpr int kSpokes = 12;
 constexpr int kMillisecondsPerSpoke = 80;
 
-// Which spoke leads. Read from the clock: a toolbar that is built anew goes on where the old one stood.
+// The brightest spoke, by the clock: the spinner of a new toolbar row goes on where the old one was.
 int leadingSpoke()
 {
     using namespace std::chrono;
     const auto now = duration_cast<milliseconds>(steady_clock::now().time_since_epoch());
     return static_cast<int>(now.count() / kMillisecondsPerSpoke % kSpokes);
 }
+
+constexpr int kMillisecondsShown = 900;
+constexpr int kWidth = 3;
+constexpr int kMargin = 2;
+constexpr int kMinimumLength = 36;
+
 } // namespace
 
 ActivityIndicator::ActivityIndicator(QWidget* parent)
@@ -96,6 +104,44 @@ void ActivityIndicator::paintEvent(QPaintEvent*)
         painter.drawLine(QPointF(0, -4.5), QPointF(0, -8.2));
         painter.restore();
     }
+}
+
+ScrollIndicator::ScrollIndicator(QWidget* parent)
+    : QWidget(parent)
+{
+    setAttribute(Qt::WA_TransparentForMouseEvents);
+    hide();
+}
+
+void ScrollIndicator::flash(int offset, int contentHeight, const QRect& view)
+{
+    if (contentHeight <= view.height())
+        return hide();
+    const double track = view.height() - 2.0 * kMargin;
+    const double length = std::max<double>(kMinimumLength, track * view.height() / contentHeight);
+    const double share = std::clamp(static_cast<double>(offset) / (contentHeight - view.height()), 0.0, 1.0);
+    setGeometry(view.right() - kWidth - kMargin, view.top() + kMargin + qRound(share * (track - length)),
+        kWidth, qRound(length));
+    raise();
+    show();
+    _rest.start(kMillisecondsShown, this);
+}
+
+void ScrollIndicator::timerEvent(QTimerEvent* event)
+{
+    if (event->timerId() != _rest.timerId())
+        return QWidget::timerEvent(event);
+    _rest.stop();
+    hide();
+}
+
+void ScrollIndicator::paintEvent(QPaintEvent*)
+{
+    QPainter painter(this);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(Theme::current().accessory);
+    painter.drawRoundedRect(rect(), kWidth / 2.0, kWidth / 2.0);
 }
 
 } // namespace orvex
