@@ -35,7 +35,7 @@ public:
     }
 };
 
-TEST_F(DecodeTest, PrintsTheTreeOfWhatTheCapturesHold)
+TEST_F(DecodeTest, PrintsTheTreeOfTheCaptures)
 {
     const std::vector<Bytes> captures = {
         PcapFile().add(antennas(1)).bytes(), PcapFile().add(antennas(4)).bytes()};
@@ -56,13 +56,13 @@ TEST_F(DecodeTest, PrintsTheTreeOfWhatTheCapturesHold)
     EXPECT_EQ(root["children"][0]["children"].back().dump(), expected);
     EXPECT_EQ(root["children"][3]["children"], Json::array());
 
-    const std::vector<Bytes> nothing = {PcapFile().bytes()}; // so there is no display yet
+    const std::vector<Bytes> nothing = {PcapFile().bytes()};
     EXPECT_EQ(decodeCaptures(nothing).output, "Orvex: (unknown)\n");
     EXPECT_EQ(Json::parse(decodeCaptures(nothing, {"--format", "json"}).output),
         (Json{{"name", "Orvex"}, {"path", "/"}, {"value", "(unknown)"}}));
 }
 
-TEST_F(DecodeTest, DeepTreesAreCompactAndWithoutPaths)
+TEST_F(DecodeTest, PrintsDeepTreesCompactAndWithoutPaths)
 {
     for (const auto& [levels, hasPaths] : {std::pair(31, true), {32, false}, {250, false}}) {
         std::string list = "<plist>";
@@ -82,69 +82,49 @@ TEST_F(DecodeTest, DeepTreesAreCompactAndWithoutPaths)
     }
 }
 
-TEST_F(DecodeTest, SaysInOneLineWhatCouldNotBeRead)
-{
-    const struct {
-        const char* name;
-        Bytes bytes;
-        int status;
-        bool isShown;
-        const char* why;
-    } cases[] = {
-        {"cut in the first packet", PcapFile().add(antennas(4)).cut(1).bytes(), 1, false,
-            "0.pcap: truncated"},
-        {"cut later", PcapFile().add(antennas(4)).add(antennas(9)).cut(1).bytes(), 1, true,
-            "(after 1 whole messages)\n"},
-        {"partial packet", PcapFile().add(antennas(4)).add(antennas(9), 21).bytes(), 0, true,
-            "0.pcap: 1 packets hold only the beginning of their message"},
-    };
-    for (const auto& [name, bytes, status, isShown, why] : cases) {
-        const Result result = decodeCaptures({bytes});
-        EXPECT_EQ(result.status, status) << name;
-        EXPECT_THAT(result.errors, HasSubstr(why)) << name;
-        EXPECT_EQ(std::ranges::count(result.errors, '\n'), 1) << name;
-        EXPECT_EQ(result.output.find("Num Tx Antennas: 4\n") != std::string::npos, isShown) << name;
-    }
-    const Result missing = decode({"--technology", "MRL_LTE", "/no/such/capture"});
-    EXPECT_EQ(missing.status, 1);
-    EXPECT_EQ(missing.errors, "orvex-decode: /no/such/capture: No such file or directory\n");
-}
-
-TEST_F(DecodeTest, WritesDocumentAndLogIntoFiles)
+TEST_F(DecodeTest, WritesDocumentAndLogToFiles)
 {
     const Result result = decodeCaptures({PcapFile().add(antennas(4)).add(Bytes(13, 2)).bytes()},
         {"--output", name("tree"), "--log", name("log")});
     EXPECT_EQ(result.status, 0) << result.errors;
-    EXPECT_EQ(result.output, "") << "lines of the console stay out of the document";
+    EXPECT_EQ(result.output, "") << "without lines of the console";
     EXPECT_THAT(contentsOf(path("tree")), HasSubstr("Num Tx Antennas: 4\n"));
     EXPECT_THAT(contentsOf(path("log")),
         HasSubstr("\n<4>LTE Serving Cell Info\n<3>Received an unknown log message: 45249\n"
                   "<3>Invalid log type: 2. Dropping.\n"));
-    const Result unwritable = decodeCaptures({PcapFile().bytes()}, {"--output", "/no/such/folder/file"});
-    EXPECT_EQ(unwritable.status, 1);
-    EXPECT_EQ(unwritable.errors, "orvex-decode: /no/such/folder/file: No such file or directory\n");
 }
 
-TEST_F(DecodeTest, SaysInOneLineWhatCouldNotBeWritten)
+TEST_F(DecodeTest, SaysInOneLineWhatItCannotReadOrWrite)
 {
+    const Bytes good = PcapFile().add(antennas(4)).bytes();
     const struct {
+        Bytes bytes;
         QStringList arguments;
+        int status;
+        bool isShown;
         const char* error;
     } cases[] = {
-        {{"--output", "/dev/full"}, "/dev/full: No space left on device"},
-        {{"--log", "/dev/full"}, "/dev/full: No space left on device"},
-        {{"--snapshot", "/dev/full"}, "/dev/full: No space left on device"},
+        {PcapFile().add(antennas(4)).cut(1).bytes(), {}, 1, false, "0.pcap: truncated"},
+        {PcapFile().add(antennas(4)).add(antennas(9)).cut(1).bytes(), {}, 1, true,
+            "(after 1 whole messages)\n"},
+        {PcapFile().add(antennas(4)).add(antennas(9), 21).bytes(), {}, 0, true,
+            "0.pcap: 1 packets hold only the beginning of their message"},
+        {good, {"/no/such/capture"}, 1, true, "orvex-decode: /no/such/capture: No such file or directory\n"},
+        {good, {"--output", "/dev/full"}, 1, false, "/dev/full: No space left on device"},
+        {good, {"--log", "/dev/full"}, 1, true, "/dev/full: No space left on device"},
+        {good, {"--snapshot", "/dev/full"}, 1, true, "/dev/full: No space left on device"},
+        {good, {"--output", "/no/such/folder/file"}, 1, false, "/no/such/folder/file: No such file or dir"},
     };
-    for (const auto& [arguments, error] : cases) {
-        const QStringList common{
-            "--technology", "MRL_LTE", write("x.pcap", PcapFile().add(antennas(4)).bytes())};
-        const Result result = decode(arguments + common);
-        EXPECT_EQ(result.status, 1);
-        EXPECT_EQ(result.errors, std::string("orvex-decode: ") + error + "\n");
+    for (const auto& [bytes, arguments, status, isShown, error] : cases) {
+        const Result result = decodeCaptures({bytes}, arguments);
+        EXPECT_EQ(result.status, status) << error;
+        EXPECT_THAT(result.errors, HasSubstr(error));
+        EXPECT_EQ(std::ranges::count(result.errors, '\n'), 1) << error;
+        EXPECT_EQ(result.output.find("Num Tx Antennas: 4\n") != std::string::npos, isShown) << error;
     }
 }
 
-TEST_F(DecodeTest, WritesNoFileThatItReadsOrWritesAlready)
+TEST_F(DecodeTest, RefusesToWriteAFileItReadsOrWritesAlready)
 {
     namespace fs = std::filesystem;
     const Bytes bytes = PcapFile().add(antennas(4)).bytes();
@@ -185,10 +165,10 @@ TEST_F(DecodeTest, WritesNoFileThatItReadsOrWritesAlready)
     }
 }
 
-TEST_F(DecodeTest, AsksForTheDisplayAsOftenAsItIsTold)
+TEST_F(DecodeTest, AsksForTheDisplayAfterEveryNMessages)
 {
     const Bytes five = PcapFile().add({1}).add({1}).add({1}).add({1}).add({1}).bytes();
-    // Without a template every request and every message logs so once, and nothing else says why.
+    // Without a template, each request and each message logs a line.
     const auto failures = [&](const char* messages) {
         const Result result = decode({"--log", name("log"), "--technology", "MRL_LTE", "--resources",
             name("none"), "--refresh-every", messages, write("five.pcap", five)});

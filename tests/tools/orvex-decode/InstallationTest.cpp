@@ -8,8 +8,8 @@
 namespace orvex::test {
 namespace {
 
-// Neither the trees that it was built from nor the place where it was put first matter to an installation.
-TEST(InstallationTest, ProgramsTakeTheTemplatesThatLieBesideThem)
+// An installation depends neither on the source and build trees nor on the place of the first install.
+TEST(InstallationTest, ProgramsFindTheTemplatesBesideThem)
 {
     const ProgramFolder folder;
     const auto run = [&folder](const std::string& program, const QStringList& arguments) {

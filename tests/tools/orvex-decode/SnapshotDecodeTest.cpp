@@ -1,4 +1,4 @@
-// Snapshots written from captures, and read again.
+// Snapshots written from captures and read back.
 
 #include "scenarios/ScenarioTable.h"
 
@@ -35,7 +35,7 @@ protected:
     }
 };
 
-TEST_F(SnapshotDecodeTest, HoldsWhatTheCaptureHeldForEveryTechnology)
+TEST_F(SnapshotDecodeTest, KeepsTheDisplayOfEveryTechnology)
 {
     for (const korat::ScenarioEntry& entry : korat::scenarioTable()) {
         SCOPED_TRACE(entry.technology);
@@ -54,7 +54,7 @@ TEST_F(SnapshotDecodeTest, HoldsWhatTheCaptureHeldForEveryTechnology)
         const Json& last = saved["entries"][4];
         EXPECT_THAT(last["description"].get<std::string>(), testing::StartsWith("Snapshot (2"));
         EXPECT_EQ(last["display"], shown);
-        // The five intervals alone, without what came before; of IFX that is everything.
+        // Only the five intervals of the history; for IFX they hold everything.
         EXPECT_EQ(last["decoded"].size(), 3U);
         EXPECT_TRUE(hasDLF || last["decoded"] == shown);
 
@@ -62,13 +62,13 @@ TEST_F(SnapshotDecodeTest, HoldsWhatTheCaptureHeldForEveryTechnology)
         EXPECT_EQ(dlf.status, hasDLF ? 0 : 1);
         EXPECT_EQ(
             dlf.errors, hasDLF ? "" : "orvex-decode: " + path("saved.orvex") + ": holds no binary log\n");
-        if (entry.technology == std::string("MRL_CDMA")) { // has no extra packets, which a DLF lacks
+        if (entry.technology == std::string("MRL_CDMA")) { // without the extra packets that a DLF lacks
             EXPECT_EQ(parsed(decode(options + QStringList{name("saved.dlf")})), last["decoded"]);
         }
     }
 }
 
-TEST_F(SnapshotDecodeTest, SaysInOneLineWhyASnapshotCannotBeRead)
+TEST_F(SnapshotDecodeTest, SaysInOneLineWhyItCannotReadASnapshot)
 {
     const Result result = decode({write("broken.orvex", Bytes(10, '<'))});
     EXPECT_EQ(result.status, 1);
@@ -77,7 +77,7 @@ TEST_F(SnapshotDecodeTest, SaysInOneLineWhyASnapshotCannotBeRead)
     EXPECT_EQ(std::count(result.errors.begin(), result.errors.end(), '\n'), 1) << result.errors;
 }
 
-TEST_F(SnapshotDecodeTest, NamesTheValueThatCannotBeSaved)
+TEST_F(SnapshotDecodeTest, NamesTheValueItCannotSave)
 {
     Bytes key{0x5E}; // 14 characters
     const Bytes name14 = bytesOf("kSimFile_ICCID");
