@@ -116,6 +116,8 @@ TEST_F(NavigationStackTest, ARefreshDuringAClickDoesNotLoseTheClick)
     button()->setFocus();
     setItems();
     EXPECT_TRUE(button()->hasFocus());
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    EXPECT_EQ(button()->parentWidget()->parentWidget()->children().size(), 1) << "old rows are deleted";
 }
 
 } // namespace

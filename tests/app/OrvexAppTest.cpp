@@ -32,6 +32,18 @@ public:
     std::set<const QObject*> shown;
 };
 
+// Counts the paint events that reach an object.
+class PaintCounter final : public QObject {
+public:
+    bool eventFilter(QObject*, QEvent* event) override
+    {
+        count += event->type() == QEvent::Paint ? 1 : 0;
+        return false;
+    }
+
+    int count = 0;
+};
+
 class OrvexAppTest : public testing::Test, public SessionFixture {
 protected:
     OrvexPaneController& pane(int index) const { return paneAt(*app->navigationStack(), index); }
@@ -122,7 +134,10 @@ TEST_F(OrvexAppTest, ShowsAndPrintsALossAtTheNextNavigation)
     deliverNeighbors(2);
     EXPECT_EQ(printed(), "");
     refresh();
+    PaintCounter paints;
+    pane(0).toolbarRow()->items()[1].widget->installEventFilter(&paints);
     EXPECT_EQ(printed(), "2 Updated 2023-11-15 at 00:13:20\n");
+    EXPECT_EQ(paints.count, 1) << "printing does not swallow the event";
     deliverNeighbors(3);
     refresh(); // at the same time
     EXPECT_EQ(printed(), "");
@@ -179,6 +194,7 @@ TEST_F(OrvexAppTest, TerminatesOnceAndLeavesNothingRunning)
     app->applicationWillTerminate();
     EXPECT_EQ(preferences.done, kHomeScreenWrite);
     EXPECT_EQ(app->window(), nullptr);
+    app->showSaveView(); // does nothing
     EXPECT_FALSE(telephony.localPort->valid);
     EXPECT_EQ(runLoop.timerCount(), 0U);
 

@@ -89,15 +89,21 @@ TEST(OrvexCell, PaintsHighlightAccessoriesAndTheMarkOfHiddenText)
         }
         return count;
     };
-    const Theme& theme = Theme::current();
-    const QImage plain = painted(Accessory::none, false);
-    EXPECT_EQ(pixelsOf(plain, theme.separator), 190);
-    EXPECT_EQ(pixelsOf(plain, theme.tint), 0);
-    EXPECT_EQ(pixelsOf(plain, theme.accessory), 0);
-    EXPECT_EQ(pixelsOf(painted(Accessory::none, true), theme.rowHighlight), 200 * 44 - 190);
-    EXPECT_GT(pixelsOf(painted(Accessory::checkmark, false), theme.tint), 10);
-    EXPECT_GT(pixelsOf(painted(Accessory::disclosureIndicator, false), theme.accessory), 5);
-    EXPECT_NE(painted(Accessory::none, false, 200), plain);
+    std::vector<QColor> backgrounds;
+    for (const auto mode : {Theme::Mode::dark, Theme::Mode::light}) {
+        Theme::use(mode);
+        const Theme& theme = Theme::current();
+        backgrounds.push_back(theme.background);
+        const QImage plain = painted(Accessory::none, false);
+        EXPECT_EQ(pixelsOf(plain, theme.separator), 190);
+        EXPECT_EQ(pixelsOf(plain, theme.tint), 0);
+        EXPECT_EQ(pixelsOf(plain, theme.accessory), 0);
+        EXPECT_EQ(pixelsOf(painted(Accessory::none, true), theme.rowHighlight), 200 * 44 - 190);
+        EXPECT_GT(pixelsOf(painted(Accessory::checkmark, false), theme.tint), 10);
+        EXPECT_GT(pixelsOf(painted(Accessory::disclosureIndicator, false), theme.accessory), 5);
+        EXPECT_NE(painted(Accessory::none, false, 200), plain);
+    }
+    EXPECT_LT(backgrounds[0].lightness(), backgrounds[1].lightness());
 }
 
 } // namespace
