@@ -63,14 +63,14 @@ AppOptions AppOptions::parse(int count, const char* const* arguments)
 {
     AppOptions result;
     CommandLine line(program());
-    result.ending = line.parse(count, arguments);
-    if (result.ending)
+    result.earlyExit = line.parse(count, arguments);
+    if (result.earlyExit)
         return result;
     if (const auto size = line.value("size")) {
         result.fillsHandset = *size == "handset";
         result.size = result.fillsHandset ? kHandsetSize : sizeIn(*size);
         if (!result.size)
-            result.ending = line.wrongUsage("--size takes WIDTHxHEIGHT, such as 375x667, or 'handset'.");
+            result.earlyExit = line.wrongUsage("--size takes WIDTHxHEIGHT, such as 375x667, or 'handset'.");
     }
     result.usesConsole = line.isSet("console");
     result.printsStatus = line.isSet("print-status");

@@ -17,7 +17,7 @@ struct AppOptions {
     // The size to open the window with on such a screen; absent: the screen's.
     std::optional<QSize> windowSizeOn(const QSize& screen) const;
 
-    std::optional<CommandLine::Ending> ending; // instead of running; nothing else is valid then
+    std::optional<CommandLine::EarlyExit> earlyExit; // instead of running; nothing else is valid then
 
     bool usesConsole = false; // else a window
     Theme::Mode theme = Theme::Mode::system;

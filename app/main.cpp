@@ -216,8 +216,8 @@ int main(int argc, char** argv)
 {
     occupyStandardStreams();
     const auto options = AppOptions::parse(argc, argv);
-    if (options.ending)
-        return options.ending->print();
+    if (options.earlyExit)
+        return options.earlyExit->print();
 
     std::signal(SIGPIPE, SIG_IGN); // the failing write reports a reader that has gone
     const auto log = makeLinuxSystemLog("orvex");

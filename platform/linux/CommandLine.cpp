@@ -36,15 +36,15 @@ CommandLine::CommandLine(Program program)
             _program.argumentsSyntax, _program.argumentsDescription, _program.argumentsSyntax);
 }
 
-std::optional<CommandLine::Ending> CommandLine::parse(int count, const char* const* arguments)
+std::optional<CommandLine::EarlyExit> CommandLine::parse(int count, const char* const* arguments)
 {
     // Not process(), which would end the program in its own way.
     if (!_parser.parse(argumentTexts(count, arguments)))
         return wrongUsage(argumentBytes(_parser.errorText()));
     if (isSet("help"))
-        return Ending{EXIT_SUCCESS, help()};
+        return EarlyExit{EXIT_SUCCESS, help()};
     if (isSet("version"))
-        return Ending{EXIT_SUCCESS, std::string(_program.name) + " " ORVEX_VERSION "\n"};
+        return EarlyExit{EXIT_SUCCESS, std::string(_program.name) + " " ORVEX_VERSION "\n"};
     if (const std::string error = fault(); !error.empty())
         return wrongUsage(error);
     return std::nullopt;
@@ -70,7 +70,7 @@ std::string CommandLine::fault() const
     return {};
 }
 
-CommandLine::Ending CommandLine::wrongUsage(const std::string& error) const
+CommandLine::EarlyExit CommandLine::wrongUsage(const std::string& error) const
 {
     const std::string name = _program.name;
     return {kWrongUsage, name + ": " + visibleText(error) + " Try '" + name + " --help'.\n"};
@@ -103,7 +103,7 @@ std::vector<std::string> CommandLine::arguments() const
     return bytesOf(_parser.positionalArguments());
 }
 
-int CommandLine::Ending::print() const
+int CommandLine::EarlyExit::print() const
 {
     std::fputs(text.c_str(), status == EXIT_SUCCESS ? stdout : stderr);
     return status;

@@ -33,9 +33,9 @@ public:
         const char* argumentsSyntax = nullptr; // "FILE..." in the help; null takes no arguments but options
         const char* argumentsDescription = nullptr;
     };
-    // Why a program ends before it has begun.
-    struct Ending {
-        // Prints the text, an error on standard error. Returns the exit status.
+    // What to print instead of running, and the exit status.
+    struct EarlyExit {
+        // Prints the text, on standard error if it is an error. Returns the status.
         int print() const;
 
         int status;
@@ -46,10 +46,10 @@ public:
 
     explicit CommandLine(Program program);
 
-    // Reads the arguments, the name of the program first. Returns an ending for help, version and for what
+    // Reads the arguments, the name of the program first. Returns an exit for --help, --version and whatever
     // the table does not allow.
-    std::optional<Ending> parse(int count, const char* const* arguments);
-    Ending wrongUsage(const std::string& error) const;
+    std::optional<EarlyExit> parse(int count, const char* const* arguments);
+    EarlyExit wrongUsage(const std::string& error) const;
 
     bool isSet(const char* option) const { return _parser.isSet(QLatin1String(option)); }
     // Absent when the option is.
@@ -59,7 +59,7 @@ public:
 
 private:
     std::string help() const;
-    // What the table has against the options given; empty for nothing.
+    // Returns the rule of the table that the arguments break; empty if none.
     std::string fault() const;
 
     Program _program;

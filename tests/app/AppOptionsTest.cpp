@@ -14,7 +14,7 @@ AppOptions parse(std::vector<const char*> arguments)
 TEST(AppOptions, ReadsEachOption)
 {
     AppOptions options = parse({});
-    EXPECT_FALSE(options.ending);
+    EXPECT_FALSE(options.earlyExit);
     EXPECT_FALSE(options.usesConsole);
     EXPECT_EQ(options.theme, Theme::Mode::system);
     options = parse({"--resources", "/\xff b", "--dark", "--print-status", "--until-painted"});
@@ -52,10 +52,10 @@ TEST(AppOptions, EndsForHelpVersionAndWrongUsage)
         {{"--open", "a", "--until-painted"}, 2, "--open cannot"},
     };
     for (const auto& [arguments, status, text] : cases) {
-        const auto ending = parse(arguments).ending;
-        ASSERT_TRUE(ending) << text;
-        EXPECT_EQ(ending->status, status) << text;
-        EXPECT_THAT(ending->text, testing::HasSubstr(text));
+        const auto earlyExit = parse(arguments).earlyExit;
+        ASSERT_TRUE(earlyExit) << text;
+        EXPECT_EQ(earlyExit->status, status) << text;
+        EXPECT_THAT(earlyExit->text, testing::HasSubstr(text));
     }
 }
 
@@ -78,8 +78,8 @@ TEST(AppOptions, OpensTheWindowAtTheSizeAskedFor)
     EXPECT_EQ(parse({}).windowSizeOn({1280, 800}), std::nullopt);
     for (const char* malformed : {"", "375", "375x", "x667", "375X667", "0x667", "-1x5", " 1x1", "1x1\n",
              "10000x1", "1x1x1", "phone"}) {
-        const auto ending = parse({"--size", malformed}).ending;
-        EXPECT_TRUE(ending && ending->status == CommandLine::kWrongUsage) << malformed;
+        const auto earlyExit = parse({"--size", malformed}).earlyExit;
+        EXPECT_TRUE(earlyExit && earlyExit->status == CommandLine::kWrongUsage) << malformed;
     }
 }
 

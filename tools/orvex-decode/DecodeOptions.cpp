@@ -116,11 +116,11 @@ DecodeOptions DecodeOptions::parse(int count, const char* const* arguments)
 {
     DecodeOptions result;
     CommandLine line(program());
-    result.ending = line.parse(count, arguments);
-    if (result.ending)
+    result.earlyExit = line.parse(count, arguments);
+    if (result.earlyExit)
         return result;
     if (const std::string error = read(line, result); !error.empty())
-        result.ending = line.wrongUsage(error);
+        result.earlyExit = line.wrongUsage(error);
     return result;
 }
 

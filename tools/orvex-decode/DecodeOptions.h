@@ -16,7 +16,7 @@ struct DecodeOptions {
     // The arguments as the program got them, its own name first.
     static DecodeOptions parse(int count, const char* const* arguments);
 
-    std::optional<CommandLine::Ending> ending; // instead of decoding; nothing else is valid then
+    std::optional<CommandLine::EarlyExit> earlyExit; // instead of decoding; nothing else is valid then
 
     std::string technology; // may be empty when all inputs are snapshots
     Format format = Format::tree;

@@ -243,8 +243,8 @@ int main(int argc, char** argv)
 {
     occupyStandardStreams();
     const DecodeOptions options = DecodeOptions::parse(argc, argv);
-    if (options.ending)
-        return options.ending->print();
+    if (options.earlyExit)
+        return options.earlyExit->print();
     if (const std::string conflict = conflictOf(options); !conflict.empty()) {
         printError(conflict);
         return CommandLine::kWrongUsage;
