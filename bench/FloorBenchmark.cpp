@@ -2,7 +2,6 @@
 // numbers. A decoder that keeps pace with the second spends its time on texts and on nothing else.
 
 #include "Benchmarks.h"
-#include "RecordedStream.h"
 
 #include <benchmark/benchmark.h>
 

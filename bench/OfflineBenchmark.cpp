@@ -1,9 +1,7 @@
-// orvex-decode as it is started from a shell: a large capture and what memory it takes, and several captures
-// side by side.
+// orvex-decode as it is started from a shell: how long captures take it, and how much memory.
 
 #include "Benchmarks.h"
 #include "ChildProcess.h"
-#include "RecordedStream.h"
 
 #include "PcapWriter.h"
 
@@ -13,16 +11,12 @@
 
 #include <chrono>
 #include <filesystem>
-#include <thread>
 
 namespace orvex::bench {
 namespace {
 
-using Arguments = std::vector<std::string>;
-
 constexpr std::size_t kPcapRecordHeader = 16;
-constexpr std::size_t kPartMiB = 64;
-constexpr std::size_t kParts = 4;
+constexpr std::size_t kSmallMiB = 64;
 
 std::string theDirectory; // where captures are written
 
@@ -58,14 +52,12 @@ struct Run {
     double peakMiB;
 };
 
-// Decodes the captures. No seconds when the program failed.
-Run decode(Arguments options)
+// Decodes a capture. No seconds when the program failed.
+Run decode(const std::string& capture)
 {
-    Arguments arguments = {ORVEX_DECODE, "--technology", telephony::kTechnologyMRL_LTE, "--refresh-every",
-        "1000", "--output", "/dev/null"};
-    arguments.insert(arguments.end(), options.begin(), options.end());
     const auto start = std::chrono::steady_clock::now();
-    ChildProcess program(arguments);
+    ChildProcess program({ORVEX_DECODE, "--technology", telephony::kTechnologyMRL_LTE, "--refresh-every",
+        "1000", "--output", "/dev/null", capture});
     const auto end = program.waitForEnd();
     const double seconds = std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
     return {end.isGood ? seconds : 0, static_cast<double>(end.peakKiB) / 1024};
@@ -74,7 +66,7 @@ Run decode(Arguments options)
 void decodeCapture(benchmark::State& state, const LargeCapture& capture)
 {
     for (auto _ : state) {
-        const Run run = decode({capture.path()});
+        const Run run = decode(capture.path());
         if (run.seconds == 0)
             return state.SkipWithError("orvex-decode failed");
         state.SetIterationTime(run.seconds);
@@ -90,28 +82,7 @@ void decodeStream(benchmark::State& state, std::size_t miB)
 
 void decodeBaseband(benchmark::State& state)
 {
-    decodeCapture(state, LargeCapture(kPartMiB, basebandStream(kTechnologies[0])));
-}
-
-// The same captures with one worker and with one for each core.
-void decodeSeveral(benchmark::State& state)
-{
-    const LargeCapture capture(kPartMiB);
-    const std::size_t cores = std::max(1U, std::thread::hardware_concurrency());
-    const auto withJobs = [&](std::size_t jobs) {
-        Arguments arguments = {"--jobs", std::to_string(jobs)};
-        arguments.insert(arguments.end(), std::max(kParts, cores), capture.path());
-        return decode(arguments).seconds;
-    };
-    for (auto _ : state) {
-        const double one = withJobs(1);
-        const double all = withJobs(cores);
-        if (one == 0 || all == 0)
-            return state.SkipWithError("orvex-decode failed");
-        state.SetIterationTime(all);
-        state.counters["speed-up"] = one / all;
-        state.counters["cores"] = static_cast<double>(cores);
-    }
+    decodeCapture(state, LargeCapture(kSmallMiB, basebandStream(kTechnologies[0])));
 }
 
 } // namespace
@@ -119,18 +90,13 @@ void decodeSeveral(benchmark::State& state)
 void registerOffline(const std::string& directory, std::size_t captureMiB)
 {
     theDirectory = directory;
-    for (const auto& [name, miB] : {std::pair("offline/small", kPartMiB), {"offline/large", captureMiB}})
+    for (const auto& [name, miB] : {std::pair("offline/small", kSmallMiB), {"offline/large", captureMiB}})
         benchmark::RegisterBenchmark(name, decodeStream, miB)
             ->Unit(benchmark::kSecond)
             ->UseManualTime()
             ->Iterations(1)
             ->Repetitions(1);
     benchmark::RegisterBenchmark("offline/baseband", decodeBaseband)
-        ->Unit(benchmark::kSecond)
-        ->UseManualTime()
-        ->Iterations(1)
-        ->Repetitions(1);
-    benchmark::RegisterBenchmark("offline/jobs", decodeSeveral)
         ->Unit(benchmark::kSecond)
         ->UseManualTime()
         ->Iterations(1)

@@ -3,8 +3,6 @@
 
 #include "Benchmarks.h"
 #include "ChildProcess.h"
-#include "PortMessage.h"
-#include "RecordedStream.h"
 
 #include "SocketMessagePorts.h"
 
@@ -13,21 +11,48 @@
 
 #include <benchmark/benchmark.h>
 
+#include <QCoreApplication>
 #include <QEventLoop>
 #include <QTemporaryDir>
 #include <QTimer>
 
 #include <algorithm>
+#include <array>
+#include <bit>
+#include <cstdlib>
 #include <cstring>
-#include <vector>
+#include <thread>
 
 namespace orvex::bench {
 namespace {
 
+using namespace std::chrono_literals;
 using Nanoseconds = std::chrono::nanoseconds;
 
 constexpr const char* kPortName = "org.orvex.Bench";
 constexpr auto kLongestWait = std::chrono::seconds(60);
+
+// What the sender of the port benchmark sends: a log packet of 100 bytes with three LTE neighbours. Where
+// packets have their time it has that of its sending, on a clock that both processes read.
+constexpr std::size_t kPortMessageSize = 100;
+constexpr std::size_t kPortMessageTime = 5; // 8 bytes, as they stand in memory
+constexpr std::size_t kPortMessageNeighbors = 3;
+
+Bytes portMessage()
+{
+    constexpr std::array<std::uint8_t, 21> kBeginning = {1, kPortMessageSize - 1, 0, 0x80, 0xB1, 0, 0, 0, 0,
+        0, 0, 0,
+        0, // so far the header
+        3, 0, 0, 0, 0x9C, 0x18, (kPortMessageNeighbors - 1) << 6, 0};
+    Bytes message(kPortMessageSize, 0x55);
+    std::ranges::copy(kBeginning, message.begin());
+    return message;
+}
+
+std::chrono::steady_clock::rep portTime()
+{
+    return std::chrono::steady_clock::now().time_since_epoch().count();
+}
 
 // When a message was sent, and when it was decoded.
 struct Trip {
@@ -55,7 +80,7 @@ public:
                 take(message);
                 return std::nullopt;
             });
-        ChildProcess sender({ORVEX_BENCH_SENDER, directory, kPortName, std::to_string(_count),
+        ChildProcess sender({"/proc/self/exe", kPortSender, directory, kPortName, std::to_string(_count),
             std::to_string(pause.count())});
         QTimer::singleShot(kLongestWait, &_loop, &QEventLoop::quit);
         _loop.exec();
@@ -134,7 +159,35 @@ void portLatency(benchmark::State& state)
     }
 }
 
+bool send(RemotePort& port, Bytes& message)
+{
+    const auto time = std::bit_cast<std::array<std::uint8_t, 8>>(portTime());
+    std::ranges::copy(time, message.begin() + kPortMessageTime);
+    return port.send(0, message, 5s) == RemotePort::Status::success;
+}
 } // namespace
+
+int sendToPort(int argc, char** argv)
+{
+    if (argc != 6)
+        return 2;
+    const QCoreApplication application(argc, argv);
+    SocketMessagePorts ports(argv[2]);
+    const auto port = ports.createRemotePort(argv[3]);
+    if (!port)
+        return EXIT_FAILURE;
+    const std::chrono::microseconds pause(std::atoi(argv[5]));
+    Bytes message = portMessage();
+    for (int left = std::atoi(argv[4]); left > 0; --left) {
+        if (pause > 0us)
+            std::this_thread::sleep_for(pause);
+        if (!send(*port, message))
+            return EXIT_FAILURE;
+    }
+    while (port->pendingBytes() > 0 && port->isValid())
+        QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+    return EXIT_SUCCESS;
+}
 
 void registerPorts()
 {

@@ -3,7 +3,6 @@
 // every list.
 
 #include "Benchmarks.h"
-#include "RecordedStream.h"
 
 #include "NodesByPath.h"
 

@@ -9,9 +9,44 @@
 
 namespace orvex::bench {
 
+void Results::ReportRuns(const std::vector<Run>& runs)
+{
+    ConsoleReporter::ReportRuns(runs);
+    for (const Run& run : runs) {
+        const std::string& name = run.run_name.function_name;
+        _hasRun.insert(name);
+        const bool isMedian = run.run_type == Run::RT_Aggregate && run.aggregate_name == "median";
+        if (run.error_occurred || (run.run_type == Run::RT_Aggregate && !isMedian))
+            continue;
+        if (const auto known = _figures.find(name); known != _figures.end() && known->second.isMedian)
+            continue;
+        // What is of one thread is told in processor time, whatever else the machine does.
+        const double time =
+            run.run_name.time_type.empty() ? run.GetAdjustedCPUTime() : run.GetAdjustedRealTime();
+        Figures figures{time / benchmark::GetTimeUnitMultiplier(run.time_unit), {}, isMedian};
+        for (const auto& [counter, value] : run.counters)
+            figures.counters[counter] = value;
+        _figures[name] = std::move(figures);
+    }
+}
+
+std::optional<double> Results::seconds(const std::string& benchmark) const
+{
+    const auto found = _figures.find(benchmark);
+    return found == _figures.end() ? std::nullopt : std::optional(found->second.seconds);
+}
+
+std::optional<double> Results::counter(const std::string& benchmark, const std::string& name) const
+{
+    const auto found = _figures.find(benchmark);
+    if (found == _figures.end() || !found->second.counters.contains(name))
+        return std::nullopt;
+    return found->second.counters.at(name);
+}
+
 namespace {
 
-enum class Unit { perSecond, milliseconds, microseconds, mebibytes, times, percent };
+enum class Unit { perSecond, milliseconds, microseconds, mebibytes, percent };
 
 // A figure that was measured: the time of a benchmark, or one of its counters.
 struct Figure {
@@ -129,8 +164,6 @@ constexpr Row kRows[] = {
         atLeast(1e6)},
     {"orvex-decode, capture of 64 MiB", Unit::perSecond, {"offline/small", kRate}, "copy/lte", atLeast(1e6)},
     {"— most memory it held", Unit::mebibytes, {"offline/small", kPeak}},
-    {"orvex-decode, a job for each core", Unit::times, {"offline/jobs", "speed-up"}, nullptr,
-        atLeast(0.9, {"offline/jobs", "cores"})},
 };
 
 std::optional<double> valueOf(const Results& results, const Figure& figure)
@@ -154,7 +187,6 @@ std::string textOf(double value, Unit unit)
     case Unit::milliseconds: return digits(value * 1e3) + " ms";
     case Unit::microseconds: return digits(value * 1e6) + " µs";
     case Unit::mebibytes: return digits(value) + " MiB";
-    case Unit::times: return digits(value) + " ×";
     case Unit::percent: return digits(value) + " %";
     }
     return {};

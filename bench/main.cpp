@@ -39,6 +39,8 @@ std::string takeOption(int& argc, char** argv, std::string_view name, std::strin
 int main(int argc, char** argv)
 {
     using namespace orvex::bench;
+    if (argc > 1 && argv[1] == std::string_view(kPortSender))
+        return sendToPort(argc, argv);
     const std::string table = takeOption(argc, argv, "--table=", "");
     const std::string directory = takeOption(argc, argv, "--directory=", ".");
     const std::size_t captureMiB = std::stoul(takeOption(argc, argv, "--capture-mib=", "1024"));
@@ -49,7 +51,6 @@ int main(int argc, char** argv)
     registerFloors();
     registerDictionaries();
     registerDecoding();
-    registerLoggedDecoding();
     registerRebuilding();
     registerPainting();
     registerStarting();

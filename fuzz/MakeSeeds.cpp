@@ -1,18 +1,18 @@
 // Writes seed inputs for every target, and dictionaries of log codes: fuzz_seeds FUZZ_DIRECTORY
 
+#include "Captures.h"
 #include "FixedClock.h"
 #include "InputMessages.h"
 #include "OfflineSession.h"
 
 #include "Array.h"
 #include "FileStorage.h"
+#include "MessageFrame.h"
 #include "PcapWriter.h"
 #include "PortFrame.h"
 #include "PropertyList.h"
 #include "Snapshot.h"
-#include "TelephonyConstants.h"
 #include "TextFormat.h"
-#include "scenarios/ScenarioTable.h"
 
 #include <algorithm>
 #include <filesystem>
@@ -63,21 +63,22 @@ public:
     }
 
 private:
-    static std::unique_ptr<korat::Scenario> scenarioOf(const char* technology)
+    // The packets' code; none of a property list.
+    static std::optional<LogCode> codeOf(const Bytes& message)
     {
-        return korat::findScenario(technology, "")->make({.seed = 1, .start = kStart});
+        const MessageFrame frame(message);
+        const bool isPacket =
+            frame.logType() == MessageFrame::kTypeBaseband || frame.logType() == MessageFrame::kTypeExtra;
+        return isPacket ? std::optional(frame.logCode()) : std::nullopt;
     }
 
     // Baseband packets alone, where there are any: property lists make long inputs, and slow ones.
     static Messages firstMessages(const char* technology, std::size_t count)
     {
-        const auto scenario = scenarioOf(technology);
-        Messages messages;
-        while (messages.size() < count) {
-            korat::LogMessage message = scenario->next().message;
-            if (message.code.value_or(0) < korat::kExtraCodeBase)
-                messages.push_back(std::move(message.bytes));
-        }
+        Messages messages = test::captureOf(technology);
+        std::erase_if(
+            messages, [](const Bytes& message) { return codeOf(message).value_or(0) >= kExtraCodeBase; });
+        messages.resize(count);
         return messages;
     }
 
@@ -91,12 +92,11 @@ private:
     // The longest of each code, alone, and baseband packets in a row.
     void writeMessages(const Technology& technology) const
     {
-        std::map<korat::LogCode, Bytes> byCode;
-        const auto scenario = scenarioOf(technology.identifier);
-        for (auto item = scenario->next(); item.due <= kDrive; item = scenario->next()) {
-            Bytes& longest = byCode[item.message.code.value_or(0)];
-            if (item.message.bytes.size() > longest.size())
-                longest = std::move(item.message.bytes);
+        std::map<LogCode, Bytes> byCode;
+        for (const Bytes& message : test::captureOf(technology.identifier)) {
+            Bytes& longest = byCode[codeOf(message).value_or(0)];
+            if (message.size() > longest.size())
+                longest = message;
         }
         for (const auto& [code, message] : byCode)
             write(technology.target, text("code-%06x", code), InputMessages::inputOf(Messages{message}));
@@ -160,10 +160,10 @@ private:
         constexpr std::size_t kMessages = 6;
         for (std::size_t i = 0; i < std::size(kTechnologies); ++i) {
             const auto& [identifier, target] = kTechnologies[i];
-            const auto scenario = scenarioOf(identifier);
+            const Messages messages = test::captureOf(identifier);
             Messages pieces;
             for (std::size_t message = 0; message < kMessages; ++message) {
-                pieces.push_back(encodedFrame({.payload = shortened(scenario->next().message.bytes)}));
+                pieces.push_back(encodedFrame({.payload = messages[message]}));
                 if (message % 2 != 0)
                     pieces.emplace_back();
             }
@@ -251,7 +251,6 @@ private:
     }
 
     static constexpr std::chrono::microseconds kStart{1'700'000'000'000'000};
-    static constexpr std::chrono::seconds kDrive{60};
 
     fs::path _folder;
 };

@@ -81,8 +81,12 @@ std::string userDirectory(const char* name, const char* usual, const char* below
 
 std::string FileResources::defaultDirectory()
 {
-    if (const char* chosen = std::getenv("ORVEX_RESOURCES"); chosen && *chosen)
-        return chosen;
+    const char* chosen = std::getenv("ORVEX_RESOURCES");
+    return chosen && *chosen ? chosen : dataDirectory("resources");
+}
+
+std::string FileResources::dataDirectory(const char* inSources)
+{
     std::error_code error;
     const fs::path program = fs::read_symlink("/proc/self/exe", error);
     if (error)
@@ -91,7 +95,7 @@ std::string FileResources::defaultDirectory()
     if (fs::is_directory(besideProgram, error))
         return besideProgram.string();
     // An installed program does not look at the source tree.
-    const fs::path sources = fs::path(ORVEX_SOURCE_DIRECTORY) / "resources";
+    const fs::path sources = (fs::path(ORVEX_SOURCE_DIRECTORY) / inSources).lexically_normal();
     if (isInside(program, ORVEX_BUILD_DIRECTORY) && fs::is_directory(sources, error))
         return sources.string();
     return ORVEX_DATA_DIRECTORY;

@@ -19,10 +19,12 @@ public:
     {
     }
 
-    // The first of: $ORVEX_RESOURCES; the data directory of the installation that the program is part of,
-    // wherever that has moved; for a program run from the build tree, the source tree's resources; the data
-    // directory chosen at configuration.
+    // $ORVEX_RESOURCES, else the data directory; in the source tree, "resources".
     static std::string defaultDirectory();
+    // The first of: the data directory of the installation that the program is part of, wherever that has
+    // moved; for a program run from the build tree, this folder of the source tree; the data directory chosen
+    // at configuration.
+    static std::string dataDirectory(const char* inSources);
 
     std::vector<std::string> propertyListPaths() const override;
     DictionaryResult dictionaryNamed(const std::string& baseName) const override;

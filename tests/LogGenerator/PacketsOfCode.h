@@ -1,7 +1,8 @@
 #pragma once
 
+#include "Captures.h"
+#include "MessageFrame.h"
 #include "PropertyList.h"
-#include "ScenarioItems.h"
 
 #include "PacketText.h"
 
@@ -12,18 +13,17 @@
 
 namespace orvex::test {
 
-// Packets to try on a technology's decoders, by code: the longest ones of a minute's drive, which have
-// lists that are not empty, property lists in both forms, and for baseband codes two of random bytes.
+// Packets to try on a technology's decoders, by code: the longest ones of its capture, which have lists
+// that are not empty, property lists in both forms, and for baseband codes two of random bytes.
 class PacketsOfCode {
 public:
     explicit PacketsOfCode(const std::string& technology)
     {
-        using namespace std::chrono_literals;
-        for (auto& [due, message] : korat::itemsOf(*korat::findScenario(technology, ""), 60s))
-            _packets[static_cast<LogCode>(message.code.value())].push_back(std::move(message.bytes));
+        for (Bytes& message : captureOf(technology))
+            _packets[MessageFrame(message).logCode()].push_back(std::move(message));
         for (auto& [code, packets] : _packets) {
             std::ranges::stable_sort(packets, std::greater(), &Bytes::size);
-            packets.resize(std::min(packets.size(), kOfDrive));
+            packets.resize(std::min(packets.size(), kOfCapture));
             if (code >= kExtraCodeBase) {
                 packets.push_back(inBinaryForm(packets.front()));
             } else if (std::ranges::find(kOfOneLength, code) == std::end(kOfOneLength)) {
@@ -36,7 +36,7 @@ public:
     const std::vector<Bytes>& operator[](LogCode code) { return _packets[code]; }
 
 private:
-    static constexpr std::size_t kOfDrive = 3;
+    static constexpr std::size_t kOfCapture = 3;
     static constexpr LogCode kOfOneLength[] = {0x108A, 0x1183}; // others are dropped
 
     static Bytes inBinaryForm(const Bytes& packet)

@@ -1,5 +1,6 @@
 // koratd as a program, with clients inside the test.
 
+#include "Captures.h"
 #include "KoratClient.h"
 #include "KoratProgram.h"
 
@@ -30,22 +31,18 @@ TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
         QStringList arguments;
         int status = 2;
     } cases[] = {
-        {"known are: MRL_GSM, MRL_LTE, MRL_UTRAN2, MRL_CDMA, IFX", {"--technology", "MRL_NOISE"}},
-        {"MRL_LTE has no scenario \"sea\"; known are: town", {"--scenario", "sea"}},
-        {"--rate", {"--rate", "0"}},
-        {"--count", {"--count", "-1"}},
+        {R"(unknown technology "MRL_NOISE"; known are: MRL_GSM, MRL_LTE, MRL_UTRAN2, MRL_CDMA, IFX)",
+            {"--technology", "MRL_NOISE"}},
+        {"--rate takes a number", {"--rate", "0"}},
+        {"--count takes a number", {"--count", "-1"}},
         {"--count is given more than once", {"--count", "1", "--count", "2"}},
-        {"--seed", {"--seed", ""}},
-        {"--replay and --scenario exclude each other", {"--replay", "a", "--scenario", "town"}},
-        {"--replay and --seed exclude each other", {"--seed", "2", "--replay", "a"}},
-        {"--loop goes with --replay", {"--loop"}},
         {"no such fault: garbage=101", {"--fault", "garbage=101"}},
         {"no such fault: die-after", {"--fault", "die-after"}},
         {"no such fault: refuse-channel=0", {"--fault", "refuse-channel=0"}},
         {"no such fault: null-port=1", {"--fault", "null-port=1"}},
         {"unexpected argument: town", {"town"}},
-        {"koratd: /no/such/capture: No such file or directory\n", {"--replay", "/no/such/capture"}, 1},
-        {"neither a pcap nor a DLF file\n", {"--replay", capture, "--loop"}, 1},
+        {"koratd: /no/such/capture: No such file or directory\n", {"--capture", "/no/such/capture"}, 1},
+        {"neither a pcap nor a DLF file\n", {"--capture", capture}, 1},
         {"koratd: /no/such/file: No such file or directory\n", {"--record", "/no/such/file"}, 1},
         {"koratd: /dev/full: No space left on device\n", {"--record", "/dev/full"}, 1},
     };
@@ -58,10 +55,10 @@ TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
 
     const QString link = QString::fromStdString(folder.path("link"));
     ASSERT_TRUE(QFile::link(capture, link));
-    Program overwriting(folder, KORATD_PATH, {"--replay", capture, "--record", link});
+    Program overwriting(folder, KORATD_PATH, {"--capture", capture, "--record", link});
     EXPECT_EQ(overwriting.waitForEnd(), 2);
     EXPECT_EQ(overwriting.errors(),
-        "koratd: --record " + link.toStdString() + " and --replay " + capture.toStdString()
+        "koratd: --record " + link.toStdString() + " and --capture " + capture.toStdString()
             + " are the same file\n");
     EXPECT_EQ(file.size(), 1000);
     Program help(folder, KORATD_PATH, {"--help"});
@@ -90,6 +87,25 @@ TEST(KoratProcess, StreamsWhatWasAskedForAfterTheStartCommand)
 
     client.send();
     EXPECT_TRUE(waitUntil([&] { return client.codes().size() == 9; }));
+}
+
+TEST(KoratProcess, PlaysItsCaptureAgainAndAgainOrOnce)
+{
+    for (const bool once : {false, true}) {
+        const ProgramFolder folder;
+        const QStringList arguments{"--technology", "IFX", "--rate", "2000"};
+        KoratProgram korat(folder, once ? arguments + QStringList{"--once"} : arguments);
+        KoratClient client(folder.ports());
+        ASSERT_EQ(client.open(), 0);
+        client.send();
+        const std::vector<Bytes> capture = captureOf("IFX");
+        ASSERT_TRUE(waitUntil([&] { return client.messages.size() >= (once ? 1 : 3) * capture.size(); }));
+        turnFor(std::chrono::milliseconds(once ? 200 : 0));
+        for (std::size_t i = 0; i < client.messages.size(); ++i)
+            ASSERT_EQ(client.messages[i], capture[i % capture.size()]);
+        const auto sent = static_cast<std::size_t>(korat.terminateAndCount());
+        EXPECT_TRUE(once ? sent == capture.size() : sent >= 3 * capture.size()) << sent;
+    }
 }
 
 TEST(KoratProcess, ServesOneClientAtATime)

@@ -1,11 +1,9 @@
 #pragma once
 
-#include "scenarios/ScenarioTable.h"
-#include "service/Faults.h"
+#include "Faults.h"
 
 #include <QStringList>
 
-#include <optional>
 #include <string>
 
 namespace orvex::korat {
@@ -13,13 +11,11 @@ namespace orvex::korat {
 // What the command line asks for.
 struct Options {
     std::string technology;
-    const ScenarioEntry* scenario = nullptr; // what is played; none: the capture
-    std::optional<std::string> replay;       // file of the capture to play
-    bool isLooped = false;                   // the capture is played again and again
-    std::optional<std::string> record;       // file of the capture to write of what is streamed
-    std::optional<double> rate;         // messages per second; none: the scenario's or capture's own pace
+    std::string capture;                // file that is played
+    bool once = false;                  // not again and again
+    std::optional<std::string> record;  // pcap file to write of what is streamed
+    std::optional<double> rate;         // messages per second; none: the capture's own pace
     std::optional<std::uint64_t> count; // messages to a client, after which its stream rests
-    std::uint64_t seed = 1;
     Faults faults;
 };
 

@@ -1,7 +1,6 @@
+#include "KoratService.h"
 #include "Options.h"
-
-#include "service/KoratService.h"
-#include "service/Report.h"
+#include "Report.h"
 
 #include "LinuxSystemLog.h"
 #include "Process.h"

@@ -9,7 +9,7 @@ namespace orvex::test {
 namespace {
 
 // An installation depends neither on the source and build trees nor on the place of the first install.
-TEST(InstallationTest, ProgramsFindTheTemplatesBesideThem)
+TEST(InstallationTest, ProgramsFindTemplatesAndCapturesBesideThem)
 {
     const ProgramFolder folder;
     const auto run = [&folder](const std::string& program, const QStringList& arguments) {
@@ -35,6 +35,12 @@ TEST(InstallationTest, ProgramsFindTheTemplatesBesideThem)
         "<plist version=\"1.0\"><dict><key>Place</key><string>moved</string></dict></plist>";
     writeFile(moved + "/share/orvex/LTE.plist", Bytes(list.begin(), list.end()));
     EXPECT_EQ(decoded(), "Orvex\n  Place: moved\n");
+
+    const std::string played = moved + "/share/orvex/captures/MRL_LTE.pcap";
+    EXPECT_TRUE(std::filesystem::remove(played));
+    Program korat(folder, (moved + "/bin/koratd").c_str(), {});
+    EXPECT_EQ(korat.waitForEnd(), 1);
+    EXPECT_EQ(korat.errors(), "koratd: " + played + ": No such file or directory\n");
 }
 
 } // namespace
