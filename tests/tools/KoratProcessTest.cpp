@@ -1,6 +1,5 @@
 // koratd as a program, with clients inside the test.
 
-#include "Captures.h"
 #include "KoratClient.h"
 #include "KoratProgram.h"
 
@@ -87,25 +86,6 @@ TEST(KoratProcess, StreamsWhatWasAskedForAfterTheStartCommand)
 
     client.send();
     EXPECT_TRUE(waitUntil([&] { return client.codes().size() == 9; }));
-}
-
-TEST(KoratProcess, PlaysItsCaptureAgainAndAgainOrOnce)
-{
-    for (const bool once : {false, true}) {
-        const ProgramFolder folder;
-        const QStringList arguments{"--technology", "IFX", "--rate", "2000"};
-        KoratProgram korat(folder, once ? arguments + QStringList{"--once"} : arguments);
-        KoratClient client(folder.ports());
-        ASSERT_EQ(client.open(), 0);
-        client.send();
-        const std::vector<Bytes> capture = captureOf("IFX");
-        ASSERT_TRUE(waitUntil([&] { return client.messages.size() >= (once ? 1 : 3) * capture.size(); }));
-        turnFor(std::chrono::milliseconds(once ? 200 : 0));
-        for (std::size_t i = 0; i < client.messages.size(); ++i)
-            ASSERT_EQ(client.messages[i], capture[i % capture.size()]);
-        const auto sent = static_cast<std::size_t>(korat.terminateAndCount());
-        EXPECT_TRUE(once ? sent == capture.size() : sent >= 3 * capture.size()) << sent;
-    }
 }
 
 TEST(KoratProcess, ServesOneClientAtATime)

@@ -75,6 +75,7 @@ TEST_F(LiveSession, RecordedPlayedAndRecordedAgainItIsTheSame)
             EXPECT_EQ(client.technology(), Value(technology));
             client.send();
             EXPECT_TRUE(waitUntil([&] { return client.messages.size() >= kCount; }, 20s));
+            turnFor(50ms); // in which nothing more comes
             EXPECT_EQ(korat.terminateAndCount(), kCount);
             return client.messages;
         };
