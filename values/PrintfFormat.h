@@ -48,7 +48,7 @@ private:
             ++place;
             if (*place == '%')
                 continue;
-            while (isOneOf(*place, "-+ #0123456789."))
+            while (isOneOf(*place, "-+ 0123456789."))
                 ++place;
             return true;
         }

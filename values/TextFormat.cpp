@@ -1,9 +1,8 @@
 #include "TextFormat.h"
 
-#include "FixedPoint.h"
-
 #include <array>
 #include <charconv>
+#include <cmath>
 #include <cstdio>
 
 namespace orvex {
@@ -17,7 +16,78 @@ void appendDigits(std::string& text, Number number)
     text.append(digits.data(), end);
 }
 
-// By the C library, which knows all that a conversion can ask for.
+// A conversion of a real, from '%' to its letter.
+class RealConversion {
+public:
+    explicit RealConversion(std::string_view conversion)
+        : _letter(conversion.back())
+    {
+        conversion.remove_prefix(1);
+        for (; !conversion.empty(); conversion.remove_prefix(1)) {
+            switch (conversion.front()) {
+            case '-': _isLeft = true; continue;
+            case '0': _hasZeros = true; continue;
+            case '+': _plus = "+"; continue;
+            case ' ': _plus = _plus.empty() ? " " : _plus; continue;
+            default: break;
+            }
+            break;
+        }
+        const char* const end = conversion.data() + conversion.size();
+        const char* const point = std::from_chars(conversion.data(), end, _width).ptr;
+        if (*point == '.') {
+            _precision = 0;
+            std::from_chars(point + 1, end, _precision);
+        }
+    }
+
+    // As printf does it where numbers have a decimal point.
+    void append(std::string& text, double number) const
+    {
+        const std::string_view sign = std::signbit(number) ? "-" : _plus;
+        std::array<char, 352> buffer; // NOLINT(cppcoreguidelines-pro-type-member-init): filled by to_chars
+        std::string longer;
+        char* digits = buffer.data();
+        std::size_t size = buffer.size();
+        constexpr std::size_t kMostWholeDigits = 310;
+        if (_precision > size - kMostWholeDigits) {
+            longer.resize(_precision + kMostWholeDigits);
+            digits = longer.data();
+            size = longer.size();
+        }
+        char* const end =
+            std::to_chars(digits, digits + size, std::fabs(number), format(), static_cast<int>(_precision))
+                .ptr;
+        const std::size_t length = sign.size() + static_cast<std::size_t>(end - digits);
+        const std::size_t padding = _width > length ? _width - length : 0;
+        const bool hasZeros = _hasZeros && !_isLeft && std::isfinite(number);
+        if (!hasZeros && !_isLeft)
+            text.append(padding, ' ');
+        text += sign;
+        if (hasZeros)
+            text.append(padding, '0');
+        text.append(digits, end);
+        if (_isLeft)
+            text.append(padding, ' ');
+    }
+
+private:
+    std::chars_format format() const
+    {
+        return _letter == 'f' ? std::chars_format::fixed
+            : _letter == 'e'  ? std::chars_format::scientific
+                              : std::chars_format::general;
+    }
+
+    char _letter;
+    bool _isLeft = false;
+    bool _hasZeros = false;
+    std::string_view _plus;
+    std::size_t _width = 0;
+    std::size_t _precision = 6;
+};
+
+// By the C library, which knows all that a conversion of anything else can ask for.
 #pragma GCC diagnostic push
 #pragma GCC diagnostic ignored "-Wformat-nonliteral" // PrintfFormat has seen to it
 template <typename T>
@@ -36,7 +106,7 @@ void appendByLibrary(std::string& text, std::string_view conversion, T argument)
 // Behind the letter of the conversion that starts at the '%'.
 const char* endOfConversion(const char* percent)
 {
-    constexpr std::string_view kBeforeLetter = "-+ #0123456789.lz";
+    constexpr std::string_view kBeforeLetter = "-+ 0123456789.lz";
     const char* place = percent + 1;
     while (kBeforeLetter.find(*place) != std::string_view::npos)
         ++place;
@@ -68,12 +138,12 @@ bool PrintfValue::appendPlainly(std::string& text, std::string_view conversion) 
         else
             return false;
         return true;
-    case Kind::real: return appendFixedPoint(text, conversion, _content.real);
     case Kind::text:
         if (conversion != "%s")
             return false;
         text += _content.text ? _content.text : "(null)";
         return true;
+    case Kind::real:
     case Kind::pointer: break;
     }
     return false;
@@ -86,7 +156,7 @@ void PrintfValue::appendTo(std::string& text, std::string_view conversion) const
     switch (_kind) {
     case Kind::number: return appendByLibrary(text, conversion, static_cast<std::int32_t>(_content.bits));
     case Kind::longNumber: return appendByLibrary(text, conversion, static_cast<long>(_content.bits));
-    case Kind::real: return appendByLibrary(text, conversion, _content.real);
+    case Kind::real: return RealConversion(conversion).append(text, _content.real);
     case Kind::text: return appendByLibrary(text, conversion, _content.text);
     case Kind::pointer: return appendByLibrary(text, conversion, _content.pointer);
     }
