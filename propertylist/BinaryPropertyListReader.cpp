@@ -1,14 +1,8 @@
-#include "BinaryPropertyListReader.h"
-
-#include "PropertyListCount.h"
-#include "PropertyListEpoch.h"
-#include "UTF8.h"
+#include "PropertyListReaders.h"
 
 #include "Array.h"
 #include "Dictionary.h"
-
-#include <QString>
-#include <QtEndian>
+#include "UTF8.h"
 
 #include <algorithm>
 #include <bit>
@@ -49,7 +43,7 @@ enum Kind : std::uint8_t {
 
 class Reader {
 public:
-    Reader(std::span<const std::uint8_t> list, const PropertyListLimits& limits)
+    Reader(ByteView list, const PropertyListLimits& limits)
         : _list(list)
         , _count(limits)
     {
@@ -222,18 +216,17 @@ private:
     }
 
     // What is half of a character becomes U+FFFD.
-    static std::string textOfUTF16(std::span<const std::uint8_t> bytes)
+    static std::string textOfUTF16(ByteView bytes)
     {
-        QString characters(static_cast<qsizetype>(bytes.size() / 2), Qt::Uninitialized);
-        qFromBigEndian<char16_t>(bytes.data(), characters.size(), characters.data());
-        std::string text;
-        for (const char32_t character : characters.toStdU32String())
-            appendUTF8(text, character);
-        return text;
+        std::u16string units;
+        units.reserve(bytes.size() / 2);
+        for (std::size_t i = 0; i < bytes.size(); i += 2)
+            units += static_cast<char16_t>(bytes[i] << 8 | bytes[i + 1]);
+        return utf8FromUTF16(units);
     }
 
     // Of a text or data.
-    std::span<const std::uint8_t> bytesOf(const Object& object) const
+    ByteView bytesOf(const Object& object) const
     {
         const std::size_t bytesEach = object.kind == kUTF16 ? 2 : 1;
         requireBytes(object.content, object.size, bytesEach);
@@ -290,7 +283,7 @@ private:
         return result;
     }
 
-    std::span<const std::uint8_t> _list;
+    ByteView _list;
     PropertyListCount _count;
     std::size_t _values = 0;
     std::size_t _memory = 0;
@@ -302,7 +295,7 @@ private:
 };
 } // namespace
 
-Value readBinaryPropertyList(std::span<const std::uint8_t> list, const PropertyListLimits& limits)
+Value readBinaryPropertyList(ByteView list, const PropertyListLimits& limits)
 {
     return Reader(list, limits).run();
 }

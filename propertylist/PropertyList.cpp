@@ -1,8 +1,8 @@
 #include "PropertyList.h"
 
-#include "BinaryPropertyListReader.h"
-#include "PropertyListCount.h"
-#include "XMLPropertyListReader.h"
+#include "PropertyListReaders.h"
+
+#include <utility>
 
 namespace orvex {
 
@@ -11,25 +11,39 @@ PropertyListResult failure(const std::string& why)
 {
     return {std::nullopt, "No property list: " + why};
 }
-} // namespace
 
-PropertyListResult propertyListFromData(std::span<const std::uint8_t> data, const PropertyListLimits& limits)
+// The copy gives the bytes to the reader that overwrites them.
+template <typename Copy>
+PropertyListResult read(ByteView data, const PropertyListLimits& limits, Copy copy)
 {
     if (data.size() > limits.maximumBytes)
         return failure("longer than " + std::to_string(limits.maximumBytes) + " bytes");
     if (data.empty())
         return failure("no data");
-    std::string_view text(reinterpret_cast<const char*>(data.data()), data.size());
     try {
+        const std::string_view text(reinterpret_cast<const char*>(data.data()), data.size());
         if (text.starts_with("bplist"))
             return {readBinaryPropertyList(data, limits), {}};
-        constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
-        if (text.starts_with(kByteOrderMark))
-            text.remove_prefix(kByteOrderMark.size());
-        return {readXMLPropertyList(text, limits), {}};
+        return {readXMLPropertyList(copy(), limits), {}};
     } catch (const PropertyListFault& fault) {
         return failure(fault.what());
     }
+}
+} // namespace
+
+PropertyListResult propertyListFromData(ByteView data, const PropertyListLimits& limits)
+{
+    return read(data, limits, [data] {
+        Bytes bytes;
+        bytes.reserve(data.size() + 2);
+        bytes.assign(data.begin(), data.end());
+        return bytes;
+    });
+}
+
+PropertyListResult propertyListFromData(Bytes&& data, const PropertyListLimits& limits)
+{
+    return read(data, limits, [&data] { return std::move(data); });
 }
 
 } // namespace orvex

@@ -5,7 +5,6 @@
 #include <cstddef>
 #include <functional>
 #include <optional>
-#include <span>
 #include <string>
 #include <string_view>
 
@@ -24,8 +23,9 @@ struct PropertyListResult {
 };
 
 // Reads a property list in its XML or its binary form.
-PropertyListResult propertyListFromData(
-    std::span<const std::uint8_t> data, const PropertyListLimits& limits = {});
+PropertyListResult propertyListFromData(ByteView data, const PropertyListLimits& limits = {});
+// The same without a copy of the XML form, which does not survive.
+PropertyListResult propertyListFromData(Bytes&& data, const PropertyListLimits& limits = {});
 
 // Takes a text piece by piece.
 using TextSink = std::function<void(std::string_view piece)>;

@@ -43,10 +43,41 @@ UTF8Character firstOfUTF8(std::string_view text)
         character = character << 6 | (byte(i) & 0x3FU);
     }
     constexpr char32_t kSmallest[] = {0, 0, 0x80, 0x800, 0x10000}; // smaller ones have a shorter form
-    const bool isSurrogate = character >= 0xD800 && character <= 0xDFFF;
-    if (character < kSmallest[length] || character > 0x10FFFF || isSurrogate)
+    if (character < kSmallest[length] || !isUnicodeCharacter(character))
         return {};
     return {character, length};
+}
+
+std::string utf8FromUTF16(std::u16string_view text)
+{
+    std::string result;
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        char32_t character = text[i];
+        const char32_t next = i + 1 < text.size() ? text[i + 1] : 0;
+        if ((character & 0xFC00U) == 0xD800 && (next & 0xFC00U) == 0xDC00) {
+            character = 0x10000 + ((character & 0x3FFU) << 10 | (next & 0x3FFU));
+            ++i;
+        }
+        appendUTF8(result, isUnicodeCharacter(character) ? character : kReplacementCharacter);
+    }
+    return result;
+}
+
+std::u16string utf16FromUTF8(std::string_view text)
+{
+    std::u16string result;
+    while (!text.empty()) {
+        const auto [first, length] = firstOfUTF8(text);
+        const char32_t character = length > 0 ? first : kReplacementCharacter;
+        if (character >= 0x10000) {
+            result += static_cast<char16_t>(0xD7C0 + (character >> 10)); // 0xD800 less 0x10000 >> 10
+            result += static_cast<char16_t>(0xDC00 | (character & 0x3FFU));
+        } else {
+            result += static_cast<char16_t>(character);
+        }
+        text.remove_prefix(length > 0 ? length : 1);
+    }
+    return result;
 }
 
 } // namespace orvex

@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 namespace orvex {
 
@@ -87,10 +88,10 @@ SnapshotResult readSnapshot(const std::string& path)
 {
     if (isLongAndNoPropertyList(path))
         return failure(path, "not a snapshot: it does not begin like a property list");
-    const auto [bytes, error] = readFile(path, kLimits.maximumBytes);
+    auto [bytes, error] = readFile(path, kLimits.maximumBytes);
     if (!error.empty())
         return failure(path, error);
-    const auto list = propertyListFromData(bytes, kLimits);
+    const auto list = propertyListFromData(std::move(bytes), kLimits);
     if (!list.value)
         return failure(path, "not a snapshot: " + list.error);
     if (const char* fault = faultOf(*list.value))

@@ -2,6 +2,7 @@
 
 #include "Value.h"
 
+#include <string>
 #include <string_view>
 
 namespace orvex {
@@ -14,5 +15,8 @@ using XMLScalarReader = Value (*)(std::string_view content);
 
 // Null when there is no such element.
 XMLScalarReader xmlScalarReader(std::string_view element);
+
+// Appends the bytes in base64, padded.
+void appendBase64(std::string& text, ByteView bytes);
 
 } // namespace orvex

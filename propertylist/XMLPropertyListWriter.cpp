@@ -2,6 +2,7 @@
 
 #include "PropertyList.h"
 
+#include "XMLScalars.h"
 #include "XMLText.h"
 
 #include "Array.h"
@@ -12,7 +13,6 @@
 #include <array>
 #include <charconv>
 #include <cmath>
-#include <span>
 #include <utility>
 #include <vector>
 
@@ -166,7 +166,7 @@ private:
         Bytes line;
         const auto putBase64Line = [&] {
             _buffer.append(tabs, '\t');
-            appendBase64(line);
+            appendBase64(_buffer, line);
             put("\n");
             line.clear();
         };
@@ -182,19 +182,6 @@ private:
         if (!line.empty())
             putBase64Line();
         putLine("</data>\n");
-    }
-
-    void appendBase64(ByteView bytes)
-    {
-        static constexpr char kDigits[] = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
-        for (std::size_t i = 0; i < bytes.size(); i += 3) {
-            const std::size_t count = std::min<std::size_t>(3, bytes.size() - i);
-            std::uint32_t group = 0;
-            for (std::size_t j = 0; j < 3; ++j)
-                group = group << 8 | (j < count ? bytes[i + j] : 0U);
-            for (std::size_t j = 0; j < 4; ++j)
-                _buffer += j <= count ? kDigits[group >> (18 - 6 * j) & 0x3F] : '=';
-        }
     }
 
     void putElement(std::string_view name, std::string_view content)

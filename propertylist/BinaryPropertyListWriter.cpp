@@ -1,15 +1,11 @@
-// Writing binary property lists; BinaryPropertyListReader.h has the layout.
+// Writing binary property lists; PropertyListReaders.h has the layout.
 
-#include "PropertyList.h"
-
-#include "PropertyListEpoch.h"
+#include "PropertyListReaders.h"
 #include "XMLText.h"
 
 #include "Array.h"
 #include "Dictionary.h"
-
-#include <QString>
-#include <QStringDecoder>
+#include "UTF8.h"
 
 #include <algorithm>
 #include <bit>
@@ -105,11 +101,10 @@ private:
             bytes.insert(bytes.end(), characters.begin(), characters.end());
             return;
         }
-        QStringDecoder decoder(QStringDecoder::Utf8, QStringDecoder::Flag::ConvertInitialBom);
-        const QString wide = decoder(QByteArrayView(characters));
-        appendMarker(bytes, 0x6, static_cast<std::size_t>(wide.size()));
-        for (const QChar character : wide)
-            append(bytes, character.unicode(), 2);
+        const std::u16string units = utf16FromUTF8(characters);
+        appendMarker(bytes, 0x6, units.size());
+        for (const char16_t unit : units)
+            append(bytes, unit, 2);
     }
 
     bool fill(std::size_t object, const Value& value)
