@@ -38,7 +38,7 @@ TEST(ClassIndex, KeepsTheLaterOfTwoSectionsOfOneNameAndEverySubscription)
     EXPECT_EQ(index.getAllLogCodes(), std::vector({"16662"s, "16711680"s, "7"s}));
 }
 
-TEST(Base, WritesOnlyIntoAContainerThatIsBoundAlive)
+TEST(Base, WritesOnlyWhileAContainerOfItsKindIsBound)
 {
     ProbeIndex index;
     index.first.updateWithData({}, 7); // nothing is bound

@@ -13,7 +13,7 @@ namespace orvex::test {
 
 using Lines = std::vector<std::string>;
 
-// A generator's surroundings, and the state that generators share.
+// What a generator needs, and the state that generators share.
 class GeneratorFixture : public testing::Test {
 public:
     GeneratorEnvironment environment() const { return {resources, clock, {}}; }

@@ -12,7 +12,7 @@ namespace {
 
 class LogGeneratorTest : public GeneratorFixture { };
 
-TEST_F(LogGeneratorTest, NoneIsMadeForATechnologyThatIsNotNamedToTheLetter)
+TEST_F(LogGeneratorTest, UnknownTechnologyHasNone)
 {
     for (const Value& unknown :
         {Value("MRL_LTE "), Value("mrl_lte"), Value("MRL_UTRAN"), Value(""), Value(), Value(1)})
@@ -20,9 +20,9 @@ TEST_F(LogGeneratorTest, NoneIsMadeForATechnologyThatIsNotNamedToTheLetter)
     EXPECT_NE(LogGenerator::generatorFromTechnology("MRL_LTE", environment()), nullptr);
 }
 
-// What a generator with this many sections says from its birth to its end.
+// Every line that a generator with this many sections logs, from its creation to its destruction.
 template <typename Generator>
-void expectLife(const GeneratorEnvironment& environment, const std::string& name, std::size_t sections)
+void expectLines(const GeneratorEnvironment& environment, const std::string& name, std::size_t sections)
 {
     using testing::StartsWith;
     RecordingLog log;
@@ -40,10 +40,10 @@ void expectLife(const GeneratorEnvironment& environment, const std::string& name
     EXPECT_THAT(console, testing::MatchesRegex("Deallocing (LTE|MRL_GSM)ClassIndexDeallocing ClassIndex"));
 }
 
-TEST_F(LogGeneratorTest, MarlinGeneratorsTellOfTheirBirthAndTheirEnd)
+TEST_F(LogGeneratorTest, MarlinGeneratorsLogTheirCreationAndDestruction)
 {
-    expectLife<LTELogGenerator>(environment(), "LTELogGenerator", 11);
-    expectLife<MRL_GSMLogGenerator>(environment(), "MRL_GSMLogGenerator", 26);
+    expectLines<LTELogGenerator>(environment(), "LTELogGenerator", 11);
+    expectLines<MRL_GSMLogGenerator>(environment(), "MRL_GSMLogGenerator", 26);
 }
 
 TEST_F(LogGeneratorTest, HistoryKeepsTheNewestFive)

@@ -9,7 +9,7 @@
 namespace orvex::test {
 namespace {
 
-// Shows what reached it: the code, and how long the packet was.
+// Shows the code and the length of the packet that it got.
 class ProbeSection final : public Base {
 public:
     ProbeSection(
@@ -44,7 +44,7 @@ public:
     {
         return std::make_unique<MRLLogGenerator2>(environment(), name, std::make_unique<ProbeIndex>());
     }
-    // What is shown after a packet of this code and length, by a generator of its own.
+    // The display after a new generator took the message.
     std::string displayAfter(const char* name, const Bytes& message)
     {
         makeGenerator(name)->updateState(state, message);
@@ -87,7 +87,7 @@ TEST_F(MRLLogGenerator2Test, FramesRoutesAndKeepsMessages)
     }
 }
 
-TEST_F(MRLLogGenerator2Test, BuildsTheDisplayOnceAndAnswersItFromTheSecondCallOn)
+TEST_F(MRLLogGenerator2Test, BuildsTheDisplayOnceAndReturnsItFromTheSecondCallOn)
 {
     const auto generator = makeGenerator("New");
     RecordingLog log;

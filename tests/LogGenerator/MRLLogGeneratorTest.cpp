@@ -80,7 +80,7 @@ TEST_F(MRLLogGeneratorTest, SaveContentsAreTheHistoryAndTheDLF)
     EXPECT_EQ(history->size(), 1U) << "the history itself is left alone";
 }
 
-// The sizes of what each history entry keeps, oldest first.
+// The sizes of the raw packets in each history entry, oldest first.
 std::vector<std::size_t> sizesOf(const Array& history)
 {
     std::vector<std::size_t> sizes;

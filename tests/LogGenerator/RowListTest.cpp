@@ -1,4 +1,4 @@
-// Lists that are written anew into what they held: the result is that of a list made from nothing.
+// A list refilled in place equals one built from scratch.
 
 #include "RowWriter.h"
 
@@ -19,7 +19,7 @@ void fill(const ArrayRef& list, const Records& records)
     }
 }
 
-// In their order, as two dictionaries are equal in any.
+// As text, because the order of rows counts: dictionaries are equal in any order.
 std::string described(const Array& list)
 {
     std::string result;

@@ -17,7 +17,7 @@
 namespace orvex::test {
 
 // Packets for one section, and what it shows in the end: its rows, or the records of its list. Several
-// packets, as packetOfText() reads them, stand apart by ";".
+// packets, as packetOfText() reads them, are separated by ";".
 struct SectionCase {
     const char* section;
     std::string packets;
@@ -25,8 +25,8 @@ struct SectionCase {
     const char* errors = ""; // log lines at error priority, one after the other
 };
 
-// What one byte of a packet makes of one row: "A|B|7=C" are the texts of 0, 1 and 7, all other values have
-// the fallback.
+// The text of one row for each value of one byte: "A|B|7=C" gives those of 0, 1 and 7; all other values
+// show the fallback.
 struct ValueTexts {
     const char* section;
     LogCode code;
@@ -36,7 +36,7 @@ struct ValueTexts {
     const char* fallback = "Unknown";
 };
 
-// Feeds the packets into a container and answers the error lines.
+// Feeds the packets into a container and returns the error lines.
 inline std::string feed(Base& section, const Value& container, const std::vector<Bytes>& packets)
 {
     section.updateSectionRef(container);
@@ -73,7 +73,7 @@ try {
     return {std::string("throws ") + type.get(), "", 0};
 }
 
-// Keeps what sections write to the console from the output of the tests.
+// Keeps the sections' console lines out of the test output.
 struct QuietConsole {
     QuietConsole()
     {

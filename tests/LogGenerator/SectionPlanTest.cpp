@@ -146,7 +146,7 @@ TEST(SectionPlan, ClassIndexAndTemplateNameTheSameSections)
     }
 }
 
-// What a section says of one packet, and whether it changed anything.
+// What a section logs for one packet, and whether it changed anything.
 std::pair<std::vector<std::string>, bool> reactionTo(Base& section, LogCode code, std::size_t length)
 {
     const auto display = Dictionary::make();

@@ -15,7 +15,7 @@
 namespace orvex::test {
 namespace {
 
-// True when a thread of its own can take the lock; it gives it back.
+// True when another thread can take the lock, which it then releases.
 bool isFree()
 {
     std::promise<void> taken;
@@ -30,7 +30,7 @@ bool isFree()
 
 TEST(ArrayLock, NestedHoldsAreUnlockedOnceAtTheLastUnlock)
 {
-    // In a process of its own: a lock held twice stays held, and the thread that waits for it never ends.
+    // In a separate process: a lock held twice stays held, and the thread that waits for it never ends.
     const auto lockAndUnlock = [](int depth) {
         for (int i = 0; i < depth; ++i)
             ArrayLock::lockArray();

@@ -33,7 +33,7 @@ public:
     std::shared_ptr<OrvexModel> newModel()
     {
         auto result = OrvexModel::create({runLoop, telephony, telephony, {resources, clock, "1.0"},
-            [this](const std::string& why) { complaints.push_back(why); }});
+            [this](const std::string& why) { reported.push_back(why); }});
         result->setListener(this);
         return result;
     }
@@ -51,7 +51,7 @@ public:
     FixedClock clock;
     std::shared_ptr<OrvexModel> model;
     int updates = 0;
-    std::vector<std::string> complaints;
+    std::vector<std::string> reported;
 };
 
 TEST_F(OrvexModelTest, StartsTheStreamAndFollowsIt)
@@ -103,7 +103,7 @@ TEST_F(OrvexModelTest, RebuildsTheTreeOnlyAfterSomethingArrived)
     EXPECT_EQ(updates, 2);
 }
 
-TEST_F(OrvexModelTest, FailureIsLoggedAndTriedAgainEveryFiveSeconds)
+TEST_F(OrvexModelTest, FailureIsLoggedAndRetriedEveryFiveSeconds)
 {
     using Status = RemotePort::Status;
     const char* noPorts = "<3>Could not create the ports necessary";
@@ -158,7 +158,7 @@ TEST_F(OrvexModelTest, FailureIsLoggedAndTriedAgainEveryFiveSeconds)
     }
 }
 
-TEST_F(OrvexModelTest, ServiceThatDiesIsNoticedAtTheNextTickAndRestartedAtOnce)
+TEST_F(OrvexModelTest, LostServiceIsNoticedAtTheNextTickAndReopenedAtOnce)
 {
     model->restartMonitor();
     telephony.deliver(kAntennaPacket);
@@ -185,7 +185,7 @@ TEST_F(OrvexModelTest, ServiceThatDiesIsNoticedAtTheNextTickAndRestartedAtOnce)
     EXPECT_EQ(shownAntennas(), "2") << "and go on moving";
 }
 
-TEST_F(OrvexModelTest, InvalidatedLocalPortRestartsAtOnceAndDeliberateShutdownNothing)
+TEST_F(OrvexModelTest, InvalidatedLocalPortRestartsButDeliberateShutdownDoesNot)
 {
     model->restartMonitor();
     const auto port = telephony.localPort;
@@ -202,28 +202,28 @@ TEST_F(OrvexModelTest, InvalidatedLocalPortRestartsAtOnceAndDeliberateShutdownNo
     EXPECT_THAT(log.lines, Not(Contains(testing::HasSubstr("INVALIDATED"))));
 }
 
-TEST_F(OrvexModelTest, MissingTemplateIsComplainedOfAtEachStartAndLoggedForEachMessage)
+TEST_F(OrvexModelTest, MissingTemplateIsReportedAtEachStartAndLoggedForEachMessage)
 {
     const std::string line = "<3>Cannot load template for display";
     const auto laidOut = resources.templates.extract("LTE");
     model->restartMonitor();
     model->restartMonitor();
-    EXPECT_THAT(complaints, ElementsAre("LTE.plist: missing", "LTE.plist: missing"));
+    EXPECT_THAT(reported, ElementsAre("LTE.plist: missing", "LTE.plist: missing"));
     log.take();
     telephony.deliver(kAntennaPacket);
     telephony.deliver(kAntennaPacket);
     EXPECT_THAT(log.take(), testing::IsSupersetOf({line, line}));
-    EXPECT_EQ(complaints.size(), 2U);
+    EXPECT_EQ(reported.size(), 2U);
 
     resources.templates["LTE"] = laidOut.mapped();
     telephony.deliver(kAntennaPacket);
     EXPECT_THAT(log.take(), Not(Contains(line)));
     resources.templates.clear(); // the state keeps what it needs
     model->restartMonitor();
-    EXPECT_EQ(complaints.size(), 2U);
+    EXPECT_EQ(reported.size(), 2U);
 }
 
-TEST_F(OrvexModelTest, WithoutAGeneratorAMessageIsDroppedButCountsAsNews)
+TEST_F(OrvexModelTest, WithoutAGeneratorAMessageIsDroppedButStillRefreshes)
 {
     model->restartMonitor();
     telephony.technology = "none of ours"; // the restart loses the generator

@@ -5,10 +5,8 @@
 
 #include <gtest/gtest.h>
 
-#include <csignal>
 #include <filesystem>
 #include <fstream>
-#include <sys/wait.h>
 #include <unistd.h>
 
 namespace orvex::test {
@@ -54,7 +52,7 @@ TEST_F(SnapshotTest, IsReadAsItWasWritten)
     EXPECT_EQ(reason.find('\n'), std::string::npos);
 }
 
-// A session takes property lists of 64 MiB, nested in 256 containers, and raw messages without end.
+// A session takes property lists of 64 MiB, nested in 256 containers, and any number of raw messages.
 TEST_F(SnapshotTest, LargeAndDeepOnesAreReadAsTheyWereWritten)
 {
     Value deepest = UID{7};
@@ -71,7 +69,7 @@ TEST_F(SnapshotTest, LargeAndDeepOnesAreReadAsTheyWereWritten)
     EXPECT_TRUE(read->description == written.description);
 }
 
-TEST_F(SnapshotTest, SaysWhyAFileIsNone)
+TEST_F(SnapshotTest, SaysWhyAFileIsNotASnapshot)
 {
     const std::string data = "<key>Data</key><array>";
     const std::pair<std::string, const char*> cases[] = {
@@ -91,7 +89,7 @@ TEST_F(SnapshotTest, SaysWhyAFileIsNone)
     EXPECT_EQ(readSnapshot(directory).error, directory + ": Is a directory");
 }
 
-TEST_F(SnapshotTest, TellsWhenItCouldNotBeWritten)
+TEST_F(SnapshotTest, SaysWhyItCouldNotBeWritten)
 {
     Snapshot unwritable = someSnapshot();
     unwritable.data->append(Dictionary::make({{"Display", Value()}}));
@@ -102,33 +100,6 @@ TEST_F(SnapshotTest, TellsWhenItCouldNotBeWritten)
     EXPECT_EQ(writeSnapshot(someSnapshot(), directory + "/gone/x.orvex"),
         directory + "/gone/x.orvex: No such file or directory");
     EXPECT_EQ(writeSnapshot(someSnapshot(), "/dev/full"), "/dev/full: No space left on device");
-}
-
-TEST_F(SnapshotTest, AWriterKilledInTheMiddleLeavesAFileThatTheReaderCopesWith)
-{
-    Snapshot large = someSnapshot();
-    for (int i = 0; i < 20; ++i)
-        large.data->append(Dictionary::make({{"DLF", std::make_shared<Bytes>(50'000)}}));
-    const std::string path = directory + "/killed.orvex";
-    for (int i = 0; i < 20; ++i) {
-        const pid_t child = ::fork();
-        if (child == 0) {
-            for (;;)
-                writeSnapshot(large, path);
-        }
-        ::usleep(static_cast<useconds_t>(5'000 + i * 1'700));
-        ::kill(child, SIGKILL);
-        ::waitpid(child, nullptr, 0);
-        const auto [read, error] = readSnapshot(path);
-        if (read) {
-            EXPECT_TRUE(*read->data == *large.data);
-        } else {
-            EXPECT_TRUE(error.starts_with(path + ": ")) << error;
-            EXPECT_EQ(error.find('\n'), std::string::npos);
-        }
-    }
-    EXPECT_EQ(writeSnapshot(large, path), "") << "the next one takes its place";
-    EXPECT_TRUE(readSnapshot(path).snapshot);
 }
 
 TEST(NumberedRows, NoRowHidesAnother)
@@ -142,7 +113,7 @@ TEST(NumberedRows, NoRowHidesAnother)
     EXPECT_EQ(names, "A;A (3);A (2);A (4);B;A (3) (2);");
 }
 
-TEST(NumberedRows, ManyOfOneNameAreNoWork)
+TEST(NumberedRows, ManyRowsOfOneNameTakeLinearTime)
 {
     NumberedRows rows;
     constexpr std::size_t kMany =

@@ -9,7 +9,7 @@
 
 namespace orvex::test {
 
-// A port that is just there until it is invalidated.
+// A port that is valid until it is invalidated.
 template <typename Interface>
 class FakePort : public Interface {
 public:
@@ -29,7 +29,7 @@ private:
     std::function<void()> _callback;
 };
 
-// Everything that can go wrong with the telephony service. As it comes, nothing does.
+// Faults of the telephony service; by default it has none.
 struct TelephonyFaults {
     bool localPortFails = false;
     bool localPortExists = false;

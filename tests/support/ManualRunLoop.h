@@ -8,7 +8,7 @@
 
 namespace orvex::test {
 
-// A run loop whose time stands still until the test moves it.
+// A run loop whose clock moves only when the test advances it.
 class ManualRunLoop final : public RunLoop {
 public:
     void post(Task task) override { _posted.push_back(std::move(task)); }
@@ -23,7 +23,7 @@ public:
         return timer;
     }
 
-    // Runs what was posted, and what that posts.
+    // Runs what was posted, and what those tasks post.
     void runPosted()
     {
         while (!_posted.empty()) {
@@ -33,7 +33,7 @@ public:
         }
     }
 
-    // Moves time on, running everything that comes due, in its order.
+    // Advances the clock and runs everything that comes due, in order.
     void advance(std::chrono::nanoseconds duration)
     {
         const auto end = _now + duration;

@@ -26,7 +26,7 @@ public:
         lines.push_back(text("<%d>", static_cast<int>(priority)) + std::string(line));
     }
 
-    // The lines so far; the next call starts anew.
+    // Returns the lines since the last call.
     std::vector<std::string> take() { return std::exchange(lines, {}); }
 
     std::vector<std::string> lines;

@@ -8,7 +8,7 @@
 
 namespace orvex::test {
 
-// A file name of the running test's own; what stands under it goes with the object.
+// A file path of the running test's own. The file is removed with the object.
 class TemporaryFile {
 public:
     TemporaryFile()

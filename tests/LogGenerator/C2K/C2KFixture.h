@@ -3,6 +3,7 @@
 #include "C2K/C2KLogGenerator.h"
 #include "C2K/Publisher.h"
 
+#include "FileStorage.h"
 #include "FixedClock.h"
 #include "FixedResources.h"
 #include "PacketText.h"
@@ -13,13 +14,18 @@
 
 namespace orvex::test {
 
-// Every internal key that a decoder publishes.
-inline const std::vector<const char*> kInternalKeys = {"kChannel", "k1xEVDODeviceState", "kBandClass",
-    "kRxAGC0", "kRxAGC1", "kTxAGC", "kServingPNOffset", "kSessionState", "kUATI24", "kColorCode",
-    "kActiveSetPilots", "kFingerC2I", "k1xDeviceState", "k1xRx0BandClass", "k1xRx0ChanNum", "k1xRxAGC0",
-    "k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1", "k1xTxAGC", "k1xActiveSetInfo", "k1xTrafficFER",
-    "k1xRoamingHome", "kSystemId", "kNetworkId", "kPacketZoneId", "kBaseId", "kProtocolRevision",
-    "kFLDataRate", "kRLDataRate"};
+// Every internal key that the template names, as the keys of a lookup.
+inline const Dictionary& internalKeys()
+{
+    static const DictionaryRef kLookup = [] {
+        auto lookup = Dictionary::make();
+        C2KLogGenerator::processTemplate(
+            *FileResources(ORVEX_SOURCE_DIR "/resources").dictionaryNamed("C2KTemplate").dictionary,
+            Dictionary::make(), *lookup);
+        return lookup;
+    }();
+    return *kLookup;
+}
 
 // The generator over a display that has a row for every internal key, under that key's name. Rows appear in
 // the order in which they are first published.
@@ -32,15 +38,15 @@ public:
     }
 
     void clear() { showIn(Dictionary::make()); }
-    void showIn(const DictionaryRef& rows)
+    void showIn(const DictionaryRef& container)
     {
-        display = rows;
+        display = container;
         _lookup = Dictionary::make();
-        for (const char* key : kInternalKeys)
+        for (const auto& [key, rows] : internalKeys())
             Publisher::addRow(*_lookup, key, key, display);
     }
     void feed(const Bytes& packet) { generator.updateFromLog(packet, _lookup, state); }
-    // Of this packet alone, as packetOfText() reads it: all rows, or one.
+    // What this packet alone, as packetOfText() reads it, shows: all rows, or one.
     std::string shownAfter(const std::string& packet)
     {
         clear();
@@ -52,7 +58,7 @@ public:
         shownAfter(packet);
         return display->contains(key) ? shown((*display)[key]) : "(absent)";
     }
-    // What the log says of the packets since the last call.
+    // The log lines since the last call, joined.
     std::string linesNow()
     {
         std::string result;

@@ -9,7 +9,7 @@
 namespace orvex::test {
 namespace {
 
-// What every decoder asks of the length of its packets.
+// The minimum length of each decoder's packets.
 const struct {
     LogCode code;
     std::size_t minimumLength;
@@ -147,7 +147,7 @@ TEST_F(C2KLogGeneratorTest, MissingTemplateIsTriedAgainAtEveryCall)
 TEST_F(C2KLogGeneratorTest, TechnologiesTakeTurnsOnOneState)
 {
     const std::string list = "<plist version=\"1.0\"><dict><key>A</key><string>x</string></dict></plist>";
-    // Each follows each, and itself with the third in between.
+    // Each technology follows each other, and itself with the third in between.
     for (const char turn : std::string_view("CCICOIOCOICI")) {
         SCOPED_TRACE(turn);
         const auto before = state["Display"];

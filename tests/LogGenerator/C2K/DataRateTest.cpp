@@ -26,7 +26,7 @@ struct Link {
 };
 constexpr Link kLinks[] = {{"FL", forward}, {"RL", reverse}};
 
-TEST(DataRate, IsThatSinceThePacketBefore)
+TEST(DataRate, CoversTheTimeSinceThePreviousPacket)
 {
     const struct {
         const char* name;

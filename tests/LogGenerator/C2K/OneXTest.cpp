@@ -66,7 +66,7 @@ TEST(OneXStatus, NeedsItsFourSubpackets)
     }
 }
 
-// A subpacket may claim up to 16 bytes behind the packet. Rows whose field is there stay as they are.
+// A subpacket may claim up to 16 bytes beyond the packet. Only rows whose field is inside are written.
 TEST(OneXStatus, FieldBehindThePacketLeavesItsRow)
 {
     C2KFixture fixture;

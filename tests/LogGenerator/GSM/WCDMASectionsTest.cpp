@@ -103,7 +103,7 @@ TEST(WCDMASections, BlockErrors)
 }
 
 // As an older history entry may hold it.
-TEST(WCDMASections, AListInARowThatSomebodyHoldsIsReplacedNotChanged)
+TEST(WCDMASections, AListInARowIsReplacedWhileSomebodyElseHoldsIt)
 {
     const struct {
         const char* section;
