@@ -68,11 +68,8 @@ RemoteSocketPort::~RemoteSocketPort()
 
 void RemoteSocketPort::invalidate()
 {
-    const bool wasOpen = _socket.isOpen();
     _socket.flush();
     _socket.abort();
-    if (!wasOpen)
-        return;
     // The callback may destroy the port.
     if (const auto callback = std::exchange(_invalidationCallback, {}))
         callback();

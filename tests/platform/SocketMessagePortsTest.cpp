@@ -139,6 +139,7 @@ TEST_F(SocketMessagePortsTest, OneOfManyStartersTakesOverAStaleSocket)
 
     std::ofstream(pathOf("file")) << "not a socket";
     EXPECT_FALSE(ports.createLocalPort("file", collector()).port);
+    EXPECT_THAT(log.take(), ElementsAre(HasSubstr("Message port file: Address already in use")));
     EXPECT_EQ(access(pathOf("file").c_str(), F_OK), 0) << "somebody's file was removed";
 }
 
@@ -152,6 +153,11 @@ TEST_F(SocketMessagePortsTest, RemotePortNoticesThatItsPeerHasGone)
     EXPECT_EQ(busy->send(0, bytesOf("x"), 1s), Status::transportError);
     EXPECT_EQ(busy->send(0, bytesOf("x"), 1s), Status::invalid);
     EXPECT_TRUE(waitUntil([&] { return !idle->isValid(); }));
+    int invalidations = 0;
+    idle->setInvalidationCallback([&] { ++invalidations; });
+    idle->invalidate();
+    idle->invalidate();
+    EXPECT_EQ(invalidations, 1);
 }
 
 TEST_F(SocketMessagePortsTest, ConnectionsLeaveNoDescriptorsOrThreadsBehind)

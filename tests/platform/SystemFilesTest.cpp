@@ -144,13 +144,13 @@ TEST_F(SystemFilesTest, OutputFilesAreTheirUsersAlone)
     for (const auto& test : cases) {
         if (test.takesRoot && !isRoot)
             continue;
-        const auto [file, error] = openOutputFile(path(test.name));
+        auto [file, error] = openOutputFile(path(test.name));
         EXPECT_EQ(error, test.error) << test.name;
         EXPECT_EQ(file != nullptr, error.empty()) << test.name;
         if (!file || !test.written)
             continue;
         std::fputs(test.name, file.get());
-        std::fflush(file.get());
+        file.reset(); // closes it, which writes
         EXPECT_EQ(contentOf(test.written), test.name);
         EXPECT_EQ(fs::status(path(test.written)).permissions(), fs::perms(0600)) << test.name;
     }
