@@ -40,7 +40,7 @@ RowWriter& RowList::next()
     Value& element = nextElement();
     if (!element.ownDictionary())
         element = Dictionary::make();
-    _row = RowWriter::anew(*element.ownDictionary());
+    _row.beginAnew(*element.ownDictionary());
     return _row;
 }
 

@@ -20,13 +20,12 @@ public:
         , _share(std::move(dictionary))
     {
     }
-    // Writes the dictionary anew: after end() it has only the rows set here. It outlives the writer.
-    static RowWriter anew(Dictionary& dictionary)
+    // Begins to write a dictionary anew: after end() it has only the rows set since. It outlives the writer.
+    void beginAnew(Dictionary& dictionary)
     {
-        RowWriter rows;
-        rows._dictionary = &dictionary;
-        rows._isWrittenAnew = true;
-        return rows;
+        _dictionary = &dictionary;
+        _next = 0;
+        _isWrittenAnew = true;
     }
 
     void setText(std::string_view name, const char* text)
