@@ -3,6 +3,7 @@
 #include "LTE/LTELogGenerator.h"
 
 #include "GeneratorFixture.h"
+#include "SectionCases.h"
 #include "SystemLog.h"
 
 #include <gmock/gmock.h>
@@ -12,22 +13,35 @@ namespace {
 
 class LogGeneratorTest : public GeneratorFixture { };
 
-TEST_F(LogGeneratorTest, UnknownTechnologyHasNone)
+TEST_F(LogGeneratorTest, EachTechnologyHasItsGenerator)
 {
+    resources.templates["MRL_UTRAN2"] = Dictionary::make();
+    const std::pair<const char*, int> firstCodes[] = {
+        {"IFX", 0}, {"MRL_GSM", 0x417A}, {"MRL_CDMA", 0x108A}, {"MRL_LTE", 0xB0C2}, {"MRL_UTRAN2", 0xD0E0}};
+    const QuietConsole quiet;
+    for (const auto& [technology, firstCode] : firstCodes) {
+        const auto generator = LogGenerator::generatorFromTechnology(technology, environment());
+        ASSERT_NE(generator, nullptr) << technology;
+        const auto codes = (*generator->getStartCommand())["SetMarlinLogCodes"].array();
+        EXPECT_EQ(codes ? (*codes)[0] : Value(0), Value(firstCode)) << technology;
+    }
+    EXPECT_EQ(technologies().size(), std::size(firstCodes));
     for (const Value& unknown :
         {Value("MRL_LTE "), Value("mrl_lte"), Value("MRL_UTRAN"), Value(""), Value(), Value(1)})
         EXPECT_EQ(LogGenerator::generatorFromTechnology(unknown, environment()), nullptr);
-    EXPECT_NE(LogGenerator::generatorFromTechnology("MRL_LTE", environment()), nullptr);
 }
 
-// Every line that a generator with this many sections logs, from its creation to its destruction.
-template <typename Generator>
-void expectLines(const GeneratorEnvironment& environment, const std::string& name, std::size_t sections)
+// Every line that a generator logs, from its creation to its destruction.
+template <typename Generator, typename Index>
+void expectLines(const GeneratorEnvironment& environment, const std::string& name)
 {
     using testing::StartsWith;
     RecordingLog log;
     std::string console;
     installConsole([&console](std::string_view line) { console += line; });
+    Index();
+    const std::size_t sections = log.take().size();
+    console.clear();
     Generator::generator(environment);
     installConsole({});
     std::vector<testing::Matcher<std::string>> expected(sections, StartsWith("<4>Array Count: "));
@@ -42,8 +56,8 @@ void expectLines(const GeneratorEnvironment& environment, const std::string& nam
 
 TEST_F(LogGeneratorTest, MarlinGeneratorsLogTheirCreationAndDestruction)
 {
-    expectLines<LTELogGenerator>(environment(), "LTELogGenerator", 11);
-    expectLines<MRL_GSMLogGenerator>(environment(), "MRL_GSMLogGenerator", 26);
+    expectLines<LTELogGenerator, LTEClassIndex>(environment(), "LTELogGenerator");
+    expectLines<MRL_GSMLogGenerator, MRL_GSMClassIndex>(environment(), "MRL_GSMLogGenerator");
 }
 
 TEST_F(LogGeneratorTest, HistoryKeepsTheNewestFive)

@@ -141,8 +141,10 @@ TEST(SectionPlan, ClassIndexAndTemplateNameTheSameSections)
         }
         EXPECT_EQ(laidOut, planned) << templateName;
         EXPECT_EQ(index->getAllLogCodes().size(), wanted.size());
-        for (const auto& [code, sections] : wanted)
+        for (const auto& [code, sections] : wanted) {
+            ASSERT_NE(index->getSubscribers(code), nullptr) << code;
             EXPECT_TRUE(std::ranges::equal(*index->getSubscribers(code), sections)) << code;
+        }
     }
 }
 

@@ -70,13 +70,13 @@ TEST(LTESections, ServingCellMeasurements)
     expectShown<LTEClassIndex>({
         {name,
             "B17F: 85 00*3 9C98 9:501 4:13 3:7 9:280 9:279 7:81 7:77 9:407 6:37 7:117 6:53 4:15 7:101 6:33 "
-            "6:49 6:37 1:1 4:9 2:3",
+            "6:49 6:37 1:1 4:10 2:3",
             "Version=133, E-ARFCN=39068, Physical Cell ID=501, Serving Layer Priority=13, "
             "Measured RSRP=-70.00 dBm, Average RSRP=-70.25 dBm, Measured RSRQ=-9.75 dB, "
             "Average RSRQ=-10.75 dB, Measured RSSI=63.50 dBm, Qrxlevmin=-66 dBm, P_Max=87 dBm, "
             "Max UE Tx Power=23 dBm, Srxlev=71 dBm, Num of Consecutive DRX Cycles of S < 0=33, "
             "S Intra Search=98 dB, S Non Intra Search=74 dBm, Measurement Rules Updated=True, "
-            "Measurement Rules=9"},
+            "Measurement Rules=10"},
         {name, "B17F: 00*6 63:0 7:64 23:0 6:32 6:32 7:0",
             "Version=0, E-ARFCN=0, Physical Cell ID=0, Serving Layer Priority=0, "
             "Measured RSRP=-140.00 dBm, Average RSRP=-140.00 dBm, Measured RSRQ=-30.00 dB, "
