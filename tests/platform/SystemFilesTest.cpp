@@ -59,7 +59,7 @@ TEST_F(SystemFilesTest, ResourcesAreReadEachTimeAndTheCallerLearnsOfFaults)
     EXPECT_EQ(*resources.dictionaryNamed("good").dictionary, Dictionary({{"k", 2}}));
     EXPECT_EQ(resources.dictionaryNamed("good").error, "");
     const std::pair<const char*, const char*> faults[] = {
-        {"missing", ": No such file"}, {"array", ": it holds no dictionary but: array"}, {"cut", "dict"}};
+        {"missing", ": No such file"}, {"array", ": it holds no dictionary but: array"}, {"cut", "malformed XML"}};
     for (const auto& [name, why] : faults) {
         const auto [dictionary, error] = resources.dictionaryNamed(name);
         EXPECT_FALSE(dictionary);
