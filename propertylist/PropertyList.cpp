@@ -33,12 +33,7 @@ PropertyListResult read(ByteView data, const PropertyListLimits& limits, Copy co
 
 PropertyListResult propertyListFromData(ByteView data, const PropertyListLimits& limits)
 {
-    return read(data, limits, [data] {
-        Bytes bytes;
-        bytes.reserve(data.size() + 2);
-        bytes.assign(data.begin(), data.end());
-        return bytes;
-    });
+    return read(data, limits, [data] { return Bytes(data.begin(), data.end()); });
 }
 
 PropertyListResult propertyListFromData(Bytes&& data, const PropertyListLimits& limits)

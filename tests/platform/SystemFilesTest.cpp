@@ -58,8 +58,8 @@ TEST_F(SystemFilesTest, ResourcesAreReadEachTimeAndTheCallerLearnsOfFaults)
     write("good.plist", test::xmlList("<dict><key>k</key><integer>2</integer></dict>"));
     EXPECT_EQ(*resources.dictionaryNamed("good").dictionary, Dictionary({{"k", 2}}));
     EXPECT_EQ(resources.dictionaryNamed("good").error, "");
-    const std::pair<const char*, const char*> faults[] = {
-        {"missing", ": No such file"}, {"array", ": it holds no dictionary but: array"}, {"cut", "malformed XML"}};
+    const std::pair<const char*, const char*> faults[] = {{"missing", ": No such file"},
+        {"array", ": it holds no dictionary but: array"}, {"cut", "malformed XML"}};
     for (const auto& [name, why] : faults) {
         const auto [dictionary, error] = resources.dictionaryNamed(name);
         EXPECT_FALSE(dictionary);
