@@ -2,6 +2,7 @@
 
 #include "PropertyListReaders.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace orvex {
@@ -33,12 +34,20 @@ PropertyListResult read(ByteView data, const PropertyListLimits& limits, Copy co
 
 PropertyListResult propertyListFromData(ByteView data, const PropertyListLimits& limits)
 {
-    return read(data, limits, [data] { return Bytes(data.begin(), data.end()); });
+    return read(data, limits, [data] {
+        Bytes copy(data.size() + kXMLPadding.size());
+        std::ranges::copy(data, copy.begin());
+        std::ranges::copy(kXMLPadding, copy.end() - kXMLPadding.size());
+        return copy;
+    });
 }
 
 PropertyListResult propertyListFromData(Bytes&& data, const PropertyListLimits& limits)
 {
-    return read(data, limits, [&data] { return std::move(data); });
+    return read(data, limits, [&data] {
+        data.insert(data.end(), kXMLPadding.begin(), kXMLPadding.end());
+        return std::move(data);
+    });
 }
 
 } // namespace orvex

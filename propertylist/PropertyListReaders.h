@@ -5,6 +5,7 @@
 #include <span>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 
 namespace orvex {
 
@@ -61,8 +62,10 @@ private:
 // elements, one value in <plist>, keys and values in turn, numbers, dates and data that can be read. A
 // document type may not declare anything, so no entity grows. Of two entries with one key the last counts.
 //
-// The parser overwrites the list. It needs two bytes behind it: a list with room for them is not copied.
-Value readXMLPropertyList(Bytes&& list, const PropertyListLimits& limits);
+// The parser overwrites the list, which ends with kXMLPadding: it puts a zero in the place of the last byte
+// and overlooks a '<' before that.
+inline constexpr std::string_view kXMLPadding = "\n\n";
+Value readXMLPropertyList(Bytes&& paddedList, const PropertyListLimits& limits);
 
 // Reads the binary form. Throws PropertyListFault unless every object that the root reaches lies inside the
 // list and the tree keeps the limits. An object may be referred to many times; each time it becomes a value

@@ -9,6 +9,7 @@
 #include <pugixml.hpp>
 
 #include <algorithm>
+#include <cstdint>
 #include <string_view>
 #include <utility>
 
@@ -27,9 +28,17 @@ bool isBlank(std::string_view text)
 void requireFewTags(std::string_view text, const PropertyListLimits& limits)
 {
     constexpr std::size_t kOthers = 1000; // than values: <plist>, comments, the version
+    constexpr std::size_t kBlock = 255;   // as many as a byte can count, so that the compiler uses vectors
     std::size_t count = 0;
-    for (std::size_t i = 1; i < text.size(); ++i)
-        count += (text[i - 1] == '<' && text[i] != '/') || text[i] == '=' ? 1U : 0U;
+    for (std::size_t start = 1; start < text.size(); start += kBlock) {
+        std::uint8_t inBlock = 0;
+        const std::size_t end = std::min(start + kBlock, text.size());
+        for (std::size_t i = start; i < end; ++i) {
+            const bool isTag = (text[i - 1] == '<') & (text[i] != '/');
+            inBlock = static_cast<std::uint8_t>(inBlock + (isTag | (text[i] == '=')));
+        }
+        count += inBlock;
+    }
     if (count > limits.maximumNodes + kOthers)
         throw PropertyListCount::tooManyNodes(limits);
 }
@@ -207,17 +216,15 @@ private:
 };
 } // namespace
 
-Value readXMLPropertyList(Bytes&& list, const PropertyListLimits& limits)
+Value readXMLPropertyList(Bytes&& paddedList, const PropertyListLimits& limits)
 {
-    // The parser puts a zero in the place of the last character, and overlooks a '<' before that.
-    list.insert(list.end(), 2, '\n');
-    const std::string_view text(reinterpret_cast<const char*>(list.data()), list.size());
+    const std::string_view text(reinterpret_cast<const char*>(paddedList.data()), paddedList.size());
     if (text.find('\0') != std::string_view::npos)
         throw Fault("a zero byte in the text");
     requireFewTags(text, limits);
     pugi::xml_document document;
-    const auto parsed =
-        document.load_buffer_inplace(list.data(), list.size(), parserOptions(text), pugi::encoding_utf8);
+    const auto parsed = document.load_buffer_inplace(
+        paddedList.data(), paddedList.size(), parserOptions(text), pugi::encoding_utf8);
     if (!parsed)
         throw Fault("malformed XML at byte " + std::to_string(parsed.offset) + ", " + parsed.description());
     return Reader(limits).valueOf(document);
