@@ -28,6 +28,17 @@ DictionaryRef entryEndingAtFirstAbsent(std::initializer_list<Dictionary::Entry> 
     }
     return result;
 }
+
+constexpr struct {
+    const char* technology;
+    std::unique_ptr<LogGenerator> (*generator)(const GeneratorEnvironment& environment);
+} kGenerators[] = {
+    {telephony::kTechnologyIFX, &GSMLogGenerator::generator},
+    {telephony::kTechnologyMRL_GSM, &MRL_GSMLogGenerator::generator},
+    {telephony::kTechnologyMRL_CDMA, &C2KLogGenerator::generator},
+    {telephony::kTechnologyMRL_LTE, &LTELogGenerator::generator},
+    {telephony::kTechnologyMRL_UTRAN2, &UTRANLogGenerator::generator},
+};
 } // namespace
 
 LogGenerator::LogGenerator(const GeneratorEnvironment& environment)
@@ -36,24 +47,12 @@ LogGenerator::LogGenerator(const GeneratorEnvironment& environment)
     systemLog(Priority::warning, "Creating Log object: %p", static_cast<const void*>(this));
 }
 
-std::span<const Technology> technologies()
-{
-    static constexpr Technology kTechnologies[] = {
-        {telephony::kTechnologyIFX, &GSMLogGenerator::generator},
-        {telephony::kTechnologyMRL_GSM, &MRL_GSMLogGenerator::generator},
-        {telephony::kTechnologyMRL_CDMA, &C2KLogGenerator::generator},
-        {telephony::kTechnologyMRL_LTE, &LTELogGenerator::generator},
-        {telephony::kTechnologyMRL_UTRAN2, &UTRANLogGenerator::generator},
-    };
-    return kTechnologies;
-}
-
 std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(
     const Value& technology, const GeneratorEnvironment& environment)
 {
-    for (const Technology& each : technologies()) {
-        if (technology == Value(each.identifier))
-            return each.generator(environment);
+    for (const auto& [identifier, generator] : kGenerators) {
+        if (technology == Value(identifier))
+            return generator(environment);
     }
     return nullptr;
 }

@@ -80,13 +80,4 @@ private:
     GeneratorEnvironment _environment;
 };
 
-// A log technology: the identifier by which the telephony service names it, and what makes its generator.
-struct Technology {
-    const char* identifier;
-    std::unique_ptr<LogGenerator> (*generator)(const GeneratorEnvironment& environment);
-};
-
-// All technologies that Orvex decodes.
-std::span<const Technology> technologies();
-
 } // namespace orvex

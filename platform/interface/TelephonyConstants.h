@@ -13,6 +13,8 @@ inline constexpr const char* kTechnologyMRL_GSM = "MRL_GSM";
 inline constexpr const char* kTechnologyMRL_CDMA = "MRL_CDMA";
 inline constexpr const char* kTechnologyMRL_LTE = "MRL_LTE";
 inline constexpr const char* kTechnologyMRL_UTRAN2 = "MRL_UTRAN2";
+inline constexpr const char* kTechnologies[] = {
+    kTechnologyIFX, kTechnologyMRL_GSM, kTechnologyMRL_CDMA, kTechnologyMRL_LTE, kTechnologyMRL_UTRAN2};
 
 // Log channel commands.
 inline constexpr const char* kGetTechnology = "GetTechnology";

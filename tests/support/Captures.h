@@ -9,10 +9,9 @@
 
 namespace orvex::test {
 
-inline constexpr const char* kTechnologies[] = {telephony::kTechnologyMRL_GSM, telephony::kTechnologyMRL_CDMA,
-    telephony::kTechnologyMRL_LTE, telephony::kTechnologyMRL_UTRAN2, telephony::kTechnologyIFX};
+using telephony::kTechnologies;
 
-// Where the drive of a technology lies that koratd plays by default.
+// The capture that koratd plays by default.
 inline std::string capturePath(const std::string& technology)
 {
     return ORVEX_CAPTURES "/" + technology + ".pcap";

@@ -30,16 +30,15 @@ TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
         QStringList arguments;
         int status = 2;
     } cases[] = {
-        {R"(unknown technology "MRL_NOISE"; known are: MRL_GSM, MRL_LTE, MRL_UTRAN2, MRL_CDMA, IFX)",
-            {"--technology", "MRL_NOISE"}},
+        {"Unknown technology 'MRL_NOISE'.", {"--technology", "MRL_NOISE"}},
         {"--rate takes a number", {"--rate", "0"}},
         {"--count takes a number", {"--count", "-1"}},
         {"--count is given more than once", {"--count", "1", "--count", "2"}},
-        {"no such fault: garbage=101", {"--fault", "garbage=101"}},
-        {"no such fault: die-after", {"--fault", "die-after"}},
-        {"no such fault: refuse-channel=0", {"--fault", "refuse-channel=0"}},
-        {"no such fault: null-port=1", {"--fault", "null-port=1"}},
-        {"unexpected argument: town", {"town"}},
+        {"Unknown fault 'garbage=101'.", {"--fault", "garbage=101"}},
+        {"Unknown fault 'die-after'.", {"--fault", "die-after"}},
+        {"Unknown fault 'refuse-channel=0'.", {"--fault", "refuse-channel=0"}},
+        {"Unknown fault 'null-port=1'.", {"--fault", "null-port=1"}},
+        {"Unexpected argument 'town'.", {"town"}},
         {"koratd: /no/such/capture: No such file or directory\n", {"--capture", "/no/such/capture"}, 1},
         {"neither a pcap nor a DLF file\n", {"--capture", capture}, 1},
         {"koratd: /no/such/file: No such file or directory\n", {"--record", "/no/such/file"}, 1},
@@ -49,7 +48,7 @@ TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
         Program korat(folder, KORATD_PATH, arguments);
         EXPECT_EQ(korat.waitForEnd(), status) << complaint;
         EXPECT_THAT(korat.errors(), HasSubstr(complaint));
-        EXPECT_EQ(korat.errors().find("Usage:") != std::string::npos, status == 2) << complaint;
+        EXPECT_EQ(korat.errors().find("Try 'koratd --help'.") != std::string::npos, status == 2) << complaint;
     }
 
     const QString link = QString::fromStdString(folder.path("link"));

@@ -2,12 +2,10 @@
 
 #include "FileConflict.h"
 #include "FileStorage.h"
-#include "Process.h"
 #include "TelephonyConstants.h"
 
-#include <QCommandLineParser>
-
 #include <algorithm>
+#include <charconv>
 #include <filesystem>
 
 namespace orvex::korat {
@@ -15,124 +13,95 @@ namespace orvex::korat {
 namespace {
 constexpr double kLargestRate = 1e6;
 
-constexpr const char* kTechnologies[] = {telephony::kTechnologyMRL_GSM, telephony::kTechnologyMRL_LTE,
-    telephony::kTechnologyMRL_UTRAN2, telephony::kTechnologyMRL_CDMA, telephony::kTechnologyIFX};
-
-std::string knownTechnologies()
+CommandLine::Program program()
 {
-    std::string result;
-    for (const char* technology : kTechnologies)
-        result += (result.empty() ? "" : ", ") + std::string(technology);
-    return result;
+    return {
+        .name = "koratd",
+        .summary =
+            "Stands in for a handset's telephony service: opens a log channel for a monitor and streams "
+            "the messages of a capture to it.",
+        .options =
+            {
+                {"technology",
+                    "Log technology: IFX, MRL_GSM, MRL_CDMA, MRL_LTE or MRL_UTRAN2. Default: MRL_LTE.", "T"},
+                {"capture",
+                    "Play this pcap or DLF file, again and again. Default: the technology's own, T.pcap.",
+                    "FILE"},
+                {"once", "Stop after playing the capture once."},
+                {"rate", "Send N messages per second. Default: the capture's own pace.", "N"},
+                {"count", "Stop after N messages per client.", "N"},
+                {"record", "Write what is sent to a pcap file, at the capture's own pace.", "FILE"},
+                {"fault",
+                    "Misbehave: refuse-channel=CODE, null-port, no-reply, bad-reply, unknown-technology, "
+                    "die-after=SECONDS or garbage=PERCENT. Repeatable.",
+                    "F", true},
+            },
+    };
 }
 
-std::optional<double> rate(const QString& text)
+// A whole number or a decimal one; none for anything else.
+template <typename Number>
+std::optional<Number> number(const std::string& text)
 {
-    bool isNumber = false;
-    const double value = text.toDouble(&isNumber);
-    return isNumber && value > 0 && value <= kLargestRate ? std::optional(value) : std::nullopt;
+    Number result = 0;
+    const char* const end = text.data() + text.size();
+    const auto [stop, error] = std::from_chars(text.data(), end, result);
+    return error == std::errc() && stop == end ? std::optional(result) : std::nullopt;
 }
 
-std::optional<std::uint64_t> count(const QString& text)
-{
-    bool isNumber = false;
-    const qulonglong value = text.toULongLong(&isNumber);
-    return isNumber ? std::optional<std::uint64_t>(value) : std::nullopt;
-}
-
-std::optional<std::string> file(const QCommandLineParser& parser, const char* option)
-{
-    return parser.isSet(option) ? std::optional(argumentBytes(parser.value(option))) : std::nullopt;
-}
-
-// In the source tree, captures/ lies where share/orvex/captures/ lies in an installation.
+// captures/ is in share/orvex when installed, and at the top of the source tree.
 std::string defaultCapture(const std::string& technology)
 {
     return std::filesystem::path(FileResources::dataDirectory(".")) / "captures" / (technology + ".pcap");
 }
 
-// The options as they stand; the error is empty when all of them make sense.
-std::string read(const QCommandLineParser& parser, Options& options)
+// Returns what is wrong; empty if nothing is.
+std::string read(const CommandLine& line, Options& options)
 {
-    for (const char* option : {"technology", "capture", "record", "rate", "count"}) {
-        if (parser.values(option).size() > 1)
-            return std::string("--") + option + " is given more than once";
+    options.technology = line.value("technology").value_or(telephony::kTechnologyMRL_LTE);
+    if (std::ranges::find(telephony::kTechnologies, options.technology) == std::end(telephony::kTechnologies))
+        return "Unknown technology '" + options.technology + "'.";
+    options.capture = line.value("capture").value_or(defaultCapture(options.technology));
+    options.once = line.isSet("once");
+    options.record = line.value("record");
+    if (const auto rate = line.value("rate")) {
+        options.rate = number<double>(*rate);
+        if (!options.rate || !(*options.rate > 0) || *options.rate > kLargestRate)
+            return "--rate takes a number of messages per second above 0 and up to 1000000.";
     }
-    options.technology = argumentBytes(parser.value("technology"));
-    if (std::ranges::find(kTechnologies, options.technology) == std::end(kTechnologies))
-        return "unknown technology \"" + options.technology + "\"; known are: " + knownTechnologies();
-    options.capture = file(parser, "capture").value_or(defaultCapture(options.technology));
-    options.record = file(parser, "record");
-    options.once = parser.isSet("once");
-    if (parser.isSet("rate")) {
-        options.rate = rate(parser.value("rate"));
-        if (!options.rate)
-            return "--rate takes a number of messages per second above 0 and up to 1000000";
-    }
-    if (parser.isSet("count")) {
-        options.count = count(parser.value("count"));
+    if (const auto count = line.value("count")) {
+        options.count = number<std::uint64_t>(*count);
         if (!options.count)
-            return "--count takes a number of messages";
+            return "--count takes a number of messages.";
     }
-    for (const QString& fault : parser.values("fault")) {
-        if (!options.faults.add(argumentBytes(fault)))
-            return "no such fault: " + argumentBytes(fault);
+    for (const std::string& fault : line.values("fault")) {
+        if (!options.faults.add(fault))
+            return "Unknown fault '" + fault + "'.";
     }
-    if (!parser.positionalArguments().isEmpty())
-        return "unexpected argument: " + argumentBytes(parser.positionalArguments().first());
     return {};
+}
+
+// A conflict of files needs no usage: its line names both.
+std::string conflictIn(const Options& options)
+{
+    if (!options.record)
+        return {};
+    return fileConflict({{"--capture " + options.capture, options.capture}},
+        {{"--record " + *options.record, *options.record}});
 }
 } // namespace
 
-OptionsResult optionsFromArguments(const QStringList& arguments)
+Options Options::parse(int count, const char* const* arguments)
 {
-    QCommandLineParser parser;
-    parser.setApplicationDescription(
-        "Stands in for a handset's telephony service: opens a log channel to a monitor and streams the log "
-        "messages of a capture to it.");
-    parser.addOptions({
-        {{"h", "help"}, "Show this help."},
-        {{"v", "version"}, "Show the version."},
-        {"technology",
-            QString::fromStdString("Log technology (default: MRL_LTE): " + knownTechnologies() + "."), "T",
-            "MRL_LTE"},
-        {"capture",
-            "Play this capture, pcap or DLF, again and again (default: the technology's own, T.pcap).",
-            "FILE"},
-        {"once", "Play the capture once, then rest."},
-        {"record", "Write what is streamed into a pcap file, at the capture's own pace.", "FILE"},
-        {"rate", "Stream this many messages per second instead of at the capture's own pace.",
-            "MESSAGES_PER_SECOND"},
-        {"count", "Rest after this many messages to a client.", "N"},
-        {"fault",
-            "Misbehave; may be given repeatedly: refuse-channel=CODE, null-port, no-reply, bad-reply, "
-            "unknown-technology, die-after=SECONDS, garbage=PERCENT.",
-            "F"},
-    });
-    OptionsResult result;
-    if (!parser.parse(arguments)) {
-        result.error = argumentBytes(parser.errorText());
-    } else if (parser.isSet("help")) {
-        result.text = parser.helpText().toStdString();
+    Options result;
+    CommandLine line(program());
+    result.earlyExit = line.parse(count, arguments);
+    if (result.earlyExit)
         return result;
-    } else if (parser.isSet("version")) {
-        result.text = "koratd " ORVEX_VERSION "\n";
-        return result;
-    } else {
-        Options options;
-        result.error = read(parser, options);
-        if (result.error.empty()) {
-            const auto files = options.record
-                ? std::vector<FileInUse>{{"--record " + *options.record, *options.record}}
-                : std::vector<FileInUse>();
-            result.error = fileConflict({{"--capture " + options.capture, options.capture}}, files);
-            if (result.error.empty())
-                result.options = options;
-            return result;
-        }
-    }
-    if (!result.options)
-        result.text = parser.helpText().toStdString();
+    if (const std::string error = read(line, result); !error.empty())
+        result.earlyExit = line.wrongUsage(error);
+    else if (const std::string conflict = conflictIn(result); !conflict.empty())
+        result.earlyExit = {CommandLine::kWrongUsage, "koratd: " + conflict + "\n"};
     return result;
 }
 

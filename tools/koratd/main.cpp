@@ -1,6 +1,5 @@
 #include "KoratService.h"
 #include "Options.h"
-#include "Report.h"
 
 #include "LinuxSystemLog.h"
 #include "Process.h"
@@ -10,11 +9,9 @@
 #include <QCoreApplication>
 
 #include <csignal>
-#include <cstdio>
+#include <cstdlib>
 
 namespace {
-constexpr int kWrongUsage = 2;
-
 int serve(const orvex::korat::Options& options)
 {
     using namespace orvex;
@@ -33,23 +30,17 @@ int serve(const orvex::korat::Options& options)
 int main(int argc, char** argv)
 {
     orvex::occupyStandardStreams();
+    const auto options = orvex::korat::Options::parse(argc, argv);
+    if (options.earlyExit)
+        return options.earlyExit->print();
+
     std::signal(SIGPIPE, SIG_IGN); // a reader of its lines that goes does not end the service
     const QCoreApplication application(argc, argv);
     const auto log = orvex::makeLinuxSystemLog("koratd");
     orvex::SystemLog::install(log.get());
     orvex::installFatalErrorHandler();
 
-    const auto result = orvex::korat::optionsFromArguments(orvex::argumentTexts(argc, argv));
-    int status = EXIT_SUCCESS;
-    if (result.options) {
-        status = serve(*result.options);
-    } else if (result.error.empty()) {
-        std::fputs(result.text.c_str(), stdout);
-    } else {
-        orvex::korat::report("%s", result.error.c_str());
-        std::fputs(result.text.c_str(), stderr);
-        status = kWrongUsage;
-    }
+    const int status = serve(options);
     orvex::SystemLog::install(nullptr);
     log->flush();
     return status;

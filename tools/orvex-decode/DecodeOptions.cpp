@@ -1,7 +1,7 @@
 #include "DecodeOptions.h"
 
-#include "LogGenerator.h"
 #include "RegularFile.h"
+#include "TelephonyConstants.h"
 
 #include <algorithm>
 #include <array>
@@ -80,8 +80,8 @@ std::string read(const CommandLine& line, DecodeOptions& options)
     if (options.technology.empty() && !options.areSnapshots)
         return "--technology is required for captures.";
     if (!options.technology.empty()
-        && std::ranges::find(technologies(), options.technology, &Technology::identifier)
-            == technologies().end())
+        && std::ranges::find(telephony::kTechnologies, options.technology)
+            == std::end(telephony::kTechnologies))
         return "Unknown technology '" + options.technology + "'.";
 
     const std::string format = line.value("format").value_or("tree");
