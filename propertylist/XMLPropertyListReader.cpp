@@ -34,8 +34,10 @@ void requireFewTags(std::string_view text, const PropertyListLimits& limits)
         std::uint8_t inBlock = 0;
         const std::size_t end = std::min(start + kBlock, text.size());
         for (std::size_t i = start; i < end; ++i) {
-            const bool isTag = (text[i - 1] == '<') & (text[i] != '/');
-            inBlock = static_cast<std::uint8_t>(inBlock + (isTag | (text[i] == '=')));
+            // Operators that evaluate both sides, as vectors do.
+            const unsigned opens =
+                static_cast<unsigned>(text[i - 1] == '<') & static_cast<unsigned>(text[i] != '/');
+            inBlock = static_cast<std::uint8_t>(inBlock + (opens | static_cast<unsigned>(text[i] == '=')));
         }
         count += inBlock;
     }
