@@ -25,7 +25,7 @@ std::string_view nameIn(std::string_view assignment)
     return assignment.substr(0, assignment.find('='));
 }
 
-// Null-terminated, as the system wants them. The texts outlive it.
+// A null-terminated vector for execve(). The texts must outlive it.
 std::vector<char*> pointersTo(const std::vector<std::string>& texts)
 {
     std::vector<char*> pointers;
@@ -36,8 +36,8 @@ std::vector<char*> pointersTo(const std::vector<std::string>& texts)
     return pointers;
 }
 
-// The peak so far. What the system keeps for the parent is of no use: it counts the time before the program
-// was loaded too, when the child still had its parent's memory.
+// Peak memory so far. The rusage that wait4() returns is of no use: it includes the time before exec, when
+// the child still had its parent's memory.
 std::size_t peakKiBOf(pid_t process)
 {
     std::ifstream status("/proc/" + std::to_string(process) + "/status");

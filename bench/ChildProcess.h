@@ -8,28 +8,28 @@
 
 namespace orvex::bench {
 
-// A program that runs beside the benchmark: standard output comes here, standard error goes where ours goes
-// unless it is of no interest.
+// A program that runs beside the benchmark. Its standard output is read here; its standard error is inherited
+// or dropped.
 class ChildProcess {
 public:
-    using Environment = std::vector<std::string>; // "NAME=VALUE", in place of ours or beside it
+    using Environment = std::vector<std::string>; // "NAME=VALUE", added or overriding
 
     enum class Errors { shown, dropped };
 
-    // Throws std::runtime_error when it cannot be started.
+    // Throws std::runtime_error if it cannot be started.
     explicit ChildProcess(const std::vector<std::string>& arguments, const Environment& environment = {},
         Errors errors = Errors::shown);
-    // Ends it.
+    // Kills it.
     ~ChildProcess();
     ChildProcess(const ChildProcess&) = delete;
     ChildProcess& operator=(const ChildProcess&) = delete;
 
-    // Waits until it has written something, for 30 seconds at most. False when it ended before, or did not.
+    // Waits up to 30 seconds for output. False if it ended first or wrote nothing.
     bool waitForOutput() const;
 
     struct End {
         bool isGood;         // exit status 0
-        std::size_t peakKiB; // the most memory that it held
+        std::size_t peakKiB; // peak memory
     };
     End waitForEnd();
 

@@ -1,6 +1,6 @@
-// How fast recorded streams are decoded: while nobody reads the system log, and with the log on, which gets a
-// line for every section and packet. Then it goes through the file that orvex-decode --log writes, or through
-// the queue of the application's log; both end in /dev/null, so that the figures are ours and not a disk's.
+// Measures how fast recorded streams are decoded, with the system log off and on. A log gets a line for every
+// section and packet, through the file writer of orvex-decode --log or through the application's queue. Both
+// write to /dev/null, so that no disk is measured.
 
 #include "Benchmarks.h"
 
@@ -20,8 +20,8 @@ constexpr std::size_t kMessagesPerRefresh = 4'000; // two seconds of a busy mode
 constexpr std::size_t kOnceAtTheEnd = std::numeric_limits<std::size_t>::max();
 constexpr const char* kNowhere = "/dev/null";
 
-// Decodes the messages in every iteration, with this system log. The display, which hands over the raw
-// packets, is asked for after so many messages, or once at the end.
+// Decodes the messages in every iteration, with this system log. Asks for the display, which releases the raw
+// packets, after a number of messages or once at the end.
 void decodeInto(SystemLog& log, benchmark::State& state, const Technology& technology,
     const std::vector<Bytes>& messages, std::size_t messagesPerRefresh)
 {
@@ -44,7 +44,7 @@ void decodeInto(SystemLog& log, benchmark::State& state, const Technology& techn
     SystemLog::install(nullptr);
 }
 
-// A log that nobody reads.
+// A log without a reader.
 class DroppingLog final : public SystemLog {
 public:
     void write(Priority, std::string_view) override { }
@@ -63,7 +63,7 @@ void decodeBaseband(benchmark::State& state, const Technology& technology)
     decodeInto(log, state, technology, basebandStream(technology), kMessagesPerRefresh);
 }
 
-// A queue whose lines end nowhere, and which knows how many it was given and how many it wrote.
+// A queue that discards its lines and counts those it was given and those it wrote.
 class CountedQueue final : public SystemLog {
 public:
     CountedQueue() = default;
@@ -80,7 +80,7 @@ public:
         ++_given;
         _queue.write(priority, line);
     }
-    // Of a hundred lines that many were kept.
+    // Percentage of lines kept.
     double keptPercent()
     {
         _queue.flush();
@@ -109,7 +109,7 @@ void decodeIntoFile(benchmark::State& state, const Technology& technology)
     decodeInto(log, state, technology, recordedStream(technology), kOnceAtTheEnd);
 }
 
-// The queue drops lines when its thread cannot keep pace.
+// The queue drops lines if its thread cannot keep up.
 void decodeIntoQueue(benchmark::State& state, const Technology& technology)
 {
     CountedQueue log;
@@ -123,7 +123,7 @@ void decodeBasebandIntoFile(benchmark::State& state, const Technology& technolog
     decodeInto(log, state, technology, basebandStream(technology), kOnceAtTheEnd);
 }
 
-// Enters a benchmark as "KIND/TECHNOLOGY".
+// Registers a benchmark as "KIND/TECHNOLOGY".
 void registerDecode(const std::string& kind, const Technology& technology,
     void (*decode)(benchmark::State& state, const Technology& technology))
 {
@@ -139,7 +139,7 @@ void registerDecoding()
         registerDecode("decode", technology, decode);
         registerDecode("decode+file", technology, decodeIntoFile);
         registerDecode("decode+queue", technology, decodeIntoQueue);
-        if (technology.name == std::string_view("ifx")) // it has no packets, only property lists
+        if (technology.name == std::string_view("ifx")) // property lists only
             continue;
         registerDecode("baseband", technology, decodeBaseband);
         registerDecode("baseband+file", technology, decodeBasebandIntoFile);

@@ -1,5 +1,5 @@
-// Fills a dictionary with 100,000 keys and finds each again: random keys, and keys that somebody chose so
-// that std::hash has one value for them all.
+// Fills a dictionary with 100,000 keys and looks each up: random keys, and keys chosen to collide under
+// std::hash.
 
 #include "Benchmarks.h"
 
@@ -34,8 +34,7 @@ Keys randomKeys()
     return keys;
 }
 
-// libstdc++ hashes 8 bytes at a time, each step of which can be undone: the second half of a key takes back
-// what the first has done.
+// libstdc++ hashes 8 bytes at a time in reversible steps, so the second half of a key can undo the first.
 Keys chosenKeys()
 {
     constexpr std::uint64_t kFactor = 0xC6A4A7935BD1E995;

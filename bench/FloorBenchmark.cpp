@@ -1,5 +1,5 @@
-// Two floors under every figure: what it takes to look at each message at all, and what it takes to print
-// numbers. A decoder that keeps pace with the second spends its time on texts and on nothing else.
+// Two floors for every figure: copying each message, and formatting numbers. A decoder as fast as the second
+// spends its time on formatting alone.
 
 #include "Benchmarks.h"
 
@@ -28,7 +28,7 @@ void copyFloor(benchmark::State& state, const Technology& technology)
     countMessages(state, messages.size());
 }
 
-// Prints eight integers a message, into strings that have their storage.
+// Formats eight integers per message, into strings that keep their storage.
 void printFloor(benchmark::State& state)
 {
     constexpr std::size_t kMessages = 20'000;

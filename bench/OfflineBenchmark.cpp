@@ -1,4 +1,4 @@
-// orvex-decode as it is started from a shell: how long captures take it, and how much memory.
+// Measures time and memory of orvex-decode as started from a shell.
 
 #include "Benchmarks.h"
 #include "ChildProcess.h"
@@ -18,9 +18,9 @@ namespace {
 constexpr std::size_t kPcapRecordHeader = 16;
 constexpr std::size_t kSmallMiB = 64;
 
-std::string theDirectory; // where captures are written
+std::string theDirectory; // for captures
 
-// A capture of so many MiB: a stream again and again. It goes with the object.
+// A capture of the given size: a stream, repeated. Deleted with the object.
 class LargeCapture {
 public:
     explicit LargeCapture(std::size_t miB, const std::vector<Bytes>& stream = recordedStream("lte"))
@@ -52,7 +52,7 @@ struct Run {
     double peakMiB;
 };
 
-// Decodes a capture. No seconds when the program failed.
+// Decodes a capture. No seconds if the program failed.
 Run decode(const std::string& capture)
 {
     const auto start = std::chrono::steady_clock::now();

@@ -1,5 +1,5 @@
-// From a refresh of the session to the painted screen: a list of 64 rows of name and value, all of whose
-// values have changed, in a handset's window and in one so high that all rows are in view.
+// Measures a refresh of the session up to the painted screen: a list of 64 rows whose values have all
+// changed, in a handset's window and in one high enough to show all rows.
 
 #include "Benchmarks.h"
 
@@ -28,7 +28,7 @@ namespace {
 constexpr std::size_t kRows = 64;
 constexpr int kBarsHeight = 200; // more than the bars need
 
-// The monitor on a service that the benchmark plays.
+// The monitor, with the benchmark as its telephony service.
 class Monitor {
 public:
     Monitor()
@@ -49,7 +49,7 @@ public:
     Window& window() const { return *_app->window(); }
     bool showsList() const { return top().tableList().rowCount() == kRows; }
 
-    // A frequency hopping list, in which no channel is what it was in the last.
+    // A frequency hopping list in which every channel has changed.
     void sendChannels()
     {
         Bytes payload = {7, kRows};
@@ -98,7 +98,7 @@ void processUntilPainted()
         QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
 }
 
-// So that nothing is left over from the refresh before.
+// Finishes everything left over from the previous refresh.
 void finishEvents()
 {
     while (QAbstractEventDispatcher::instance()->processEvents(QEventLoop::AllEvents)) { }

@@ -1,5 +1,5 @@
-// The message port, from another process to the decoded message: how many in a second when the sender never
-// rests, also without the decoding, and how long one is on the way when nothing else is.
+// Measures the message port, from a sending process to the decoded message: throughput with a sender that
+// never pauses, with and without decoding, and latency when idle.
 
 #include "Benchmarks.h"
 #include "ChildProcess.h"
@@ -32,17 +32,17 @@ using Nanoseconds = std::chrono::nanoseconds;
 constexpr const char* kPortName = "org.orvex.Bench";
 constexpr auto kLongestWait = std::chrono::seconds(60);
 
-// What the sender of the port benchmark sends: a log packet of 100 bytes with three LTE neighbours. Where
-// packets have their time it has that of its sending, on a clock that both processes read.
+// The message sent: a log packet of 100 bytes with three LTE neighbours. Its time field holds the time of
+// sending, on a clock shared by both processes.
 constexpr std::size_t kPortMessageSize = 100;
-constexpr std::size_t kPortMessageTime = 5; // 8 bytes, as they stand in memory
+constexpr std::size_t kPortMessageTime = 5; // 8 bytes, native order
 constexpr std::size_t kPortMessageNeighbors = 3;
 
 Bytes portMessage()
 {
     constexpr std::array<std::uint8_t, 21> kBeginning = {1, kPortMessageSize - 1, 0, 0x80, 0xB1, 0, 0, 0, 0,
         0, 0, 0,
-        0, // so far the header
+        0, // end of the header
         3, 0, 0, 0, 0x9C, 0x18, (kPortMessageNeighbors - 1) << 6, 0};
     Bytes message(kPortMessageSize, 0x55);
     std::ranges::copy(kBeginning, message.begin());
@@ -54,13 +54,13 @@ std::chrono::steady_clock::rep portTime()
     return std::chrono::steady_clock::now().time_since_epoch().count();
 }
 
-// When a message was sent, and when it was decoded.
+// When a message was sent and decoded.
 struct Trip {
     Nanoseconds sent;
     Nanoseconds decoded;
 };
 
-// The receiving application: a port, a generator, and a note of every message.
+// The receiving application: a port, a generator and a record of every message.
 class Receiver {
 public:
     explicit Receiver(std::size_t count, bool decodes = true)
@@ -70,7 +70,7 @@ public:
         _trips.reserve(count);
     }
 
-    // Starts a sender and takes what it sends. Empty when something else than all its messages arrived whole.
+    // Starts a sender and receives its messages. Empty unless all of them arrived whole.
     const std::vector<Trip>& run(std::chrono::microseconds pause)
     {
         const std::string directory = _directory.filePath("ports").toStdString();
@@ -112,7 +112,7 @@ private:
         return _trips.size() == _count && list && list->size() == kPortMessageNeighbors;
     }
 
-    // As a session would at this pace.
+    // As often as a session would at this rate.
     static constexpr std::size_t kRefreshEvery = 400'000;
 
     std::size_t _count;

@@ -1,6 +1,5 @@
-// One rebuild of the display tree with its path dictionary: of what each technology shows at the end of its
-// recorded stream, and of the fullest display of GSM and UMTS, which has a record in each of the 32 places of
-// every list.
+// Measures one rebuild of the display tree with its path dictionary: for the final display of each recorded
+// stream, and for the fullest GSM and UMTS display, with 32 records in every list.
 
 #include "Benchmarks.h"
 
@@ -18,7 +17,7 @@ namespace {
 
 constexpr std::size_t kListLength = 32;
 
-// The longest that each list of a display ever was, by its path.
+// The greatest length of each list of a display, by path.
 using LongestLists = std::map<std::string, ArrayRef>;
 
 void remember(LongestLists& longest, const std::string& path, const Value& shown)
@@ -33,7 +32,7 @@ void remember(LongestLists& longest, const std::string& path, const Value& shown
     }
 }
 
-// Fills each list up with copies of its records. A list that no packet fills stays empty.
+// Fills each list with copies of its records. A list without records stays empty.
 void fill(const LongestLists& longest, const std::string& path, const Value& shown)
 {
     if (const auto list = shown.array()) {

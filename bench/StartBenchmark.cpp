@@ -1,4 +1,4 @@
-// From starting orvex to its first window painted, alone and beside a service that answers.
+// Measures the start of orvex until its first frame, without a service and beside one that answers.
 
 #include "Benchmarks.h"
 #include "ChildProcess.h"

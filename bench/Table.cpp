@@ -20,7 +20,7 @@ void Results::ReportRuns(const std::vector<Run>& runs)
             continue;
         if (const auto known = _figures.find(name); known != _figures.end() && known->second.isMedian)
             continue;
-        // What is of one thread is told in processor time, whatever else the machine does.
+        // Single-threaded figures are in processor time, which other load does not change.
         const double time =
             run.run_name.time_type.empty() ? run.GetAdjustedCPUTime() : run.GetAdjustedRealTime();
         Figures figures{time / benchmark::GetTimeUnitMultiplier(run.time_unit), {}, isMedian};
@@ -48,24 +48,24 @@ namespace {
 
 enum class Unit { perSecond, milliseconds, microseconds, mebibytes, percent };
 
-// A figure that was measured: the time of a benchmark, or one of its counters.
+// A measured figure: a benchmark's time or one of its counters.
 struct Figure {
     const char* benchmark;
-    const char* counter; // null: the time
+    const char* counter; // null for the time
 };
 
-// What a figure is to reach: so much, or so many times another figure.
+// The bound of a figure: a value, or a multiple of another figure.
 struct Bound {
     enum class Kind { none, atLeast, atMost } kind = Kind::none;
     double factor = 0;
-    Figure of = {nullptr, nullptr}; // without a benchmark the factor is the bound
+    Figure of = {nullptr, nullptr}; // none: the factor is the bound itself
 };
 
 struct Row {
     const char* what;
     Unit unit;
     Figure figure;
-    const char* copyFloor = nullptr; // with which the figure can be compared
+    const char* copyFloor = nullptr; // floor to compare with
     Bound bound = {};
 };
 
@@ -172,7 +172,7 @@ std::optional<double> valueOf(const Results& results, const Figure& figure)
                           : results.seconds(figure.benchmark);
 }
 
-// Three digits that count.
+// Three significant digits.
 std::string digits(double value)
 {
     const int decimals =
@@ -192,7 +192,7 @@ std::string textOf(double value, Unit unit)
     return {};
 }
 
-// Of a rate: how many times the floor's. Of a time: how many messages the floor does meanwhile.
+// A rate divided by the floor's, or a time in messages of the floor.
 std::string ratioTo(const Results& results, const char* floor, double value, Unit unit)
 {
     const auto rate = floor ? results.counter(floor, kRate) : std::nullopt;

@@ -9,14 +9,14 @@
 
 namespace orvex::bench {
 
-// Shows benchmarks on the terminal as they end, and keeps their figures: of one that was repeated the median.
+// Prints benchmarks as they end and keeps their figures, the median of repetitions.
 class Results final : public benchmark::ConsoleReporter {
 public:
     void ReportRuns(const std::vector<Run>& runs) override;
 
-    // Whether it was run, well or not.
+    // True even if it failed.
     bool hasRun(const std::string& benchmark) const { return _hasRun.contains(benchmark); }
-    // None when it was not run, or failed.
+    // None if it was not run or failed.
     std::optional<double> seconds(const std::string& benchmark) const;
     std::optional<double> counter(const std::string& benchmark, const std::string& name) const;
 
@@ -31,8 +31,8 @@ private:
     std::map<std::string, Figures> _figures;
 };
 
-// The table of all figures that were measured, in Markdown: absolute, as ratios to the floors of the same
-// run, and beside their bounds.
+// The Markdown table of all figures: absolute, relative to the floors of the same run, and beside their
+// bounds.
 std::string markdownTable(const Results& results);
 
 } // namespace orvex::bench

@@ -1,8 +1,8 @@
 // orvex_bench: all benchmarks, or those that --benchmark_filter names. scripts/bench runs it.
 //
-//   --table=FILE      write the table of figures into this file
-//   --capture-mib=N   size of the large capture, 1024 without the option
-//   --directory=DIR   where captures are written for a while; the current one without the option
+//   --table=FILE      write the table of figures to FILE
+//   --capture-mib=N   size of the large capture, 1024 by default
+//   --directory=DIR   directory for temporary captures, the current one by default
 
 #include "Benchmarks.h"
 #include "Table.h"
@@ -20,7 +20,7 @@
 
 namespace {
 
-// Takes "--name=VALUE" off the arguments.
+// Removes "--name=VALUE" from the arguments and returns VALUE.
 std::string takeOption(int& argc, char** argv, std::string_view name, std::string usual)
 {
     for (int i = 1; i < argc; ++i) {
@@ -47,7 +47,7 @@ int main(int argc, char** argv)
 
     qputenv("QT_QPA_PLATFORM", "offscreen");
     const QApplication application(argc, argv);
-    orvex::installConsole([](std::string_view) {}); // the terminal is the benchmarks'
+    orvex::installConsole([](std::string_view) {}); // the benchmarks print there
     registerFloors();
     registerDictionaries();
     registerDecoding();

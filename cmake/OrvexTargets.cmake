@@ -1,4 +1,4 @@
-# How a floor becomes a target: the same warnings everywhere, headers in a verified file set.
+# Makes a target of a layer: the same warnings everywhere, headers in a verified file set.
 
 add_library(orvex_build_flags INTERFACE)
 target_compile_options(orvex_build_flags INTERFACE
@@ -12,12 +12,12 @@ if(ORVEX_SANITIZE)
     target_link_options(orvex_build_flags INTERFACE -fsanitize=address,undefined)
 endif()
 if(ORVEX_BUILD_FUZZERS)
-    # Everything is watched, so that an input counts as new wherever it leads to something new.
+    # All code is instrumented, so that new behaviour anywhere makes an input worth keeping.
     target_compile_options(orvex_build_flags INTERFACE -fsanitize=fuzzer-no-link)
     target_compile_definitions(orvex_build_flags INTERFACE FUZZING_BUILD_MODE_UNSAFE_FOR_PRODUCTION)
 endif()
 
-# What everybody trusts has its lines counted: the generators and the model.
+# Counts executed lines of the generators and the model.
 function(orvex_count_coverage)
     if(ORVEX_COVERAGE)
         foreach(target ${ARGN})
@@ -27,8 +27,8 @@ function(orvex_count_coverage)
     endif()
 endfunction()
 
-# What nearly every file reads is read once for the target. Only where ORVEX_PRECOMPILE asks for it: whether a file
-# includes what it uses, the builds without say.
+# Precompiles what nearly every file includes. Only with ORVEX_PRECOMPILE: builds without it check that each file
+# includes what it uses.
 set(ORVEX_COMMON_HEADERS
     <algorithm> <array> <chrono> <cmath> <cstdint> <filesystem> <functional> <memory> <optional> <span> <string>
     <string_view> <unordered_map> <utility> <variant> <vector>)

@@ -13,10 +13,10 @@ namespace orvex {
 namespace {
 namespace fs = std::filesystem;
 
-// Device and inode of a file, or of the directory of a file that does not exist yet, and then its name.
+// Identifies a file: device and inode, or those of the directory plus the name if it does not exist yet.
 using Identity = std::tuple<dev_t, ino_t, std::string>;
 
-// None for what may be opened more than once, or not at all.
+// Empty for devices and pipes, which may be opened more than once, and for paths that cannot be resolved.
 std::optional<Identity> identityOf(const std::string& path)
 {
     struct stat status { };

@@ -11,9 +11,8 @@ struct FileInUse {
     std::string path;
 };
 
-// Finds an output that is also an input or another output, whether by its path, a link or a link to a file
-// that does not exist yet. Returns one line that names both, or an empty text. Devices and pipes may be used
-// more than once.
+// Finds an output that is also an input or another output, even through links or before the file exists.
+// Returns one line that names both, or an empty text. Devices and pipes may be used more than once.
 std::string fileConflict(const std::vector<FileInUse>& inputs, const std::vector<FileInUse>& outputs);
 
 } // namespace orvex

@@ -63,14 +63,14 @@ bool isTrusted(const struct stat& status)
     return status.st_uid == ::geteuid() || status.st_uid == 0;
 }
 
-// A link such as /proc/self/fd/1 leads to an open file, which need not have the name that the link shows.
+// A link such as /proc/self/fd/1 leads to an open file, whose name may differ from the link's text.
 bool isLinkToOpenFile(const Descriptor& link)
 {
     struct statfs system { };
     return ::fstatfs(link.number(), &system) == 0 && system.f_type == PROC_SUPER_MAGIC;
 }
 
-// Where a link leads, relative to its own path.
+// Resolves one link relative to its own directory.
 std::string targetOf(const Descriptor& link, const std::string& path)
 {
     std::array<char, PATH_MAX> buffer; // NOLINT(cppcoreguidelines-pro-type-member-init)
@@ -79,7 +79,7 @@ std::string targetOf(const Descriptor& link, const std::string& path)
     return target.starts_with('/') ? target : path.substr(0, path.rfind('/') + 1) + target;
 }
 
-// Opens the file that was found, even if another has taken its place since.
+// Opens the file found earlier, even if another has since taken its name.
 OutputFile reopen(const Descriptor& found, bool isRedirection)
 {
     struct stat status { };
@@ -128,7 +128,7 @@ OutputFile openOutputFile(const std::string& path)
     const LinkEnd end = followLinks(path, FollowedLinks::trusted);
     if (!end.error.empty())
         return {nullptr, end.error};
-    // A link that takes the place from now on is refused: neither call follows it.
+    // Neither call follows a link, so one created from here on is refused.
     Descriptor created(::open(
         end.path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC | O_NOCTTY, kOwnerOnly));
     if (created.isOpen())

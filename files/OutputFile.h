@@ -17,26 +17,25 @@ struct OutputFile {
     std::string error; // why, without the path
 };
 
-// Opens an empty file for writing, readable by its owner only because it may name a subscriber. An existing
-// file is emptied and gets mode 0600, unless it is reached through /dev/stdout and the like, whose mode the
-// user chose. Files and links of other users except root are refused: in a shared directory anybody can put
-// one there.
+// Opens an empty file for writing. Its mode is 0600 because it may identify a subscriber; an existing file is
+// truncated and gets that mode too, unless it is reached through /dev/stdout and the like. Files and links
+// owned by other users, except root, are refused: in a shared directory anyone could have planted them.
 OutputFile openOutputFile(const std::string& path);
 
 enum class FollowedLinks { all, trusted }; // trusted: those of this user and root
 
-// Where a path leads through links; a file need not exist there.
+// Where a path leads through links. The target need not exist.
 struct LinkEnd {
     std::string path;
-    bool isOpenFile = false; // still a link such as /proc/self/fd/1, whose text need not name the file
-    std::string error;       // why the links were not followed to their end
+    bool isOpenFile = false; // a link such as /proc/self/fd/1, whose text may not name the file
+    std::string error;       // why a link was not followed
 };
 LinkEnd followLinks(const std::string& path, FollowedLinks links);
 
-// Closes the file. Returns why it does not hold all that was written to it; empty when it does.
+// Closes the file. Returns an error if not everything reached it, else an empty text.
 std::string closeOutputFile(FilePointer file);
 
-// Lets an output stream write to a file that it does not own.
+// Stream buffer over a file it does not own.
 class FileBuffer final : public std::streambuf {
 public:
     explicit FileBuffer(std::FILE& file)

@@ -71,7 +71,7 @@ FileContent readFile(const std::string& path, std::size_t limit)
     RegularFile file(path);
     if (file.error().empty() && file.size() <= limit) {
         Bytes bytes;
-        bytes.reserve(static_cast<std::size_t>(file.size()) + 2); // for a parser that marks the end
+        bytes.reserve(static_cast<std::size_t>(file.size()) + 2); // room for a parser's end mark
         bytes.resize(static_cast<std::size_t>(file.size()));
         bytes.resize(file.readAt(0, bytes));
         if (file.error().empty())

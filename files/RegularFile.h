@@ -10,8 +10,8 @@
 
 namespace orvex {
 
-// A regular file, open for reading. Anything else is refused: a pipe may never have a writer, and a device
-// may never end.
+// A regular file, open for reading. Anything else is refused: a pipe may never get a writer, and a device may
+// never end.
 class RegularFile {
 public:
     explicit RegularFile(const std::string& path);
@@ -19,13 +19,13 @@ public:
     RegularFile(const RegularFile&) = delete;
     RegularFile& operator=(const RegularFile&) = delete;
 
-    // Why the file cannot be read, without its path; empty while all is well.
+    // Why the file cannot be read, without its path. Empty if there is no error.
     const std::string& error() const { return _error; }
     std::uint64_t size() const { return _size; }
-    // Fills the buffer from this place in the file on. Returns the number of bytes: less than the buffer
-    // holds only at the end of the file or after an error.
+    // Fills the buffer from the offset on. Returns the number of bytes read, short only at the end of the
+    // file or after an error.
     std::size_t readAt(std::uint64_t place, std::span<std::uint8_t> buffer);
-    // A stream of the whole file, for the caller to close; null after an error.
+    // A stream of the whole file, which the caller closes. Null after an error.
     std::FILE* openStream();
 
 private:
@@ -38,10 +38,10 @@ private:
 
 struct FileContent {
     Bytes bytes;
-    std::string error; // as that of RegularFile; empty when all of the file was read
+    std::string error; // as in RegularFile; empty if the whole file was read
 };
 
-// The whole file, when it is no longer than the limit. No more than that is ever read.
+// Reads the whole file, but never more than the limit; a longer file is an error.
 FileContent readFile(const std::string& path, std::size_t limit);
 
 } // namespace orvex

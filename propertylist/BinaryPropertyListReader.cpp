@@ -17,11 +17,11 @@ using Fault = PropertyListFault;
 
 constexpr std::string_view kHeader = "bplist00";
 constexpr std::size_t kTrailerSize = 32;
-constexpr std::uint8_t kSizeFollows = 0xF; // in the low half of a marker: an integer object with the size
+constexpr std::uint8_t kSizeFollows = 0xF; // low half of a marker: the size follows as an integer object
 
-// What a list may take in memory: so much for each of its bytes, whatever it shares, and some for small
-// lists, which may share nearly everything. A report is held some five times: as it came, as it is shown,
-// twice in the history, as nodes of the display tree.
+// Limit on the memory of a list: an amount per byte, whatever it shares, plus an allowance for small lists,
+// which may share nearly everything. A report is held about five times: as received, as displayed, twice in
+// the history, and as nodes of the display tree.
 constexpr std::size_t kMemoryForEachByte = 24;
 constexpr std::size_t kMemoryOfAnyList = 256 << 10;
 constexpr std::size_t kMemoryOfValue = 48;
@@ -73,12 +73,12 @@ public:
 private:
     struct Object {
         std::uint8_t kind = 0;
-        std::uint64_t size = 0; // elements, characters or bytes; for numbers the power of two of the bytes
+        std::uint64_t size = 0; // elements, characters or bytes; for numbers log2 of the bytes
         std::size_t content = 0;
     };
 
-    // What the object becomes, before memory is spent on it. Recursive: the depth, which is the number of
-    // containers around the object, has its limit.
+    // Counts what the object becomes before memory is spent on it. Recursive: the number of containers
+    // around the object is limited.
     void count(std::uint64_t reference, std::size_t depth)
     {
         _count.addNode();
@@ -113,7 +113,7 @@ private:
             throw Fault("shared objects make more of the list than it has room for");
     }
 
-    // The caller has counted what the object becomes.
+    // Precondition: the object has been counted.
     Value valueOf(std::uint64_t reference)
     {
         const Object object = objectAt(reference);
@@ -204,7 +204,7 @@ private:
         return std::make_shared<Bytes>(bytes.begin(), bytes.end());
     }
 
-    // A text has no zero in the other form either, and none where it is shown.
+    // XML texts cannot hold a zero either, and none can be displayed.
     std::string textOf(const Object& object)
     {
         const auto bytes = bytesOf(object);
@@ -215,7 +215,7 @@ private:
         return text;
     }
 
-    // What is half of a character becomes U+FFFD.
+    // Unpaired surrogates become U+FFFD.
     static std::string textOfUTF16(ByteView bytes)
     {
         std::u16string units;
@@ -225,7 +225,7 @@ private:
         return utf8FromUTF16(units);
     }
 
-    // Of a text or data.
+    // The bytes of a text or of data.
     ByteView bytesOf(const Object& object) const
     {
         const std::size_t bytesEach = object.kind == kUTF16 ? 2 : 1;
@@ -233,7 +233,7 @@ private:
         return _list.subspan(object.content, object.size * bytesEach);
     }
 
-    // The caller has made sure that it is there.
+    // Precondition: the byte exists.
     std::uint64_t referenceAt(const Object& container, std::uint64_t index) const
     {
         return number(container.content + index * _referenceSize, _referenceSize);
@@ -274,7 +274,7 @@ private:
             throw Fault("an object outside of the list");
     }
 
-    // The caller has made sure that the bytes are there.
+    // Precondition: the bytes exist.
     std::uint64_t number(std::size_t position, std::size_t bytes) const
     {
         std::uint64_t result = 0;

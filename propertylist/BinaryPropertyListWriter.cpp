@@ -1,4 +1,4 @@
-// Writing binary property lists; PropertyListReaders.h has the layout.
+// Writes binary property lists. PropertyListReaders.h describes the layout.
 
 #include "PropertyListReaders.h"
 #include "XMLText.h"
@@ -32,7 +32,7 @@ void appendInteger(Bytes& bytes, std::uint64_t number)
     append(bytes, number, width);
 }
 
-// Of an object of this many elements, characters or bytes.
+// The marker of an object with this many elements, characters or bytes.
 void appendMarker(Bytes& bytes, unsigned kind, std::size_t size)
 {
     bytes.push_back(static_cast<std::uint8_t>(kind << 4 | std::min<std::size_t>(size, 0xF)));
@@ -40,10 +40,10 @@ void appendMarker(Bytes& bytes, unsigned kind, std::size_t size)
         appendInteger(bytes, size);
 }
 
-// Recursive: what is written is no deeper than what can be read.
+// Recursive: what Orvex writes is no deeper than what it reads.
 class Writer {
 public:
-    // The object of the value; none when it has no form.
+    // The number of the value's object. None if the value has no binary form.
     std::optional<std::size_t> add(const Value& value)
     {
         if (const std::string* text = value.string())
@@ -72,7 +72,7 @@ public:
         list.push_back(static_cast<std::uint8_t>(offsetWidth));
         list.push_back(static_cast<std::uint8_t>(referenceWidth));
         append(list, _objects.size(), 8);
-        append(list, 0, 8); // the root comes first
+        append(list, 0, 8); // the root is object 0
         append(list, table, 8);
         return list;
     }
@@ -80,10 +80,10 @@ public:
 private:
     struct Object {
         Bytes bytes;                         // marker and content
-        std::vector<std::size_t> references; // behind them
+        std::vector<std::size_t> references; // follow them
     };
 
-    // The object of a text, which equal texts share.
+    // Equal texts share one object.
     std::size_t addText(const std::string& text)
     {
         const auto [known, isNew] = _texts.try_emplace(text, _objects.size());
@@ -112,7 +112,7 @@ private:
         Bytes& bytes = _objects[object].bytes;
         switch (value.kind()) {
         case Value::Kind::null:
-        case Value::Kind::string: return false; // texts have objects already
+        case Value::Kind::string: return false; // handled by addText()
         case Value::Kind::boolean: bytes = {static_cast<std::uint8_t>(*value.boolean() ? 0x09 : 0x08)}; break;
         case Value::Kind::integer: appendInteger(bytes, static_cast<std::uint64_t>(*value.integer())); break;
         case Value::Kind::real:
@@ -172,7 +172,7 @@ private:
         return object.has_value();
     }
 
-    // False when the container holds itself.
+    // False if the container holds itself.
     template <typename Step>
     bool inside(const void* container, Step step)
     {

@@ -13,7 +13,7 @@ PropertyListResult failure(const std::string& why)
     return {std::nullopt, "No property list: " + why};
 }
 
-// The copy gives the bytes to the reader that overwrites them.
+// Copied, because the reader overwrites the bytes.
 template <typename Copy>
 PropertyListResult read(ByteView data, const PropertyListLimits& limits, Copy copy)
 {

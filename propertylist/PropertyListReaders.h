@@ -17,7 +17,7 @@ struct PropertyListFault : std::runtime_error {
     using std::runtime_error::runtime_error;
 };
 
-// Counts what a list becomes while it is read; throws when that exceeds a limit.
+// Counts values and containers while a list is read. Throws if a limit is exceeded.
 class PropertyListCount {
 public:
     explicit PropertyListCount(const PropertyListLimits& limits)
@@ -58,21 +58,21 @@ private:
     std::size_t _bytes = 0;
 };
 
-// Reads the XML form. Throws PropertyListFault unless the list keeps its limits and is well formed: known
-// elements, one value in <plist>, keys and values in turn, numbers, dates and data that can be read. A
-// document type may not declare anything, so no entity grows. Of two entries with one key the last counts.
+// Reads the XML form. Throws PropertyListFault unless the list is within its limits and well formed: known
+// elements, one value in <plist>, keys and values in turn, valid numbers, dates and data. A document type may
+// not declare anything, so no entity expands. Of two entries with the same key the last one counts.
 //
-// The parser overwrites the list, which ends with kXMLPadding: it puts a zero in the place of the last byte
-// and overlooks a '<' before that.
+// The parser overwrites the list, which must end with kXMLPadding: the parser puts a zero in the place of the
+// last byte and misses a '<' before it.
 inline constexpr std::string_view kXMLPadding = "\n\n";
 Value readXMLPropertyList(Bytes&& paddedList, const PropertyListLimits& limits);
 
-// Reads the binary form. Throws PropertyListFault unless every object that the root reaches lies inside the
-// list and the tree keeps the limits. An object may be referred to many times; each time it becomes a value
-// of its own and counts as one, as the bytes of texts and data do. Before memory is spent, a list is refused
-// whose values outnumber its bytes, which takes shared containers, or would take far more memory than bytes.
+// Reads the binary form. Throws PropertyListFault unless every object reachable from the root lies inside the
+// list and the tree is within the limits. A shared object becomes a value of its own at each reference, and
+// it and its bytes count each time. A list whose values outnumber its bytes, which takes shared containers,
+// or whose values would take far more memory than the list, is refused before memory is spent.
 //
-//    0              "bplist00", of which the last two are the version
+//    0              "bplist00", the last two characters the version
 //    8              objects: a marker byte (kind in the high half, size in the low one) and content
 //   offset table    offset of each object, of offsetSize bytes
 //   last 32 bytes   6 u8   offsetSize
@@ -81,10 +81,9 @@ Value readXMLPropertyList(Bytes&& paddedList, const PropertyListLimits& limits);
 //                  16 u64  number of the root object
 //                  24 u64  where the offset table starts
 //
-// All numbers are big-endian. An array is followed by references to its elements, a dictionary by those to
-// all keys, then those to all values. Integers of up to four bytes have no sign, those of eight have one,
-// those of sixteen hold what is too large for that and become reals. A dictionary leaves out what stands
-// under a key that is no text.
+// All numbers are big-endian. An array holds references to its elements, a dictionary references to all keys,
+// then to all values. Integers of up to four bytes are unsigned, those of eight signed; those of sixteen
+// become reals. Dictionary entries whose keys are not texts are left out.
 Value readBinaryPropertyList(ByteView list, const PropertyListLimits& limits);
 
 } // namespace orvex

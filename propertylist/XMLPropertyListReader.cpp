@@ -23,18 +23,18 @@ bool isBlank(std::string_view text)
     return std::ranges::all_of(text, isXMLWhiteSpace);
 }
 
-// The parser takes some 64 bytes of memory for each tag, comment and attribute and for the texts on both
-// sides of a tag, so there may be no more of them than values, and some.
+// The parser takes about 64 bytes of memory per tag, comment, attribute and text between tags, so their
+// number is limited too.
 void requireFewTags(std::string_view text, const PropertyListLimits& limits)
 {
-    constexpr std::size_t kOthers = 1000; // than values: <plist>, comments, the version
-    constexpr std::size_t kBlock = 255;   // as many as a byte can count, so that the compiler uses vectors
+    constexpr std::size_t kOthers = 1000; // beyond values: <plist>, comments, the version
+    constexpr std::size_t kBlock = 255;   // as many as a byte can count, so that the loop vectorizes
     std::size_t count = 0;
     for (std::size_t start = 1; start < text.size(); start += kBlock) {
         std::uint8_t inBlock = 0;
         const std::size_t end = std::min(start + kBlock, text.size());
         for (std::size_t i = start; i < end; ++i) {
-            // Operators that evaluate both sides, as vectors do.
+            // No short circuits, so that the loop vectorizes.
             const unsigned opens =
                 static_cast<unsigned>(text[i - 1] == '<') & static_cast<unsigned>(text[i] != '/');
             inBlock = static_cast<std::uint8_t>(inBlock + (opens | static_cast<unsigned>(text[i] == '=')));
@@ -45,8 +45,8 @@ void requireFewTags(std::string_view text, const PropertyListLimits& limits)
         throw PropertyListCount::tooManyNodes(limits);
 }
 
-// Comments and CDATA may split a text into pieces, of which the blank ones are kept only on demand: indented
-// lists would take twice the memory.
+// Comments and CDATA may split a text into pieces. Blank pieces are kept only then, because keeping the
+// indentation takes twice the memory.
 unsigned parserOptions(std::string_view text)
 {
     using namespace pugi;
@@ -56,8 +56,9 @@ unsigned parserOptions(std::string_view text)
         | parse_fragment | parse_embed_pcdata | (mayHavePieces ? parse_ws_pcdata : parse_ws_pcdata_single);
 }
 
-// The parser knows neither which elements there are nor what they may hold, and skips what a document type
-// declares. It leaves references to characters as they are, so that the malformed ones can be refused.
+// Checks what the parser does not: which elements there are, what they may hold, and document types, whose
+// declarations the parser skips. The parser leaves character references alone so that malformed ones can be
+// refused.
 class Reader {
 public:
     explicit Reader(const PropertyListLimits& limits)
@@ -103,7 +104,7 @@ private:
         return root;
     }
 
-    // Recursive: the depth, which is the number of containers around the element, has its limit.
+    // Recursive: the depth, the number of containers around the element, is limited.
     Value valueOf(pugi::xml_node element, std::size_t depth)
     {
         const std::string_view name = element.name();
@@ -136,10 +137,9 @@ private:
     {
         _count.enterContainer(depth);
         auto dictionary = Dictionary::make();
-        // As large as the one before, as the records of a list are. Taken once, so that the room of all is at
-        // most twice what they hold.
+        // Records of a list have equal sizes. Each size is used once, so at most half of the room is wasted.
         dictionary->reserve(std::exchange(_sizeOfLast, 0));
-        Value* value = nullptr; // of the key before
+        Value* value = nullptr; // of the preceding key
         forEachElement(element, [&](pugi::xml_node child) {
             if (value) {
                 *std::exchange(value, nullptr) = valueOf(child, depth + 1);
@@ -162,7 +162,7 @@ private:
     {
         if (!isBlank(container.value()))
             throw Fault("text outside of an element");
-        // Not children(): its iterators take several calls into the library for each step.
+        // Not children(), whose iterators call into the library several times per step.
         for (pugi::xml_node child = container.first_child(); child; child = child.next_sibling()) {
             if (child.type() == pugi::node_element)
                 function(child);
@@ -177,7 +177,7 @@ private:
             throw Fault("text outside of an element");
     }
 
-    // The text of an element that has no others inside. It holds until the next one is read.
+    // The text of an element without child elements. Valid until the next call.
     std::string_view textOf(pugi::xml_node element, bool mayHoldMarkup)
     {
         const std::string_view text = element.value(); // up to the first child
@@ -213,8 +213,8 @@ private:
     }
 
     PropertyListCount _count;
-    std::string _text;           // of an element in more than one piece
-    std::size_t _sizeOfLast = 0; // of the dictionary that was read last
+    std::string _text;           // of an element in several pieces
+    std::size_t _sizeOfLast = 0; // of the last dictionary read
 };
 } // namespace
 

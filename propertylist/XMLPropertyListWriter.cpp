@@ -1,4 +1,4 @@
-// Writing XML property lists.
+// Writes XML property lists.
 
 #include "PropertyList.h"
 
@@ -19,9 +19,10 @@
 namespace orvex {
 
 namespace {
-constexpr std::size_t kPiece = std::size_t{64} << 10; // what the sink gets at a time, at least
+constexpr std::size_t kPiece = std::size_t{64} << 10; // the sink gets at least this much at a time
 
-// The dictionary itself, unless keys of it are the same in XML: of those the first has the value of the last.
+// The dictionary itself, unless some of its keys become equal in XML: then the first takes the last one's
+// value.
 DictionaryRef withKeysOfXML(const DictionaryRef& dictionary)
 {
     const auto isSame = [](const Dictionary::Entry& entry) { return xmlText(entry.key) == entry.key; };
@@ -40,7 +41,7 @@ std::string dateOf(Date date)
     return text.substr(0, time - 1) + 'T' + text.substr(time, text.find(' ', time) - time) + 'Z';
 }
 
-// Goes through the value without recursion: a list may be nested to any depth.
+// Not recursive: a value may be nested to any depth.
 class Writer {
 public:
     explicit Writer(const TextSink& sink)
@@ -63,10 +64,10 @@ public:
 private:
     // A container whose elements are being written.
     struct Open {
-        const void* identity;    // of the container in the value
-        const Array* array;      // or
-        DictionaryRef entries;   // this
-        std::size_t written = 0; // elements, the one that is being written included
+        const void* identity; // of the container in the value
+        const Array* array;   // null for a dictionary
+        DictionaryRef entries;
+        std::size_t written = 0; // elements, including the current one
 
         std::size_t size() const { return entries ? entries->size() : array->size(); }
         const Dictionary::Entry& entry(std::size_t i) const
@@ -131,7 +132,7 @@ private:
             const char* infinity = number > 0 ? "+infinity" : "-infinity";
             return putElement("real", std::isnan(number) ? "nan" : infinity);
         }
-        constexpr int kEnough = 17; // digits that tell any two apart
+        constexpr int kEnough = 17; // digits that distinguish any two doubles
         std::array<char, 32> digits;
         const auto end =
             std::to_chars(digits.begin(), digits.end(), number, std::chars_format::general, kEnough).ptr;
@@ -147,7 +148,7 @@ private:
         putElement("date", dateOf(date));
     }
 
-    // Beyond the largest integer it is read as a real, so it is written as one.
+    // Readers take integers out of range as reals, so it is written as one.
     void putUID(UID uid)
     {
         const bool isInteger = std::in_range<std::int64_t>(uid.number);
@@ -155,11 +156,11 @@ private:
         open(&uid, nullptr, Dictionary::make({{"CF$UID", number}}));
     }
 
-    // Lines and groups of base64 run on from piece to piece.
+    // Base64 lines and groups continue across pieces.
     void putData(const std::vector<ByteView>& pieces)
     {
         static constexpr std::size_t kMostTabs = 8;
-        static constexpr std::size_t kWidth = 76; // with a tab as wide as eight characters
+        static constexpr std::size_t kWidth = 76; // columns, a tab counting as eight
         const std::size_t tabs = std::min(_open.size(), kMostTabs);
         const std::size_t bytesALine = (kWidth - tabs * 8) / 4 * 3;
         putLine("<data>\n");

@@ -65,7 +65,7 @@ Value real(std::string_view content)
     const auto read = std::from_chars(digits.data(), end, number);
     if (read.ptr != end || read.ec == std::errc::invalid_argument)
         return {};
-    if (read.ec == std::errc::result_out_of_range) // infinity or zero, which is what such a text means
+    if (read.ec == std::errc::result_out_of_range) // becomes infinity or zero
         number = std::strtod(std::string(digits).c_str(), nullptr);
     return isNegative ? -number : number;
 }
@@ -112,7 +112,7 @@ constexpr auto kBase64Values = [] {
     return values;
 }();
 
-// Padding may be missing. Where it stands, it fills up the last group, and only space follows.
+// Padding is optional. If present, it completes the last group and only space follows.
 Value data(std::string_view content)
 {
     auto bytes = std::make_shared<Bytes>();

@@ -7,16 +7,16 @@
 
 namespace orvex {
 
-// How the content of an XML element that holds no others is read: an integer of 64 bits with or without sign,
-// decimal or 0x hexadecimal (a real when it exceeds the signed ones); a real; a date as 2026-11-16T05:54:31Z;
-// base64 data; nothing in <true> and <false>; anything in <string>. White space around all but texts does not
-// count. The reader gives null when the content is not what the element promises.
+// Reads the content of an XML element without child elements: a 64-bit integer, decimal or 0x hexadecimal (a
+// real if it exceeds the signed range); a real; a date such as 2026-11-16T05:54:31Z; base64 data; nothing in
+// <true> and <false>; anything in <string>. White space around all but texts is ignored. Returns null if the
+// content is invalid.
 using XMLScalarReader = Value (*)(std::string_view content);
 
-// Null when there is no such element.
+// Null if there is no such element.
 XMLScalarReader xmlScalarReader(std::string_view element);
 
-// Appends the bytes in base64, padded.
+// Appends the bytes as padded base64.
 void appendBase64(std::string& text, ByteView bytes);
 
 } // namespace orvex

@@ -15,7 +15,7 @@ constexpr struct {
     char32_t character;
 } kNamed[] = {{"amp", '&'}, {"lt", '<'}, {"gt", '>'}, {"quot", '"'}, {"apos", '\''}};
 
-// Of what stands between '&' and ';'. Zero when there is none; XML has no character with this number.
+// The character of a reference, without '&' and ';'. Zero, which XML cannot hold, if there is none.
 char32_t characterOf(std::string_view reference)
 {
     for (const auto& [name, character] : kNamed) {
@@ -37,7 +37,7 @@ bool isPlain(char character)
     return (character >= ' ' && character <= '~') || character == '\n';
 }
 
-// The length of the character that the text starts with; 0 when XML cannot hold it. The text is not empty.
+// The length of the first character of a non-empty text; 0 if XML cannot hold it.
 std::size_t lengthOfFirst(std::string_view text)
 {
     const auto [character, length] = firstOfUTF8(text);

@@ -11,7 +11,7 @@ ArrayRef Array::make(std::initializer_list<Value> elements)
 
 void Array::appendAll(const Array& other)
 {
-    // Index by index: the other array may be this one.
+    // By index, because the other array may be this one.
     const std::size_t count = other.size();
     _elements.reserve(_elements.size() + count);
     for (std::size_t i = 0; i < count; ++i)

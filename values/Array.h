@@ -6,7 +6,7 @@
 
 namespace orvex {
 
-// A mutable list of values, shared by reference (ArrayRef). It cannot be copied by accident.
+// A mutable list of values, shared by reference (ArrayRef). Not copyable by accident.
 class Array {
 public:
     Array() = default;
@@ -25,13 +25,12 @@ public:
     auto begin() const { return _elements.begin(); }
     auto end() const { return _elements.end(); }
 
-    // An element to be changed.
+    // Mutable element.
     Value& slot(std::size_t index) { return _elements[index]; }
-    // One more element, for one who fills a list again and again: what was set aside last, else null.
+    // Appends and returns an element, recycled if one was set aside, else null.
     Value& appendSlot();
-    // Removes the elements from the index on, and sets them aside for appendSlot().
+    // Removes the elements from the index on and sets them aside for appendSlot().
     void setAsideFrom(std::size_t index);
-    // Room for so many elements, made at once.
     void reserve(std::size_t count) { _elements.reserve(count); }
     void append(Value value) { _elements.push_back(std::move(value)); }
     void appendAll(const Array& other);
@@ -47,7 +46,7 @@ public:
 
 private:
     std::vector<Value> _elements;
-    std::vector<Value> _setAside; // not part of the list: a copy has none of it
+    std::vector<Value> _setAside; // not copied
 };
 
 } // namespace orvex

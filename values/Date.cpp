@@ -11,7 +11,7 @@ namespace orvex {
 std::string dateText(Date date)
 {
     using namespace std::chrono;
-    // The calendar of the standard library covers the years -32767 to 32767; dates outside are clamped.
+    // std::chrono::year covers -32767 to 32767; dates outside are clamped.
     constexpr double kFarthest = 9.0e11;
     const double whole = std::floor(std::isnan(date.secondsSince1970) ? 0 : date.secondsSince1970);
     const sys_seconds moment{seconds(static_cast<long long>(std::clamp(whole, -kFarthest, kFarthest)))};

@@ -12,7 +12,7 @@ struct Date {
     friend auto operator<=>(const Date&, const Date&) = default;
 };
 
-// The standard text of a date, always in UTC and whole seconds: "2026-11-16 05:54:31 +0000".
+// In UTC and whole seconds: "2026-11-16 05:54:31 +0000".
 std::string dateText(Date date);
 
 } // namespace orvex

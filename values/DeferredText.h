@@ -10,22 +10,22 @@
 
 namespace orvex {
 
-// A text that is made when somebody reads it. A modem tells its values hundreds of times between two looks at
-// the screen; the numbers are taken each time, the digits only once.
+// A text formatted on first read. A modem reports a value hundreds of times between two refreshes of the
+// screen; each report stores the numbers, only the last one is formatted.
 //
-// Holds a printf format and up to two arguments. What a const char* points to, the format included, has to
-// live as long as the program: a literal, a table's text.
+// Holds a printf format and up to two arguments. Everything a const char* points to, the format included,
+// must live as long as the program: a literal or a table's text.
 class DeferredText {
 public:
     static constexpr std::size_t kMaximumArguments = 2;
 
-    // The text as it stands.
+    // A text that needs no formatting.
     explicit DeferredText(const char* text)
         : _format(text)
         , _print([](const DeferredText& late) { return std::string(late._format); })
     {
     }
-    // What the function makes of a number.
+    // The function's text for a number.
     DeferredText(std::string (*make)(double), double number)
         : _format(nullptr)
         , _print([](const DeferredText& late) {

@@ -9,12 +9,12 @@
 
 namespace orvex {
 
-// A mutable dictionary with string keys, shared by reference (DictionaryRef). It cannot be copied by
-// accident. Keys keep the order in which they were first set; setting a key again keeps its place, removing
-// and setting it moves it to the end.
+// A mutable dictionary with string keys, shared by reference (DictionaryRef). Not copyable by accident. Keys
+// keep the order in which they were first set: setting a key again keeps its position, removing and setting
+// it moves it to the end.
 //
-// Small dictionaries, the rows of a screen, are searched directly; large ones get an index, whose hash is
-// keyed so that nobody who chooses the keys of a property list can make its look-up slow.
+// Small dictionaries, such as the rows of a screen, are searched linearly. Large ones get an index whose hash
+// is keyed, so chosen keys in a property list cannot slow down its look-up.
 class Dictionary {
 public:
     struct Entry {
@@ -36,36 +36,34 @@ public:
     auto begin() const { return _entries.begin(); }
     auto end() const { return _entries.end(); }
 
-    // The value under the key; a null value when there is none.
+    // The value under the key, or a null value.
     const Value& operator[](std::string_view key) const;
     bool contains(std::string_view key) const { return find(key) != kNotFound; }
 
-    // The value to be written under the key, made at the end when there is none. The reference holds until
-    // the next change of the dictionary.
+    // The mutable value under the key, appended as null if there is none. Valid until the next change of the
+    // dictionary.
     Value& slot(std::string_view key);
-    // The same, and where it is.
+    // The same; also returns its position.
     Value& slot(std::string_view key, std::size_t& position);
     void set(std::string_view key, Value value) { slot(key) = std::move(value); }
-    // Room for so many entries, made at once.
     void reserve(std::size_t count) { _entries.reserve(count); }
     void remove(std::string_view key);
     // Removes all entries from the position on.
     void removeFrom(std::size_t position);
-    // The value at the position, to be changed, when it is that key's; null otherwise.
+    // The mutable value at the position if it has that key, else null.
     Value* slotAt(std::size_t position, std::string_view key)
     {
         const bool isThere = position < _entries.size() && _entries[position].key == key;
         return isThere ? &_entries[position].value : nullptr;
     }
 
-    // Entries that the file the dictionary was read from has under keys that are no strings. They are not in
-    // the dictionary; a copy knows nothing of them.
+    // Number of entries of the source file left out because their keys are not strings. Not copied.
     std::size_t leftOut() const { return _leftOut; }
     void leaveOutOne() { ++_leftOut; }
 
     DictionaryRef shallowCopy() const;
 
-    // Equal entries in any order.
+    // Compares entries regardless of order.
     friend bool operator==(const Dictionary& left, const Dictionary& right);
 
 private:
@@ -73,13 +71,13 @@ private:
     static constexpr std::size_t kSearchedDirectly = 24;
 
     std::size_t find(std::string_view key) const;
-    // The place in the index that is the key's, or free for it.
+    // The key's place in the index, or the free place where it would go.
     std::size_t placeInIndex(std::string_view key) const;
     void rebuildIndex();
 
     std::vector<Entry> _entries;
-    // Open addressing, its size a power of two: each place holds a position in _entries plus one, or zero
-    // when it is free. Empty while the dictionary is small.
+    // Open addressing, size a power of two: each place holds a position in _entries plus one, or zero if
+    // free. Empty while the dictionary is small.
     std::vector<std::uint32_t> _index;
     std::size_t _leftOut = 0;
 };

@@ -6,15 +6,15 @@
 
 namespace orvex {
 
-// What an argument becomes when it is passed to a function of the printf family.
+// The type an argument is promoted to when passed to printf.
 template <typename T>
 using PrintfArgument = std::conditional_t<std::integral<T>, decltype(+std::declval<T>()),
     std::conditional_t<std::floating_point<T>, double,
         std::conditional_t<std::same_as<T, char*>, const char*, T>>>;
 
-// A printf format whose conversions the compiler has held against the types of the arguments, as it does for
-// printf itself: %d %i %c %u %x %X take an int, signed or not, and with "l" or "z" before the letter one of
-// the width of a long; %f %e %g take a double, %s a text, %p a const void*. Anything else does not compile.
+// A printf format checked against its argument types at compile time: %d %i %c %u %x %X take a signed or
+// unsigned int, with "l" or "z" one of the width of a long; %f %e %g take a double, %s a text, %p a const
+// void*. Anything else does not compile.
 template <typename... Arguments>
 class PrintfFormat {
 public:
@@ -39,7 +39,7 @@ private:
         return false;
     }
 
-    // Goes on behind the flags, width and precision of the next conversion; false when there is none.
+    // Moves past the flags, width and precision of the next conversion. False if there is none.
     static constexpr bool nextConversion(const char*& place)
     {
         for (; *place; ++place) {
@@ -67,7 +67,7 @@ private:
         if constexpr (std::integral<T>)
             fitting = isLong == (sizeof(T) == sizeof(long)) ? "dicuxX" : "";
         else if constexpr (std::floating_point<T>)
-            fitting = "feg"; // with or without the "l"
+            fitting = "feg"; // "l" makes no difference
         else if constexpr (std::same_as<T, const char*>)
             fitting = isLong ? "" : "s";
         else if constexpr (std::same_as<T, const void*>)

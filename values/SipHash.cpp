@@ -55,7 +55,7 @@ private:
     std::uint64_t _v3;
 };
 
-// Up to 8 bytes, the first one lowest.
+// Up to 8 bytes, little-endian.
 std::uint64_t wordOf(std::string_view bytes)
 {
     std::uint64_t word = 0;
@@ -67,7 +67,7 @@ std::uint64_t wordOf(std::string_view bytes)
 std::array<std::uint64_t, 2> randomKey()
 {
 #ifdef FUZZING_BUILD_MODE_UNSAFE_FOR_PRODUCTION
-    return {1, 2}; // a fuzzer repeats itself
+    return {1, 2}; // fuzzing must be reproducible
 #else
     std::random_device device;
     const auto word = [&device] { return std::uint64_t{device()} << 32 | device(); };

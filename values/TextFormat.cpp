@@ -16,7 +16,7 @@ void appendDigits(std::string& text, Number number)
     text.append(digits.data(), end);
 }
 
-// A conversion of a real, from '%' to its letter.
+// A floating-point conversion, from '%' to its letter.
 class RealConversion {
 public:
     explicit RealConversion(std::string_view conversion)
@@ -41,7 +41,7 @@ public:
         }
     }
 
-    // As printf does it where numbers have a decimal point.
+    // Formats as printf does in the C locale.
     void append(std::string& text, double number) const
     {
         const std::string_view sign = std::signbit(number) ? "-" : _plus;
@@ -87,9 +87,9 @@ private:
     std::size_t _precision = 6;
 };
 
-// By the C library, which knows all that a conversion of anything else can ask for.
+// Formats with the C library, which knows every other conversion.
 #pragma GCC diagnostic push
-#pragma GCC diagnostic ignored "-Wformat-nonliteral" // PrintfFormat has seen to it
+#pragma GCC diagnostic ignored "-Wformat-nonliteral" // PrintfFormat has checked it
 template <typename T>
 void appendByLibrary(std::string& text, std::string_view conversion, T argument)
 {
@@ -103,7 +103,7 @@ void appendByLibrary(std::string& text, std::string_view conversion, T argument)
 }
 #pragma GCC diagnostic pop
 
-// Behind the letter of the conversion that starts at the '%'.
+// One past the letter of the conversion that starts at the '%'.
 const char* endOfConversion(const char* percent)
 {
     constexpr std::string_view kBeforeLetter = "-+ 0123456789.lz";
@@ -125,7 +125,7 @@ std::uint64_t PrintfValue::withoutSign() const
     return _kind == Kind::longNumber ? _content.bits : static_cast<std::uint32_t>(_content.bits);
 }
 
-// Most of what Orvex prints is plain: the library takes ten times as long to read the format again.
+// Most conversions are plain; letting the C library parse them again takes ten times as long.
 bool PrintfValue::appendPlainly(std::string& text, std::string_view conversion) const
 {
     switch (_kind) {

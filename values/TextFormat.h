@@ -8,10 +8,10 @@
 
 namespace orvex {
 
-// An argument of a printf format, whatever its type.
+// A printf argument of any type.
 class PrintfValue {
 public:
-    // A type as PrintfArgument gives it.
+    // T is a PrintfArgument.
     template <typename T>
     explicit PrintfValue(T argument)
     {
@@ -30,7 +30,7 @@ public:
         }
     }
 
-    // Appends what printf makes of it; the conversion is all from '%' to the letter.
+    // Appends the formatted value. The conversion runs from '%' to its letter.
     void appendTo(std::string& text, std::string_view conversion) const;
 
 private:
@@ -49,10 +49,10 @@ private:
     } _content;
 };
 
-// Appends what printf makes of a format and the arguments it asks for.
+// Appends the formatted text. The format must match the arguments.
 void appendPrinted(std::string& text, const char* format, const PrintfValue* arguments);
 
-// The same with arguments that the compiler has seen fit.
+// The same, checked at compile time.
 template <typename... Arguments>
 void appendText(
     std::string& text, PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
@@ -62,7 +62,7 @@ void appendText(
     appendPrinted(text, format.text(), values);
 }
 
-// A text made by a printf format. Texts of any length come out whole.
+// A formatted text of any length.
 template <typename... Arguments>
 std::string text(PrintfFormat<std::type_identity_t<Arguments>...> format, Arguments... arguments)
 {

@@ -42,7 +42,7 @@ UTF8Character firstOfUTF8(std::string_view text)
             return {};
         character = character << 6 | (byte(i) & 0x3FU);
     }
-    constexpr char32_t kSmallest[] = {0, 0, 0x80, 0x800, 0x10000}; // smaller ones have a shorter form
+    constexpr char32_t kSmallest[] = {0, 0, 0x80, 0x800, 0x10000}; // below: overlong
     if (character < kSmallest[length] || !isUnicodeCharacter(character))
         return {};
     return {character, length};
@@ -70,7 +70,7 @@ std::u16string utf16FromUTF8(std::string_view text)
         const auto [first, length] = firstOfUTF8(text);
         const char32_t character = length > 0 ? first : kReplacementCharacter;
         if (character >= 0x10000) {
-            result += static_cast<char16_t>(0xD7C0 + (character >> 10)); // 0xD800 less 0x10000 >> 10
+            result += static_cast<char16_t>(0xD7C0 + (character >> 10)); // 0xD800 - (0x10000 >> 10)
             result += static_cast<char16_t>(0xDC00 | (character & 0x3FFU));
         } else {
             result += static_cast<char16_t>(character);

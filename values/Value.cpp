@@ -93,7 +93,7 @@ Value Value::deepCopy() const
     if (const Set* held = set())
         return Set{copyOf(*held->elements)};
     if (kind() == Kind::data)
-        return *this; // nobody changes a buffer that is in a value
+        return *this; // buffers in values are immutable
     if (const DictionaryRef entries = dictionary()) {
         auto copy = Dictionary::make();
         for (const auto& [key, value] : *entries)

@@ -23,20 +23,20 @@ using ArrayRef = std::shared_ptr<Array>;
 using DictionaryRef = std::shared_ptr<Dictionary>;
 using BytesRef = std::shared_ptr<Bytes>;
 
-// The reference that archives keep to an object of theirs.
+// A keyed archive's reference to one of its objects.
 struct UID {
     std::uint64_t number = 0;
 
     friend bool operator==(const UID&, const UID&) = default;
 };
 
-// One run of bytes in pieces that others hold too, so that it takes no memory of its own.
+// Consecutive bytes made of shared buffers, which are not copied.
 class PiecedBytes {
 public:
-    // All bytes from the offset on, which is at most their number.
+    // Appends the bytes from the offset on, which is at most their number.
     void append(BytesRef bytes, std::size_t offset = 0);
     std::size_t size() const { return _size; }
-    // In order; they live as long as this does.
+    // In order. Valid as long as this object.
     std::vector<ByteView> pieces() const;
 
 private:
@@ -49,23 +49,22 @@ private:
     std::size_t _size = 0;
 };
 
-// Elements in no order. They are not changed any more.
+// Unordered elements, immutable.
 struct Set {
     std::shared_ptr<const Array> elements;
 };
 
 // The one value type of property lists, generator state, display dictionary and snapshots.
 //
-// Scalars are held by value. Arrays, dictionaries and byte buffers are held by reference: copying a Value
-// that holds one shares it. A container of one's own is had from shallowCopy() and deepCopy() alone.
+// Scalars are held by value. Arrays, dictionaries and byte buffers are held by reference, so copies of a
+// Value share them; shallowCopy() and deepCopy() make new containers.
 //
-// A text may be given as a DeferredText. Nobody can tell: it is made by whoever reads it first. For its sake
-// a value is read by one thread at a time.
+// A text may be a DeferredText. It is formatted on first read, so concurrent reads are unsafe.
 //
-// Data may be given as PiecedBytes. dataPieces() reads it as it is; data() makes it one buffer, for good.
+// Data may be PiecedBytes: dataPieces() returns the pieces, data() joins them into one buffer for good.
 //
-// UIDs and sets come out of binary property lists alone. Nothing in Orvex makes use of them; they are kept so
-// that they are not taken for something else.
+// UIDs and sets occur in binary property lists only. Orvex does not use them; they have kinds of their own so
+// that they are not mistaken for others.
 class Value {
 public:
     enum class Kind { null, string, integer, real, boolean, date, data, array, dictionary, uid, set };
@@ -103,7 +102,7 @@ public:
         : _content(date)
     {
     }
-    // A null reference makes a null value.
+    // A null reference gives a null value.
     Value(BytesRef data);
     Value(PiecedBytes data);
     Value(ArrayRef array);
@@ -123,7 +122,7 @@ public:
     }
     bool isNull() const { return kind() == Kind::null; }
 
-    // Each returns null when the value is of another kind.
+    // Each returns null if the value is of another kind.
     const std::string* string() const
     {
         makeText();
@@ -138,16 +137,16 @@ public:
         joinPieces();
         return reference<BytesRef>();
     }
-    // The bytes of data; none when the value is of another kind.
+    // The pieces of data; none if the value is of another kind.
     std::vector<ByteView> dataPieces() const;
     ArrayRef array() const { return reference<ArrayRef>(); }
     DictionaryRef dictionary() const { return reference<DictionaryRef>(); }
     const UID* uid() const { return std::get_if<UID>(&_content); }
     const Set* set() const { return std::get_if<Set>(&_content); }
-    // The same for a look, without a share in it.
+    // Borrowed: these do not share ownership.
     Array* heldArray() const { return reference<ArrayRef>().get(); }
     Dictionary* heldDictionary() const { return reference<DictionaryRef>().get(); }
-    // The container when this value alone holds it; null otherwise.
+    // The container if no other value shares it, else null.
     Array* ownArray() const { return own(reference<ArrayRef>()); }
     Dictionary* ownDictionary() const { return own(reference<DictionaryRef>()); }
 
@@ -159,12 +158,12 @@ public:
             _content.emplace<DeferredText>(text);
     }
 
-    // A container of its own kind holding the same elements; any other value as it is.
+    // A new container with the same elements; any other value unchanged.
     Value shallowCopy() const;
-    // The same with copies of its elements, all the way down.
+    // The same, with deep copies of the elements.
     Value deepCopy() const;
 
-    // Scalars by value, containers element by element.
+    // Compares containers element by element.
     friend bool operator==(const Value& left, const Value& right);
 
 private:
@@ -195,7 +194,7 @@ private:
         _content;
 };
 
-// The name of a kind, for messages: "string", "dictionary", ...
+// For messages: "string", "dictionary", ...
 const char* nameOf(Value::Kind kind);
 
 } // namespace orvex

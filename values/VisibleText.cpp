@@ -14,7 +14,7 @@ bool isPlain(char character)
     return character >= ' ' && character <= '~';
 }
 
-// Embeddings, overrides and isolates.
+// Bidirectional embeddings, overrides and isolates.
 bool isDirectionControl(char32_t character)
 {
     return (character >= 0x202A && character <= 0x202E) || (character >= 0x2066 && character <= 0x2069);

@@ -7,10 +7,10 @@ namespace orvex {
 
 inline constexpr std::size_t kLongestVisibleText = 4096;
 
-// Makes a text from a peer or a file safe to show on a terminal, in the log or in a title. Control characters
-// and bytes that are not UTF-8 become escapes such as "\n" or "\x1b"; embeddings, overrides and isolates of
-// bidirectional text and the separators of lines and paragraphs become "\u202e" and the like. A longer text
-// is cut and ends in "…".
+// Makes a text from a peer or a file safe for a terminal, the log or a title. Control characters and invalid
+// UTF-8 become escapes such as "\n" or "\x1b"; bidirectional controls and line and paragraph separators
+// become
+// "\u202e" and the like. A text longer than the limit is cut and ends in "…".
 std::string visibleText(std::string_view text, std::size_t longest = kLongestVisibleText);
 
 } // namespace orvex

@@ -10,7 +10,7 @@ namespace orvex {
 
 namespace {
 
-// A capture that could not be opened.
+// Stands for a capture that could not be opened.
 class NoCapture final : public CaptureReader {
 public:
     NoCapture(const std::string& path, const std::string& reason)
@@ -23,7 +23,7 @@ public:
     std::string omissions() const override { return {}; }
 };
 
-// Of pcap with micro- and nanoseconds, in both byte orders, and of its successor, which libpcap reads too.
+// Magic numbers of pcap (micro- and nanoseconds, both byte orders) and pcapng, all of which libpcap reads.
 bool isPcapMagic(const std::array<unsigned char, 4>& bytes)
 {
     static constexpr std::array<unsigned char, 4> kMagics[] = {{0xA1, 0xB2, 0xC3, 0xD4},

@@ -8,17 +8,17 @@
 
 namespace orvex {
 
-// The log messages of a capture file, in their order.
+// Reads the log messages of a capture file in order.
 class CaptureReader {
 public:
     enum class Status {
-        message, // message() and time() are those of the next one
-        end,     // there are no more
-        broken,  // the file cannot be read (on); error() says why. What came before stays good.
+        message, // message() and time() describe it
+        end,
+        broken, // the file cannot be read further; error() says why. Earlier messages remain valid.
     };
 
-    // A pcap or a DLF file, told apart by their first bytes. Never null: of a file that is neither, or cannot
-    // be opened, the first next() says so.
+    // Opens a pcap or DLF file, told apart by the first bytes. Never null: if the file is neither, or cannot
+    // be opened, the first next() reports it.
     static std::unique_ptr<CaptureReader> open(const std::string& path);
 
     virtual ~CaptureReader() = default;
@@ -26,14 +26,14 @@ public:
     CaptureReader& operator=(const CaptureReader&) = delete;
 
     virtual Status next() = 0;
-    // What was left out so far, in words for the user; empty when nothing was.
+    // What was skipped so far, in words for the user; empty if nothing was.
     virtual std::string omissions() const = 0;
 
-    // Holds until the next call of next().
+    // Valid until the next call of next().
     ByteView message() const { return _message; }
-    // When it was captured, as far as the capture knows; 0 when it does not.
+    // Time of capture; 0 if the file does not tell.
     std::chrono::microseconds time() const { return _time; }
-    // One line with the file's path.
+    // One line that includes the path.
     const std::string& error() const { return _error; }
 
 protected:
@@ -53,7 +53,7 @@ protected:
         _error = _path + ": " + reason;
         return Status::broken;
     }
-    // For the reason of another.
+    // Takes over another reader's error.
     void failAs(const CaptureReader& other) { _error = other._error; }
 
 private:

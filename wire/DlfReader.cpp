@@ -65,7 +65,7 @@ CaptureReader::Status DlfReader::next()
     }
     _message.assign(1, record->logType.value_or(kLogTypeBaseband));
     _message.insert(_message.end(), record->bytes.begin(), record->bytes.end());
-    // The time is the modem's, in a unit of its own; koratd's is microseconds since 1970.
+    // The modem's time has a unit of its own; koratd writes microseconds since 1970.
     return yield(_message, std::chrono::microseconds(static_cast<std::int64_t>(record->time & kLargestTime)));
 }
 

@@ -6,9 +6,9 @@
 
 namespace orvex {
 
-// A DLF file. A record becomes a message by its log type in front; where the file has none it is that of a
-// baseband packet. A file with bytes that make no record is read to its end and then counts as broken. Only a
-// part of it is in memory.
+// Reads a DLF file. Each record becomes a message with its log type in front, baseband if the file has none.
+// A file with bytes that form no record is read to its end and then reported as broken. Only a window of the
+// file is in memory.
 class DlfReader final : public CaptureReader {
 public:
     DlfReader(const std::string& path, std::unique_ptr<RegularFile> file);
@@ -21,9 +21,9 @@ private:
     void readOn();
 
     std::unique_ptr<RegularFile> _file;
-    std::uint64_t _windowEnd = 0;       // in the file
-    Bytes _window;                      // what the records lie in
-    std::optional<DlfRecords> _records; // none when the file cannot be read
+    std::uint64_t _windowEnd = 0; // offset in the file
+    Bytes _window;
+    std::optional<DlfRecords> _records; // none if the file cannot be read
     Bytes _message;
 };
 

@@ -15,18 +15,18 @@ constexpr std::uint8_t kPrefixMark = MessageFrame::kPrefixMark;
 constexpr std::size_t kPrefixLength = MessageFrame::kPrefixLength;
 constexpr std::uint16_t kVersionReportCode = 0x1FFD;
 
-constexpr int kDepth = 4; // records that are looked at before a reading is chosen
-// What a record earns. One that fits by its length alone may be chance, one whose time is near is hardly.
+constexpr int kDepth = 4; // records to look ahead before choosing a reading
+// Score: a plausible length may be chance; a plausible time rarely is.
 constexpr int kFits = 1;
 constexpr int kTimeIsNear = 8;
-constexpr int kEndsTheFile = 4; // with a time that is near it earns what more records would
-// Times are in whatever unit. In microseconds this is days, in the finest units of modems it is hours.
+constexpr int kEndsTheFile = 4; // makes up for the records that cannot follow
+// Any unit: 12 days in microseconds, hours in the finest units that modems use.
 constexpr std::uint64_t kNear = std::uint64_t{1} << 40;
-constexpr int kFoundAgain = kFits + kTimeIsNear; // after lost bytes
+constexpr int kFoundAgain = kFits + kTimeIsNear; // needed after skipped bytes
 
-// No decision on a record looks further ahead.
+// The farthest that any decision on a record looks ahead.
 constexpr std::size_t kLookAhead = (kDepth + 1) * (UINT16_MAX + kPrefixLength + 1);
-// So many records with times that are near make a DLF, whatever follows.
+// After this many records with plausible times the file is a DLF, whatever follows.
 constexpr std::size_t kEnoughRecords = 4096;
 
 std::uint64_t timeIn(PacketReader header)
@@ -52,7 +52,7 @@ bool isLogType(std::uint8_t byte)
 
 } // namespace
 
-// The likelier ones first: they win when several fit equally well.
+// Likelier forms first: they win ties.
 const std::array<DlfRecords::Form, 4> DlfRecords::kFormsInSnapshots = {
     {{0, true}, {kPrefixLength, true}, {0, false}, {kPrefixLength - 1, true}}};
 const std::array<DlfRecords::Form, 4> DlfRecords::kForms = {
@@ -132,8 +132,8 @@ bool DlfRecords::beginsWithRecords() const
 
 bool DlfRecords::makeUp(std::uint64_t size, const std::function<ByteView(std::uint64_t place)>& headerAt)
 {
-    // Two bytes that could be a length stand at the beginning of many a file, and again where they lead to.
-    // But such lengths hardly lead to the very end, nor from one time to another that is near.
+    // Many files begin with two bytes that could be a length, and have such bytes again where it leads. But
+    // such lengths rarely lead exactly to the end, or from one time to a near one.
     std::uint64_t end = 0;
     std::size_t neighbours = 0;
     std::size_t nearOnes = 0;

@@ -18,58 +18,58 @@ namespace orvex {
 //   4   u64  time
 //   12       payload
 //
-// A DLF that a snapshot holds is not so clean. It was written by dropping the first byte of each refresh
-// interval, so that only the first message of an interval stands there as such a record. The others still
-// have their log type (1 or 255) in front, and before it, where there is one, a prefix of two bytes, 0x81 and
-// any other; of a prefix that begins an interval the second byte is left.
+// The DLF in a snapshot is less clean. It is written by dropping the first byte of each refresh interval, so
+// only the first message of an interval is a bare record. The others keep their log type (1 or 255) in front,
+// and before that the two-byte prefix (0x81 and any byte) if they have one; a prefix at the start of an
+// interval loses its 0x81.
 //
-// Whether a byte is a log type or the low half of a length cannot be told from the byte alone; of the
-// readings that are possible the one is taken under which the next records fit best too, by their lengths and
-// by times that are near to each other. Bytes under which nothing fits are skipped.
+// A log type cannot be told from the low byte of a length by itself. Of the possible readings, the reader
+// takes the one under which the following records fit best, judged by their lengths and by times close to
+// each other. It skips bytes under which nothing fits.
 class DlfRecords {
 public:
     static constexpr std::size_t kHeaderLength = 12;
 
-    // Of a whole file.
+    // A whole file.
     explicit DlfRecords(ByteView bytes)
         : DlfRecords(bytes, true)
     {
     }
-    // Of the beginning of a file, unless it is whole.
+    // The first window of a file, or all of it.
     DlfRecords(ByteView window, bool isWhole);
 
-    // Goes on in a later window of the file, which begins behind the bytes that are done.
+    // Continues in the next window, which begins after the bytes that are done.
     void moveOn(ByteView window, bool reachesTheEnd);
-    // How many bytes at the front of the window are needed no more.
+    // Number of bytes at the front of the window that are no longer needed.
     std::size_t doneBytes() const { return _last ? std::min(*_last, _place) : _place; }
-    // True when next() needs to see more of the file.
+    // True if next() needs to see more of the file.
     bool wantsMore() const;
 
     struct Record {
-        std::size_t start;                   // of the record itself, in the window
-        std::optional<std::uint8_t> logType; // when it stands in front
+        std::size_t start;                   // of the bare record, in the window
+        std::optional<std::uint8_t> logType; // if present
         ByteView bytes;
         std::uint64_t time;
     };
-    // None at the end, or when more is wanted. Every other call goes on by a byte at least.
+    // None at the end, or if more is wanted. Every other call advances by at least a byte.
     std::optional<Record> next();
 
     std::size_t skippedBytes() const { return _skipped; }
-    // Whether the first bytes make records that belong together: otherwise this is something else than a DLF.
+    // Whether the bytes begin with records that belong together, as a DLF does.
     bool beginsWithRecords() const;
-    // The same for a file of any size, whose header at a place, or what there is of it, the function returns.
+    // The same for a file of any size; the function returns the record header at an offset, possibly cut.
     static bool makeUp(std::uint64_t size, const std::function<ByteView(std::uint64_t place)>& headerAt);
 
 private:
-    // What may stand before a record: so many bytes of a prefix, and a log type.
+    // What may precede a bare record.
     struct Form {
-        std::size_t prefix;
+        std::size_t prefix; // bytes
         bool hasLogType;
     };
     static const std::array<Form, 4> kFormsInSnapshots;
     static const std::array<Form, 4> kForms;
 
-    // How the record at a place may begin.
+    // A possible record at an offset.
     struct Reading {
         std::size_t start;
         bool hasLogType;
@@ -84,10 +84,10 @@ private:
 
     PacketReader _bytes;
     bool _reachesTheEnd; // of the file
-    bool _isSnapshotDLF; // begins with the version report that this system writes
+    bool _isSnapshotDLF; // begins with the version report that Orvex writes
     std::size_t _place = 0;
-    std::optional<std::size_t> _last; // start of the record before
-    bool _isLost = false;             // the bytes before made no record
+    std::optional<std::size_t> _last; // start of the previous record
+    bool _isLost = false;             // the preceding bytes formed no record
     std::size_t _skipped = 0;
 };
 

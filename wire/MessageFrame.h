@@ -4,14 +4,14 @@
 
 namespace orvex {
 
-// The frame of a message on the log channel: at least a packet header long, and, when its first byte is 0x81,
-// with a 2-byte prefix before the packet. The length is that of the message, so a prefixed packet may be two
+// The frame of a message on the log channel: at least as long as a packet header, with a two-byte prefix
+// before the packet if the first byte is 0x81. The check counts the prefix, so a prefixed packet may be two
 // bytes shorter than its header.
 class MessageFrame {
 public:
     static constexpr std::uint8_t kTypeBaseband = 1;
     static constexpr std::uint8_t kTypeExtra = 255;
-    // The first byte of a message that has a prefix before its packet, and the prefix's length.
+    // First byte of a prefix, and its length.
     static constexpr std::uint8_t kPrefixMark = 0x81;
     static constexpr std::size_t kPrefixLength = 2;
 
@@ -21,7 +21,7 @@ public:
     {
     }
 
-    // False when the message is too short to be looked at.
+    // False if the message is too short to be read.
     bool isComplete() const { return _isComplete; }
     Packet packet() const { return _packet.bytes(); }
     std::uint8_t logType() const { return _packet.u8(0); }

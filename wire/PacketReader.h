@@ -9,7 +9,7 @@
 
 namespace orvex {
 
-// A log packet as the sections get it, the optional 2-byte prefix removed:
+// A log packet without the optional two-byte prefix, as the sections get it:
 //
 //   0     u8    log type: 1 baseband packet, 255 extra packet
 //   1     u16   not interpreted
@@ -20,8 +20,8 @@ using Packet = ByteView;
 
 inline constexpr std::size_t kPacketHeaderLength = 13;
 
-// The only place that touches raw bytes. Little-endian reads at an offset; a read that does not lie wholly
-// inside the packet yields 0.
+// The only code that touches raw bytes. Reads are little-endian; a read that is not wholly inside the packet
+// yields 0.
 class PacketReader {
 public:
     explicit PacketReader(Packet packet)
@@ -42,8 +42,8 @@ public:
     std::int16_t s16(std::size_t offset) const { return static_cast<std::int16_t>(u16(offset)); }
     std::int32_t s32(std::size_t offset) const { return static_cast<std::int32_t>(u32(offset)); }
 
-    // An unsigned field of up to 32 bits in the bit string that starts at a byte: bit 0 is the least
-    // significant bit of that byte, bit 8 that of the next.
+    // An unsigned bit field of up to 32 bits. Bit 0 is the least significant bit of the byte at the offset,
+    // bit 8 that of the next byte.
     std::uint32_t bits(std::size_t offset, std::size_t firstBit, std::size_t width) const
     {
         const std::size_t firstByte = offset + firstBit / 8;
@@ -58,7 +58,7 @@ public:
         return static_cast<std::uint32_t>((window >> shift) & mask);
     }
 
-    // All bytes from the offset on; empty beyond the end.
+    // The bytes from the offset on; empty beyond the end.
     PacketReader from(std::size_t offset) const
     {
         return PacketReader(offset < size() ? _bytes.subspan(offset) : Packet());

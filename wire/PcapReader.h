@@ -5,8 +5,8 @@
 
 namespace orvex {
 
-// A pcap file of either byte order, with micro- or nanoseconds, link type 147 (USER0): one message per
-// packet, exactly as it stands on the log channel.
+// Reads a pcap file of either byte order, with micro- or nanoseconds, link type 147 (USER0): one message per
+// packet, exactly as on the log channel.
 class PcapReader final : public CaptureReader {
 public:
     PcapReader(const std::string& path, RegularFile& file);
@@ -18,8 +18,8 @@ public:
 private:
     struct Pcap;
 
-    std::unique_ptr<Pcap> _pcap;        // null when the file cannot be read
-    std::size_t _incompletePackets = 0; // the capture holds only their beginning
+    std::unique_ptr<Pcap> _pcap;        // null if the file cannot be read
+    std::size_t _incompletePackets = 0; // cut by the capture's snapshot length
 };
 
 } // namespace orvex

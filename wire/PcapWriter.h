@@ -9,14 +9,14 @@
 namespace orvex {
 
 // Writes log messages as a pcap file with microseconds and link type 147 (USER0), one message per packet.
-// After the first failure nothing more is written.
+// Stops at the first failure.
 class PcapWriter {
 public:
-    // Readers refuse a file with a longer packet. Of a longer message the beginning is written, and its true
-    // length; readers leave it out.
+    // Readers refuse files with longer packets. A longer message is written cut, with its true length;
+    // readers skip it.
     static constexpr std::size_t kLongestPacket = 262'144;
 
-    // An existing file is overwritten.
+    // Overwrites an existing file.
     explicit PcapWriter(const std::string& path);
     ~PcapWriter();
     PcapWriter(const PcapWriter&) = delete;
@@ -25,14 +25,14 @@ public:
     void write(ByteView message, std::chrono::microseconds time);
     void flush();
 
-    // One line with the file's path; empty while everything could be written.
+    // One line that includes the path; empty if there is no error.
     const std::string& error() const { return _error; }
 
 private:
     struct Dump;
 
     std::string _path;
-    std::unique_ptr<Dump> _dump; // null when the file cannot be written
+    std::unique_ptr<Dump> _dump; // null if the file cannot be written
     std::string _error;
 };
 

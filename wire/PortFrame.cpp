@@ -40,9 +40,9 @@ Bytes encodedFrame(const Frame& frame)
 
 void FrameReader::append(ByteView bytes)
 {
-    // The one move of what is left, an incomplete frame as a rule, per read.
+    // Moves the rest, usually an incomplete frame, once per read.
     _bytes.erase(_bytes.begin(), _bytes.begin() + static_cast<std::ptrdiff_t>(std::exchange(_taken, 0)));
-    if (_bytes.size() >= kFrameHeaderSize) // room for the frame, not for twice as much
+    if (_bytes.size() >= kFrameHeaderSize) // exact, so that the buffer does not double
         _bytes.reserve(
             kFrameHeaderSize + std::min<std::size_t>(u32(_bytes, 0), kLargestPayload) + bytes.size());
     _bytes.insert(_bytes.end(), bytes.begin(), bytes.end());
@@ -54,7 +54,7 @@ std::optional<Frame> FrameReader::take()
     if (_fault || rest.size() < kFrameHeaderSize) {
         constexpr std::size_t kKeptCapacity = std::size_t{1} << 20;
         if (rest.empty() && _bytes.capacity() > kKeptCapacity) {
-            Bytes().swap(_bytes); // after an exceptionally long frame
+            Bytes().swap(_bytes); // frees what an exceptionally long frame took
             _taken = 0;
         }
         return std::nullopt;

@@ -8,7 +8,7 @@
 
 namespace orvex {
 
-// What travels on the sockets of message ports, little-endian:
+// The frames on the sockets of message ports, little-endian:
 //
 //    0  u32  length of the payload
 //    4  i32  message id
@@ -27,28 +27,28 @@ struct Frame {
     ByteView payload;
 };
 
-// The bytes of a whole frame. The payload must not be longer than kLargestPayload.
+// A whole frame. The payload must not exceed kLargestPayload.
 Bytes encodedFrame(const Frame& frame);
 
-// Cuts a byte stream into frames.
+// Splits a byte stream into frames.
 class FrameReader {
 public:
-    // Takes bytes in the order of the stream. Payloads handed out before are gone, here and in take().
+    // Appends bytes of the stream. Like take(), invalidates payloads returned earlier.
     void append(ByteView bytes);
 
-    // The next whole frame; none when it is not complete yet or the stream is broken.
+    // The next whole frame. None if it is incomplete or the stream is broken.
     std::optional<Frame> take();
 
-    // Why nothing more can be read, as a header made no sense; null while all is well.
+    // Why a header was invalid, after which nothing more can be read. Null if there is no error.
     const char* fault() const { return _fault; }
-    // True when the stream ends inside a frame.
+    // True if the stream ends inside a frame.
     bool isInsideFrame() const { return partialBytes() > 0; }
-    // Bytes that wait for the rest of their frame.
+    // Bytes waiting for the rest of their frame.
     std::size_t partialBytes() const { return _bytes.size() - _taken; }
 
 private:
     Bytes _bytes;
-    std::size_t _taken = 0; // bytes at the front that were handed out
+    std::size_t _taken = 0; // bytes at the front already returned
     const char* _fault = nullptr;
 };
 

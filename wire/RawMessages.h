@@ -6,10 +6,10 @@
 
 namespace orvex {
 
-// The messages that a snapshot keeps of one refresh interval: baseband packets back to back, each of the
-// length that its header tells:
+// Walks the raw messages of one refresh interval in a snapshot: baseband packets back to back, their lengths
+// in their headers:
 //
-//   0  u8   0x81 when a prefix of 2 bytes stands before the packet; else the packet begins here
+//   0  u8   0x81 if a two-byte prefix precedes the packet; otherwise the packet begins here
 //   0  u8   log type
 //   1  u16  length of the packet without the log type
 class RawMessages {
@@ -19,9 +19,9 @@ public:
     {
     }
 
-    // The next one, its prefix included. None at the end, or where a length leads nowhere.
+    // The next message with its prefix. None at the end or at an invalid length.
     std::optional<ByteView> next();
-    // Bytes that are not yet walked. After the last message: those that make none.
+    // Bytes not yet walked. After the last message: those that form none.
     std::size_t rest() const { return _rest.size(); }
 
 private:

@@ -57,7 +57,7 @@ void ReadAhead::takeBatch()
     _offset = 0;
     if (_batch.following == Status::message)
         return;
-    // The thread leaves the reader alone from here on.
+    // The thread no longer uses the reader from here on.
     _omissions = _reader->omissions();
     if (_batch.following == Status::broken)
         failAs(*_reader);
@@ -65,7 +65,7 @@ void ReadAhead::takeBatch()
 
 void ReadAhead::read()
 {
-    Batch batch; // takes turns with the others, so that all keep their storage
+    Batch batch; // swapped with the others, so that all keep their storage
     while (batch.following == Status::message) {
         batch.clear();
         while (batch.bytes.size() < kBatchBytes && (batch.following = _reader->next()) == Status::message) {

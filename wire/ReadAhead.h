@@ -9,9 +9,8 @@
 
 namespace orvex {
 
-// Reads a capture in a thread of its own, some hundred KB ahead of whoever takes its messages, so that nobody
-// waits for the file while there is something to decode. Messages and end are those of the reader it is
-// given.
+// Reads a capture in a thread of its own, some hundred KB ahead, so that decoding does not wait for the file.
+// Returns what the wrapped reader returns.
 class ReadAhead final : public CaptureReader {
 public:
     explicit ReadAhead(std::unique_ptr<CaptureReader> reader);
@@ -20,11 +19,11 @@ public:
     ReadAhead& operator=(const ReadAhead&) = delete;
 
     Status next() override;
-    // Of the whole capture, once next() has come to its end; nothing before.
+    // Of the whole capture, after next() has reached its end; nothing before.
     std::string omissions() const override { return _omissions; }
 
 private:
-    // Messages back to back, and what follows them: more messages, or the end.
+    // Messages back to back, and whether the end follows.
     struct Batch {
         struct Entry {
             std::size_t length;
@@ -41,17 +40,17 @@ private:
     void read();
     void takeBatch();
 
-    std::unique_ptr<CaptureReader> _reader; // the thread's alone until that has ended
-    Batch _batch;                           // the taker's
-    std::size_t _next = 0;                  // in its entries
-    std::size_t _offset = 0;                // in its bytes
+    std::unique_ptr<CaptureReader> _reader; // the thread's until it has ended
+    Batch _batch;                           // the caller's
+    std::size_t _next = 0;                  // index of its next entry
+    std::size_t _offset = 0;                // of its next message
     std::string _omissions;
 
     std::mutex _mutex;
     std::condition_variable _changed;
-    Batch _read; // waits for the taker
+    Batch _read; // ready for the caller
     bool _isRead = false;
-    bool _isLeft = false; // nobody takes any more
+    bool _isLeft = false; // the caller is gone
     std::thread _thread;
 };
 
