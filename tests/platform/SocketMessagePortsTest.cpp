@@ -325,7 +325,7 @@ TEST_F(SocketMessagePortsTest, TelephonyServiceSaysWhyThereIsNoChannel)
         {"<dict><key>ErrorCode</key><string>0</string></dict>", EPROTO},
     };
     for (const auto& [reply, code] : cases) {
-        const ServedPort service(directory(), telephony::kServicePortName, [&](auto, auto) {
+        const ServedPort service(directory(), telephony::kServicePortName, [&reply = reply](auto, auto) {
             return reply.empty() ? std::nullopt : std::optional(bytesOf(test::xmlList(reply)));
         });
         const auto answer = telephony.connect({})->createNetworkMonitorLogChannel("my.port");

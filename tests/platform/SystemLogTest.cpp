@@ -133,7 +133,7 @@ TEST(FatalErrorsDeathTest, LastLineSaysWhatWasThrown)
         {[] { std::terminate(); }, "<3>Fatal: terminated without an exception\n"},
     };
     for (const auto& [fault, line] : cases) {
-        const auto fail = [&fault](SystemLog&) noexcept {
+        const auto fail = [&fault = fault](SystemLog&) noexcept {
             installFatalErrorHandler();
             fault();
         };
