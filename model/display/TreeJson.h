@@ -2,7 +2,9 @@
 
 #include "OrvexModelNode.h"
 
+#include <cstddef>
 #include <ostream>
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -24,14 +26,23 @@ public:
     // Before each value of an object.
     void key(std::string_view name);
     void string(std::string_view text);
+    void number(std::size_t number);
+    void boolean(bool value);
+    void null();
     void member(std::string_view name, std::string_view text)
     {
         key(name);
         string(text);
     }
+    void member(std::string_view name, std::size_t value)
+    {
+        key(name);
+        number(value);
+    }
     // After the outermost value.
     void endDocument() { _stream << '\n'; }
 
+    bool isCompact() const { return _isCompact; }
     // From the next value on. Set it back before the enclosing container is closed.
     void setCompact(bool isCompact) { _isCompact = isCompact; }
 
@@ -47,11 +58,11 @@ private:
     bool _isCompact = false;
 };
 
-// Writes the display tree as one JSON object: {"name", "path", "children"} for a branch, {"name", "path",
-// "value"} for a leaf.
+// Writes the display tree, or a branch of it that has the path, as one JSON object: {"name", "path",
+// "children"} for a branch, {"name", "path", "value"} for a leaf.
 //
 // A tree of 32 levels or more below its root is written compact and without paths. Paths repeat every name
 // above them, and indentation grows too: a few KB of a hostile report would become gigabytes.
-void writeTreeJson(JsonWriter& json, const OrvexModelNode& root);
+void writeTreeJson(JsonWriter& json, const OrvexModelNode& root, const std::string& path = "/");
 
 } // namespace orvex

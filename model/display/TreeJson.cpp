@@ -63,6 +63,24 @@ void JsonWriter::string(std::string_view text)
     _stream << Json(text).dump(-1, ' ', false, Json::error_handler_t::replace);
 }
 
+void JsonWriter::number(std::size_t number)
+{
+    beginValue();
+    _stream << number;
+}
+
+void JsonWriter::boolean(bool value)
+{
+    beginValue();
+    _stream << (value ? "true" : "false");
+}
+
+void JsonWriter::null()
+{
+    beginValue();
+    _stream << "null";
+}
+
 void JsonWriter::open(char bracket)
 {
     beginValue();
@@ -96,13 +114,13 @@ void JsonWriter::beginLine()
     std::fill_n(std::ostreambuf_iterator<char>(_stream), kIndentation * _isEmpty.size(), ' ');
 }
 
-void writeTreeJson(JsonWriter& json, const OrvexModelNode& root)
+void writeTreeJson(JsonWriter& json, const OrvexModelNode& root, const std::string& path)
 {
-    const std::string rootPath = "/";
     const bool isDeep = levelsBelow(root) >= kLevelsWithPaths;
-    json.setCompact(isDeep);
-    writeNode(json, root, isDeep ? nullptr : &rootPath);
-    json.setCompact(false);
+    const bool wasCompact = json.isCompact();
+    json.setCompact(wasCompact || isDeep);
+    writeNode(json, root, isDeep ? nullptr : &path);
+    json.setCompact(wasCompact);
 }
 
 } // namespace orvex
