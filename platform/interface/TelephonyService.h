@@ -15,6 +15,7 @@ public:
         std::int32_t errorDomain = 0;
         long errorCode = 0; // 0 is success; an errno value when the service could not be asked
         std::optional<std::string> remotePortName;
+        std::string failure = {}; // why the service could not be asked; empty when it answered
     };
 
     virtual ~TelephonyConnection() = default;

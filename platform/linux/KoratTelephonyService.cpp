@@ -20,8 +20,9 @@ constexpr auto kReceiveTimeout = 1s;
 
 TelephonyConnection::LogChannelReply failure(int error, const std::string& why)
 {
-    systemLog(Priority::error, "Telephony service: %s", visibleText(why).c_str());
-    return {0, error, std::nullopt};
+    const std::string shown = visibleText(why);
+    systemLog(Priority::error, "Telephony service: %s", shown.c_str());
+    return {0, error, std::nullopt, shown};
 }
 
 class KoratConnection final : public TelephonyConnection {

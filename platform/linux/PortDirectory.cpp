@@ -29,12 +29,6 @@ std::string pathFromEnvironment()
     return "/tmp/orvex-" + std::to_string(geteuid());
 }
 
-bool refuse(const std::string& path, const char* why)
-{
-    systemLog(Priority::error, "Port directory %s: %s", path.c_str(), why);
-    return false;
-}
-
 class DirectoryLock {
 public:
     explicit DirectoryLock(const std::string& path)
@@ -70,24 +64,32 @@ PortDirectory::PortDirectory()
 {
 }
 
-bool PortDirectory::isUsable() const
+std::string PortDirectory::fault() const
 {
     constexpr mode_t kOwnerOnly = 0700;
     constexpr mode_t kOthers = 0077;
     if (mkdir(_path.c_str(), kOwnerOnly) != 0 && errno != EEXIST)
-        return refuse(_path, std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
+        return std::strerror(errno); // NOLINT(concurrency-mt-unsafe)
     struct stat status { };
     if (lstat(_path.c_str(), &status) != 0)
-        return refuse(_path, std::strerror(errno)); // NOLINT(concurrency-mt-unsafe)
+        return std::strerror(errno); // NOLINT(concurrency-mt-unsafe)
     if (S_ISLNK(status.st_mode))
-        return refuse(_path, "refused, it is a symbolic link");
+        return "refused, it is a symbolic link";
     if (!S_ISDIR(status.st_mode))
-        return refuse(_path, "refused, it is not a directory");
+        return "refused, it is not a directory";
     if (status.st_uid != geteuid())
-        return refuse(_path, "refused, it belongs to another user");
+        return "refused, it belongs to another user";
     if ((status.st_mode & kOthers) != 0)
-        return refuse(_path, "refused, it is open to other users");
-    return true;
+        return "refused, it is open to other users";
+    return {};
+}
+
+bool PortDirectory::isUsable() const
+{
+    const std::string why = fault();
+    if (!why.empty())
+        systemLog(Priority::error, "Port directory %s: %s", _path.c_str(), why.c_str());
+    return why.empty();
 }
 
 std::optional<std::string> PortDirectory::socketPath(const std::string& portName) const

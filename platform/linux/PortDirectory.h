@@ -19,8 +19,10 @@ public:
 
     const std::string& path() const { return _path; }
 
-    // Creates the directory if it is absent. False, with a line in the system log, when that fails or the
-    // directory is a symbolic link, something else, another user's or open to others.
+    // Creates the directory if it is absent. Why it cannot be used: that fails, or the directory is a
+    // symbolic link, something else, another user's or open to others. Empty when all is well.
+    std::string fault() const;
+    // False, with a line in the system log, when there is a fault.
     bool isUsable() const;
 
     // The socket file of a port. None, with a line in the system log, when the name is empty, leads out of
