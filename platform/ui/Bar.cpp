@@ -19,6 +19,8 @@ constexpr int kChevronGap = 7;
 
 constexpr int kSideMargin = 4;
 constexpr int kTitleMargin = 10;
+constexpr int kTitleFontSize = 17;
+constexpr int kSmallestTitle = 13;       // pixels
 constexpr double kBackButtonShare = 0.4; // of the bar, which it may take even if the title must give way
 
 } // namespace
@@ -89,7 +91,7 @@ void BarButton::paintEvent(QPaintEvent*)
 
 NavigationBar::NavigationBar(QWidget* parent)
     : Bar(parent)
-    , _titleLabel(new TextLabel(Theme::boldSystemFont(17), this))
+    , _titleLabel(new TextLabel(Theme::boldSystemFont(kTitleFontSize), this))
     , _backButton(new BarButton(BarButton::Style::back, {}, this))
 {
     _backButton->hide();
@@ -104,13 +106,15 @@ void NavigationBar::setTitles(const QString& title, const QString& backTitle, bo
     layoutTitle();
 }
 
-// The title is centred, moves aside for a broad back button and is elided only when that is not enough.
+// The title is centred, moves aside for a broad back button, then shrinks, and is elided only when all that
+// is not enough.
 void NavigationBar::layoutTitle()
 {
+    const QFont usual = Theme::boldSystemFont(kTitleFontSize);
     int left = kTitleMargin;
     if (!_backButton->isHidden()) {
         const int besideTitle =
-            (width() - sizeOfLine(_title, _titleLabel->font()).width()) / 2 - kTitleMargin - kSideMargin;
+            (width() - sizeOfLine(_title, usual).width()) / 2 - kTitleMargin - kSideMargin;
         const int widest = std::max(besideTitle, static_cast<int>(width() * kBackButtonShare));
         const QSize size = _backButton->sizeHint();
         _backButton->setGeometry(
@@ -118,6 +122,7 @@ void NavigationBar::layoutTitle()
         left = _backButton->geometry().right() + kTitleMargin;
     }
     const int room = std::max(0, width() - kTitleMargin - left);
+    _titleLabel->setFont(fittedFont(usual, _title, room, kSmallestTitle));
     const QFontMetrics metrics(_titleLabel->font());
     const QString fitted = metrics.elidedText(_title, Qt::ElideRight, room);
     const int titleWidth = sizeOfLine(fitted, _titleLabel->font()).width();

@@ -18,6 +18,7 @@ NavigationStack::NavigationStack(std::unique_ptr<Screen> root, QWidget* parent)
     , _bar(new NavigationBar(this))
     , _pages(new QWidget(this))
     , _edge(new QWidget(_pages))
+    , _veil(new Veil(this))
     , _toolbar(new Toolbar(this))
 {
     QPalette edgePalette;
@@ -140,6 +141,7 @@ void NavigationStack::layoutParts()
         return;
     _slide.finish();
     _pages->setGeometry(pages);
+    _veil->setGeometry(pages);
     topScreen().setGeometry(_pages->rect());
 }
 

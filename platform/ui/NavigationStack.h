@@ -2,6 +2,7 @@
 
 #include "Animation.h"
 #include "Screen.h"
+#include "Veil.h"
 
 #include <memory>
 #include <vector>
@@ -42,6 +43,8 @@ public:
     bool isAnimating() const { return _slide.isRunning(); }
 
     void setToolbarHidden(bool hidden);
+    // Dims the screens, but not the bars.
+    void setDimmed(bool dimmed) { _veil->setVisible(dimmed); }
 
     // Called by screens.
     void titleChanged();
@@ -65,6 +68,7 @@ private:
     NavigationBar* _bar;
     QWidget* _pages;
     QWidget* _edge; // between the two screens of a slide, child of _pages
+    Veil* _veil;    // over _pages
     Toolbar* _toolbar;
     std::vector<Screen*> _screens; // children of _pages
     Delegate* _delegate = nullptr;

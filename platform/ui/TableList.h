@@ -2,6 +2,7 @@
 
 #include "TableCell.h"
 
+#include <QBasicTimer>
 #include <QPointF>
 #include <QWidget>
 
@@ -82,6 +83,10 @@ public:
         virtual std::unique_ptr<TableCell> cellForRow(TableList& list, int row) = 0;
         // The row was tapped or opened by key and is now selected; absent after a tap below the last row.
         virtual void didSelectRow(TableList& list, std::optional<int> row) = 0;
+        // A long press, a right click or the menu key asked for the menu of a row; absent below the last.
+        virtual void wantsMenu(TableList& /*list*/, std::optional<int> /*row*/, const QPoint& /*globalPlace*/)
+        {
+        }
     };
 
     static constexpr int kDefaultRowHeight = 44;
@@ -115,6 +120,8 @@ public:
     std::optional<int> rowAt(const QPointF& position) const;
 
     std::optional<int> selectedRow() const { return _selectedRow; }
+    // The selected row, else the one that was last; absent before the first.
+    std::optional<int> currentRow() const { return _selectedRow ? _selectedRow : _lastSelectedRow; }
     void selectRow(int row);
     void deselectRow();
 
@@ -134,6 +141,8 @@ protected:
     void mouseReleaseEvent(QMouseEvent* event) override;
     void wheelEvent(QWheelEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
+    void contextMenuEvent(QContextMenuEvent* event) override;
+    void timerEvent(QTimerEvent* event) override;
 
 private:
     void layoutRows();
@@ -159,6 +168,7 @@ private:
     std::optional<int> _pressedRow;
     std::optional<int> _gestureRow; // the row a gesture scrolls sideways
     std::optional<TableDrag> _drag;
+    QBasicTimer _longPress;
 };
 
 } // namespace orvex

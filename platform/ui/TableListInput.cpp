@@ -4,10 +4,12 @@
 #include "TableList.h"
 
 #include <QApplication>
+#include <QContextMenuEvent>
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QScrollEvent>
 #include <QScroller>
+#include <QTimerEvent>
 #include <QWheelEvent>
 
 #include <algorithm>
@@ -19,6 +21,7 @@ namespace {
 constexpr int kSidewaysKeyStep = 40; // pixels
 constexpr int kWheelLine = 20;       // pixels for a line of the wheel setting
 constexpr double kWheelNotch = 120;  // angle units in a notch
+constexpr int kLongPressMilliseconds = 600;
 
 qint64 millisecondsOf(const QMouseEvent& event)
 {
@@ -69,14 +72,17 @@ void TableList::mousePressEvent(QMouseEvent* event)
     const bool stopsFlick = scroller->state() == QScroller::Scrolling;
     _drag.emplace(event->position(), stopsFlick);
     scroller->handleInput(QScroller::InputPress, event->position(), millisecondsOf(*event));
-    if (!stopsFlick)
-        setPressedRow(rowAt(event->position()));
+    if (stopsFlick)
+        return;
+    setPressedRow(rowAt(event->position()));
+    _longPress.start(kLongPressMilliseconds, this);
 }
 
 void TableList::mouseMoveEvent(QMouseEvent* event)
 {
     if (!_drag || !_drag->moveTo(event->position()))
         return;
+    _longPress.stop();
     setPressedRow(std::nullopt);
     QScroller::scroller(this)->handleInput(
         QScroller::InputMove, _drag->scrollPosition(), millisecondsOf(*event));
@@ -86,6 +92,7 @@ void TableList::mouseReleaseEvent(QMouseEvent* event)
 {
     if (event->button() != Qt::LeftButton)
         return QWidget::mouseReleaseEvent(event);
+    _longPress.stop();
     if (!_drag)
         return;
     _drag->moveTo(event->position());
@@ -101,6 +108,30 @@ void TableList::mouseReleaseEvent(QMouseEvent* event)
         selectRow(*row);
     if (_source)
         _source->didSelectRow(*this, row);
+}
+
+// Ends the press, so that the release, which the menu gets, is no tap.
+void TableList::timerEvent(QTimerEvent* event)
+{
+    if (event->timerId() != _longPress.timerId())
+        return QWidget::timerEvent(event);
+    _longPress.stop();
+    if (!_drag || !_source)
+        return;
+    const QPointF place = _drag->start();
+    _drag.reset();
+    QScroller::scroller(this)->handleInput(QScroller::InputRelease, place);
+    const auto row = _pressedRow; // a reload may have moved it since the press
+    setPressedRow(std::nullopt);
+    _source->wantsMenu(*this, row, mapToGlobal(place.toPoint()));
+}
+
+void TableList::contextMenuEvent(QContextMenuEvent* event)
+{
+    if (!_source)
+        return;
+    const bool byKey = event->reason() == QContextMenuEvent::Keyboard;
+    _source->wantsMenu(*this, byKey ? _selectedRow : rowAt(event->pos()), event->globalPos());
 }
 
 void TableList::wheelEvent(QWheelEvent* event)

@@ -70,6 +70,13 @@ QSize sizeOfLine(const QString& text, const QFont& font)
     return {metrics.horizontalAdvance(inOneLine(text)), metrics.height()};
 }
 
+QFont fittedFont(QFont font, const QString& text, int room, int smallest)
+{
+    while (font.pixelSize() > smallest && sizeOfLine(text, font).width() > room)
+        font.setPixelSize(font.pixelSize() - 1);
+    return font;
+}
+
 TextField::TextField(QWidget* parent)
     : QLineEdit(parent)
 {

@@ -24,6 +24,9 @@ protected:
 // The size of one line of text as a label draws it, in whole pixels.
 QSize sizeOfLine(const QString& text, const QFont& font);
 
+// The largest size of the font in which the text has room, not below the smallest; in pixels.
+QFont fittedFont(QFont font, const QString& text, int room, int smallest);
+
 // A one-line text field in the colours of the theme.
 class TextField final : public QLineEdit {
 public:

@@ -1,10 +1,13 @@
 #include "Theme.h"
 
 #include <QFontDatabase>
+#include <QFontInfo>
 #include <QGuiApplication>
 #include <QPainter>
 #include <QPalette>
 #include <QPolygonF>
+
+#include <algorithm>
 
 namespace orvex {
 
@@ -51,7 +54,7 @@ const Theme*& theCurrent()
 QFont fontOfSize(int points)
 {
     QFont font = QFontDatabase::systemFont(QFontDatabase::GeneralFont);
-    font.setPixelSize(points);
+    font.setPixelSize(qRound(points * Theme::fontScale()));
     return font;
 }
 
@@ -77,6 +80,13 @@ void Theme::use(Mode mode)
     palette.setColor(QPalette::HighlightedText, theme.background);
     palette.setColor(QPalette::PlaceholderText, theme.accessory);
     QGuiApplication::setPalette(palette);
+}
+
+double Theme::fontScale()
+{
+    constexpr double kUsualPixels = 11 * 96 / 72.0;
+    constexpr double kLargest = 2;
+    return std::clamp(QFontInfo(QGuiApplication::font()).pixelSize() / kUsualPixels, 1.0, kLargest);
 }
 
 QFont Theme::systemFont(int points)

@@ -27,7 +27,10 @@ struct Theme {
     // desktop's palette.
     static void use(Mode mode);
 
-    // One point of the design is one device-independent pixel.
+    // How much larger than usual the desktop's font is: 1 up to 11 points, 2 from 22 on. Fonts grow with it.
+    static double fontScale();
+
+    // One point of the design is one device-independent pixel, before the scale.
     static QFont systemFont(int points);
     static QFont boldSystemFont(int points);
 };

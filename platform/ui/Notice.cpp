@@ -1,0 +1,86 @@
+#include "Notice.h"
+
+#include "Theme.h"
+
+#include <QEvent>
+#include <QPainter>
+#include <QTimerEvent>
+
+namespace orvex {
+
+namespace {
+constexpr int kMillisecondsShown = 5000;
+constexpr int kFontSize = 14;
+constexpr int kMargin = 10;
+constexpr int kPadding = 12;
+constexpr int kCornerRadius = 10;
+constexpr int kAboveBottom = 54; // clears the toolbar
+// Paths have no blanks to break them at.
+constexpr int kLayout = Qt::AlignLeft | Qt::AlignVCenter | Qt::TextWrapAnywhere;
+} // namespace
+
+Notice& Notice::show(QWidget& window, const QString& text)
+{
+    // Not findChild(), which needs a meta-object of the class.
+    for (QObject* const child : window.children()) {
+        if (auto* const former = dynamic_cast<Notice*>(child)) {
+            former->hide();
+            former->deleteLater();
+        }
+    }
+    auto* const notice = new Notice(window, text);
+    notice->place();
+    notice->QWidget::show();
+    notice->raise();
+    return *notice;
+}
+
+Notice::Notice(QWidget& window, const QString& text)
+    : QWidget(&window)
+    , _text(text)
+{
+    setAttribute(Qt::WA_TransparentForMouseEvents);
+    setFont(Theme::systemFont(kFontSize));
+    setAccessibleName(text);
+    window.installEventFilter(this);
+    _shown.start(kMillisecondsShown, this);
+}
+
+void Notice::place()
+{
+    const QSize window = parentWidget()->size();
+    const int width = window.width() - 2 * kMargin;
+    const QRect room(0, 0, width - 2 * kPadding, window.height());
+    const int height = fontMetrics().boundingRect(room, kLayout, _text).height() + 2 * kPadding;
+    setGeometry(kMargin, window.height() - kAboveBottom - height, width, height);
+}
+
+bool Notice::eventFilter(QObject* watched, QEvent* event)
+{
+    if (event->type() == QEvent::Resize)
+        place();
+    return QWidget::eventFilter(watched, event);
+}
+
+void Notice::timerEvent(QTimerEvent* event)
+{
+    if (event->timerId() != _shown.timerId())
+        return QWidget::timerEvent(event);
+    _shown.stop();
+    hide();
+    deleteLater();
+}
+
+void Notice::paintEvent(QPaintEvent*)
+{
+    const Theme& theme = Theme::current();
+    QPainter painter(this);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(theme.text);
+    painter.drawRoundedRect(rect(), kCornerRadius, kCornerRadius);
+    painter.setPen(theme.background);
+    painter.drawText(rect().adjusted(kPadding, kPadding, -kPadding, -kPadding), kLayout, _text);
+}
+
+} // namespace orvex

@@ -1,0 +1,31 @@
+#pragma once
+
+#include <QBasicTimer>
+#include <QWidget>
+
+namespace orvex {
+
+// A message on a card at the bottom of a window, above the toolbar, that goes by itself after a few seconds.
+// It takes no input. A new one replaces the old one.
+class Notice final : public QWidget {
+public:
+    // The notice deletes itself.
+    static Notice& show(QWidget& window, const QString& text);
+
+    const QString& text() const { return _text; }
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
+    void timerEvent(QTimerEvent* event) override;
+
+private:
+    Notice(QWidget& window, const QString& text);
+
+    void place();
+
+    QString _text;
+    QBasicTimer _shown;
+};
+
+} // namespace orvex
