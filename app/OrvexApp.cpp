@@ -4,7 +4,9 @@
 #include "OrvexPaneController.h"
 #include "OrvexSaveViewController.h"
 
+#include "Notice.h"
 #include "Storage.h"
+#include "VisibleText.h"
 
 #include <filesystem>
 
@@ -46,7 +48,6 @@ OrvexApp::~OrvexApp()
 void OrvexApp::applicationDidFinishLaunching()
 {
     getSaveButtonPref();
-    _window = std::make_unique<Window>(QStringLiteral("Orvex"), _windowSize);
     _model = OrvexModel::create(_platform.session);
     _model->setListener(this);
     _updateMessage = kConnectingMessage;
@@ -54,11 +55,12 @@ void OrvexApp::applicationDidFinishLaunching()
     auto root = std::make_unique<OrvexPaneController>(*this, nullptr, "/");
     // Without the dots, which come with the first status of the session.
     root->setStatus("Connecting", true);
-    auto stack = std::make_unique<NavigationStack>(std::move(root));
-    stack->setDelegate(this);
-    _navController = stack.get();
-    _window->setRootView(std::move(stack));
-    _window->show();
+    _window = std::make_unique<PaneWindow>(QStringLiteral("Orvex"), _windowSize, *this, std::move(root));
+    _window->stack().setDelegate(this);
+    _exposure = new Exposure(_window->window(), [this] { updateScreens(); });
+    _silence = std::make_unique<SilenceWatch>(
+        _platform.session.runLoop, [this](bool isSilent) { _window->stack().setDimmed(isSilent); });
+    _window->window().show();
 
     _platform.session.runLoop.post([self = shared_from_this()] {
         if (self->_model)
@@ -72,7 +74,7 @@ void OrvexApp::applicationWillTerminate()
         return;
     setGSMRSSI(false);
     _updateMessage.reset();
-    _navController = nullptr;
+    _silence.reset();
     _window.reset();
     if (_model)
         _model->setListener(nullptr);
@@ -81,13 +83,24 @@ void OrvexApp::applicationWillTerminate()
 
 void OrvexApp::updateViewControllerFromModel()
 {
-    if (!_model || !_navController)
+    if (!_model || !_window)
         return;
-    reloadPanes(*_navController, _model->topLevelNodes(),
-        [this](const std::string& path) { return _model->nodeAtPath(path); });
     if (_model->isConnected())
         _updateMessage = updateMessageAt(_platform.session.generators.clock.now());
-    updateStatusForViewController(static_cast<OrvexPaneController&>(_navController->topScreen()));
+    _silence->heard();
+    if (_exposure->isSeen())
+        updateScreens();
+    else
+        _model->topLevelNodes(); // asked for all the same: each answer is an entry of the history
+}
+
+void OrvexApp::updateScreens()
+{
+    if (!_model || !_window)
+        return;
+    reloadPanes(_window->stack(), _model->topLevelNodes(),
+        [this](const std::string& path) { return _model->nodeAtPath(path); });
+    updateStatusForViewController(static_cast<OrvexPaneController&>(_window->stack().topScreen()));
 }
 
 void OrvexApp::updateStatusForViewController(OrvexPaneController& screen)
@@ -109,9 +122,14 @@ void OrvexApp::getSaveButtonPref()
     _allowSaveButton = std::filesystem::exists(paths::internalBuildMarker(), ignored);
 }
 
+Screen* OrvexApp::saveViewController() const
+{
+    return _window ? dynamic_cast<OrvexSaveViewController*>(_window->window().modalScreen()) : nullptr;
+}
+
 void OrvexApp::showSaveView()
 {
-    if (!_window || saveViewController())
+    if (!_window || _window->window().modalScreen())
         return;
     // Later: the screen must not be deleted inside the action of its own button.
     auto close = [&runLoop = _platform.session.runLoop, app = weak_from_this()] {
@@ -120,15 +138,18 @@ void OrvexApp::showSaveView()
                 self->closeSaveView();
         });
     };
-    _window->presentModally(std::make_unique<OrvexSaveViewController>(_model->getSaveContents(),
-                                _platform.session.generators.clock, reportDirectory(), std::move(close)),
-        true);
+    auto screen = std::make_unique<OrvexSaveViewController>(
+        _model->getSaveContents(), _platform.session.generators.clock, reportDirectory(), std::move(close));
+    screen->setSavedHandler([this](const std::string& path) {
+        Notice::show(_window->window(), QStringLiteral("Saved ") + QString::fromStdString(visibleText(path)));
+    });
+    _window->window().presentModally(std::move(screen), true);
 }
 
 void OrvexApp::closeSaveView()
 {
     if (saveViewController())
-        _window->dismissModal(true);
+        _window->window().dismissModal(true);
 }
 
 void OrvexApp::setGSMRSSI(bool shown)

@@ -2,7 +2,10 @@
 
 #include "AppPlatform.h"
 #include "OrvexPaneController.h"
+#include "PaneWindow.h"
+#include "SilenceWatch.h"
 
+#include "Exposure.h"
 #include "NavigationStack.h"
 #include "Window.h"
 
@@ -44,23 +47,27 @@ public:
     void showSaveView() override;
     void closeSaveView();
     // Null unless it is shown.
-    Screen* saveViewController() const { return _window ? _window->modalScreen() : nullptr; }
+    Screen* saveViewController() const;
 
     void setGSMRSSI(bool shown);
 
     const std::optional<std::string>& updateMessage() const { return _updateMessage; }
     // All three null before launch and after termination.
-    Window* window() const { return _window.get(); }
-    NavigationStack* navigationStack() const { return _navController; }
+    Window* window() const { return _window ? &_window->window() : nullptr; }
+    NavigationStack* navigationStack() const { return _window ? &_window->stack() : nullptr; }
     OrvexModel* model() const { return _model.get(); }
 
 private:
     OrvexApp(const AppPlatform& platform, const std::optional<QSize>& windowSize);
 
+    // Gives the screens the tree and the status, or leaves that for the time when somebody can see them.
+    void updateScreens();
+
     AppPlatform _platform;
     std::optional<QSize> _windowSize;
-    std::unique_ptr<Window> _window;
-    NavigationStack* _navController = nullptr; // the window's
+    std::unique_ptr<PaneWindow> _window;
+    Exposure* _exposure = nullptr; // the window's
+    std::unique_ptr<SilenceWatch> _silence;
     std::shared_ptr<OrvexModel> _model;
     std::optional<std::string> _updateMessage;
     bool _allowSaveButton = false;

@@ -93,10 +93,31 @@ void OrvexCell::setLayout()
 void OrvexCell::layoutSubviews()
 {
     TableCell::layoutSubviews();
+    fitFonts();
     if (_layout == Kind::branch)
         layoutAsBranch();
     else
         layoutAsLeaf();
+}
+
+void OrvexCell::fitFonts()
+{
+    QFont bold = Theme::boldSystemFont(kFontSize);
+    const double room = contentView()->width() - kMargin;
+    const auto needed = [&] {
+        const int value = _value ? sizeOfLine(_value->text(), bold).width() : 0;
+        return sizeOfLine(_key->text(), bold).width() + (value > 0 ? kKeyValueGap + value : 0);
+    };
+    while (bold.pixelSize() > kFontSize && needed() >= room)
+        bold.setPixelSize(bold.pixelSize() - 1);
+    if (bold.pixelSize() == _key->font().pixelSize())
+        return;
+    _key->setFont(bold);
+    if (_value) {
+        QFont regular = _value->font();
+        regular.setPixelSize(bold.pixelSize());
+        _value->setFont(regular);
+    }
 }
 
 void OrvexCell::layoutAsBranch()

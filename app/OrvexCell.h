@@ -49,6 +49,8 @@ public:
     SidewaysScrollView* sidewaysScrollView() const override { return _view; }
 
 private:
+    // Sets the largest fonts, down to the usual size, in which the row's texts are in view.
+    void fitFonts();
     void layoutAsBranch();
     void layoutAsLeaf();
     void nameForAssistiveTechnology();

@@ -1,12 +1,16 @@
 #include "OrvexPaneController.h"
 
+#include "CopyMenu.h"
 #include "Indicators.h"
 #include "NavigationStack.h"
 #include "NodesByPath.h"
 #include "OrvexCell.h"
+#include "RowText.h"
 #include "TextLabel.h"
 #include "Theme.h"
 #include "VisibleText.h"
+
+#include <QKeyEvent>
 
 #include <algorithm>
 #include <utility>
@@ -19,6 +23,7 @@ namespace {
 // the other kind than its row.
 constexpr const char* kCellIdentifier = "OrvexPaneControllerCell";
 constexpr int kStatusFontSize = 14;
+constexpr int kBesidesStatus = 110; // of the toolbar's width: margins, spinner and Save button
 
 // The row of the child with the name: the former row if it still has that name, else the first that does.
 std::optional<int> rowNamed(const std::string& name, const OrvexModelNode* node, int formerRow)
@@ -134,13 +139,68 @@ void OrvexPaneController::didSelectRow(TableList& list, std::optional<int> row)
     const OrvexModelNodeRef child = _nodes->childNodes()->at(static_cast<std::size_t>(*row));
     if (!child->childNodes())
         return list.deselectRow();
+    openRow(*row, true);
+}
+
+void OrvexPaneController::openRow(int row, bool animated)
+{
     // A press may end after the screen was popped or covered.
     if (!navigationStack() || &navigationStack()->topScreen() != this)
         return;
+    const OrvexModelNodeRef child = _nodes->childNodes()->at(static_cast<std::size_t>(row));
     auto screen =
         std::make_unique<OrvexPaneController>(_host, child, pathByAppending(_keyPath, child->displayName()));
     screen->setStatus(_status, _isLoading);
-    navigationStack()->push(std::move(screen), true);
+    navigationStack()->push(std::move(screen), animated);
+}
+
+bool OrvexPaneController::goToRow(const std::string& name)
+{
+    const auto row = rowNamed(name, _nodes.get(), 0);
+    if (!row)
+        return false;
+    _list->scrollToRow(*row);
+    _list->selectRow(*row);
+    if (childAtRow(*row).childNodes())
+        openRow(*row, false);
+    return true;
+}
+
+QString OrvexPaneController::textOfRow(std::optional<int> row) const
+{
+    return row && *row < numberOfRows(*_list) ? rowText(childAtRow(*row)) : QString();
+}
+
+void OrvexPaneController::wantsMenu(TableList&, std::optional<int> row, const QPoint& globalPlace)
+{
+    showCopyMenu(*this, globalPlace, textOfRow(row), screenText(_nodes.get()));
+}
+
+void OrvexPaneController::keyPressEvent(QKeyEvent* event)
+{
+    const QKeySequence copyScreen(Qt::CTRL | Qt::SHIFT | Qt::Key_C);
+    if (event->matches(QKeySequence::Copy) && _list->currentRow())
+        copyText(textOfRow(_list->currentRow()));
+    else if (event->matches(QKeySequence::Copy) || QKeySequence(event->keyCombination()) == copyScreen)
+        copyText(screenText(_nodes.get()));
+    else if (!typeAhead(*event))
+        Screen::keyPressEvent(event);
+}
+
+bool OrvexPaneController::typeAhead(const QKeyEvent& event)
+{
+    const QString text = event.text();
+    const bool isPlain = (event.modifiers() & ~(Qt::ShiftModifier | Qt::KeypadModifier)) == Qt::NoModifier;
+    if (!isPlain || text.isEmpty() || !text[0].isPrint()
+        || (text == QLatin1String(" ") && !_typeAhead.isTyping()))
+        return false;
+    _typeAhead.type(text);
+    const auto nameOf = [this](int row) { return QString::fromStdString(childAtRow(row).displayName()); };
+    if (const auto row = _typeAhead.row(numberOfRows(*_list), _list->currentRow().value_or(-1), nameOf)) {
+        _list->scrollToRow(*row);
+        _list->selectRow(*row);
+    }
+    return true;
 }
 
 void OrvexPaneController::createToolbarItems()
@@ -151,7 +211,9 @@ void OrvexPaneController::createToolbarItems()
     else
         indicator->stopAnimating();
 
-    auto label = std::make_unique<TextLabel>(Theme::systemFont(kStatusFontSize));
+    const int room = width() - kBesidesStatus;
+    auto label = std::make_unique<TextLabel>(fittedFont(
+        Theme::systemFont(kStatusFontSize), QString::fromStdString(_status), room, kStatusFontSize));
     label->setLine(QString::fromStdString(_status));
     label->setAccessibleDescription(QStringLiteral("Status"));
     label->adjustSize();

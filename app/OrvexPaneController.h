@@ -3,6 +3,7 @@
 #include "OrvexModelNode.h"
 #include "Screen.h"
 #include "TableList.h"
+#include "TypeAhead.h"
 
 #include <QLabel>
 #include <QPointer>
@@ -32,6 +33,7 @@ public:
     // The node is null on the root screen until there is a tree. The host outlives the screen.
     OrvexPaneController(PaneHost& host, OrvexModelNodeRef node, std::string path);
 
+    const OrvexModelNodeRef& node() const { return _nodes; }
     const std::string& path() const { return _keyPath; }
     const std::string& status() const { return _status; }
     bool isLoading() const { return _isLoading; }
@@ -42,6 +44,8 @@ public:
     // An absent status counts as empty.
     void setStatus(const std::optional<std::string>& status, bool isLoading);
     void reloadWithNode(OrvexModelNodeRef node);
+    // Selects the row of that name and, if it is a branch, opens it at once. False when there is none.
+    bool goToRow(const std::string& name);
 
     QWidget& firstResponder() override { return *_list; }
     void viewWillAppear(bool animated) override;
@@ -50,12 +54,19 @@ public:
     int numberOfRows(const TableList& list) const override;
     std::unique_ptr<TableCell> cellForRow(TableList& list, int row) override;
     void didSelectRow(TableList& list, std::optional<int> row) override;
+    // Copies the row or the screen.
+    void wantsMenu(TableList& list, std::optional<int> row, const QPoint& globalPlace) override;
 
 protected:
     void resizeEvent(QResizeEvent* event) override;
+    // Copying, and going to a row by the beginning of its name.
+    void keyPressEvent(QKeyEvent* event) override;
 
 private:
     const OrvexModelNode& childAtRow(int row) const;
+    QString textOfRow(std::optional<int> row) const;
+    void openRow(int row, bool animated);
+    bool typeAhead(const QKeyEvent& event);
     void updateTitle();
     void createToolbarItems();
 
@@ -66,6 +77,7 @@ private:
     bool _isLoading = true;
     QPointer<QLabel> _statusLabel; // the toolbar row's
     TableList* _list;              // child
+    TypeAhead _typeAhead;
 };
 
 // Gives every list screen of the stack its node in the new tree, from the root up. Pops the first screen

@@ -61,6 +61,8 @@ void OrvexSaveViewController::savePressed()
         systemLog(Priority::error, "Unable to write snapshot to %s", path.c_str());
         Alert::show(*this, QStringLiteral("File Error"), QStringLiteral("Unable to write file to disk"),
             QStringLiteral("Close"));
+    } else if (_saved) {
+        _saved(path);
     }
     _close();
 }

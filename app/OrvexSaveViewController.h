@@ -8,6 +8,7 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <utility>
 
 class QLineEdit;
 
@@ -27,6 +28,12 @@ public:
     OrvexSaveViewController(const ArrayRef& saveHistory, const Clock& clock, std::string reportDirectory,
         std::function<void()> close);
     ~OrvexSaveViewController() override;
+
+    // Called with the path of a snapshot that was written, before the screen closes.
+    void setSavedHandler(std::function<void(const std::string& path)> handler)
+    {
+        _saved = std::move(handler);
+    }
 
     TableList& saveContentTable() const;
     QLineEdit& saveDescription() const;
@@ -53,6 +60,7 @@ private:
     const Clock& _clock;
     std::string _reportDirectory;
     std::function<void()> _close;
+    std::function<void(const std::string& path)> _saved;
     Date _timeStamp; // when the screen was opened
     ArrayRef _saveHistory;
     std::unique_ptr<Ui::OrvexSaveViewController> _ui;

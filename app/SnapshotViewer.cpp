@@ -1,6 +1,7 @@
 #include "SnapshotViewer.h"
 
 #include "OrvexPaneController.h"
+#include "PaneWindow.h"
 #include "SnapshotTree.h"
 
 #include "NavigationStack.h"
@@ -11,15 +12,28 @@ namespace orvex {
 
 SnapshotViewer::SnapshotViewer(
     const Snapshot& snapshot, const std::string& name, const std::optional<QSize>& windowSize)
-    : _window(std::make_unique<Window>(
-        QStringLiteral("%1 – Orvex").arg(QString::fromStdString(visibleText(name))), windowSize))
+    : SnapshotViewer(snapshotTree(snapshot), snapshotMessage(snapshot), name, windowSize)
 {
-    auto root = std::make_unique<OrvexPaneController>(*this, snapshotTree(snapshot), "/");
-    root->setStatus(snapshotMessage(snapshot), false); // the screens above take it over
-    auto stack = std::make_unique<NavigationStack>(std::move(root));
-    _navController = stack.get();
-    _window->setRootView(std::move(stack));
-    _window->show();
+}
+
+SnapshotViewer::SnapshotViewer(OrvexModelNodeRef tree, const std::string& status, const std::string& name,
+    const std::optional<QSize>& windowSize)
+{
+    auto root = std::make_unique<OrvexPaneController>(*this, std::move(tree), "/");
+    root->setStatus(status, false); // the screens above take it over
+    const QString title = QStringLiteral("%1 – Orvex").arg(QString::fromStdString(visibleText(name)));
+    _window = std::make_unique<PaneWindow>(title, windowSize, *this, std::move(root));
+    _window->window().show();
+}
+
+const Window& SnapshotViewer::window() const
+{
+    return _window->window();
+}
+
+NavigationStack& SnapshotViewer::navigationStack() const
+{
+    return _window->stack();
 }
 
 SnapshotViewer::~SnapshotViewer() = default;

@@ -12,27 +12,30 @@
 namespace orvex {
 
 class NavigationStack;
+class PaneWindow;
 class Window;
 
-// Shows a saved snapshot on the list screens, without a session.
+// Shows a saved snapshot, or the tree of a capture, on the list screens, without a session.
 class SnapshotViewer final : public PaneHost {
 public:
     // The name goes into the window's title. Without a size the window fills the main screen.
     SnapshotViewer(const Snapshot& snapshot, const std::string& name,
         const std::optional<QSize>& windowSize = std::nullopt);
+    // Shows any tree, with that status.
+    SnapshotViewer(OrvexModelNodeRef tree, const std::string& status, const std::string& name,
+        const std::optional<QSize>& windowSize);
     ~SnapshotViewer() override;
     SnapshotViewer(const SnapshotViewer&) = delete;
     SnapshotViewer& operator=(const SnapshotViewer&) = delete;
 
-    const Window& window() const { return *_window; }
-    NavigationStack& navigationStack() const { return *_navController; }
+    const Window& window() const;
+    NavigationStack& navigationStack() const;
 
     bool offersSaveButton() const override { return false; }
     void showSaveView() override { }
 
 private:
-    std::unique_ptr<Window> _window;
-    NavigationStack* _navController; // the window's
+    std::unique_ptr<PaneWindow> _window;
 };
 
 // The status line of a snapshot.

@@ -1,0 +1,57 @@
+#include "FoundRowCell.h"
+
+#include "TextLabel.h"
+#include "Theme.h"
+
+#include <algorithm>
+
+namespace orvex {
+
+namespace {
+
+constexpr int kFontSize = 15;
+constexpr int kPlaceFontSize = 12;
+constexpr int kMargin = 10;
+constexpr int kGap = 10;
+constexpr double kPlaceTop = 0.55; // of the height
+
+TextLabel* greyLabel(int fontSize, QWidget* parent)
+{
+    auto* const label = new TextLabel(Theme::systemFont(fontSize), parent);
+    QPalette palette = label->palette();
+    palette.setColor(QPalette::WindowText, Theme::current().secondaryText);
+    label->setPalette(palette);
+    return label;
+}
+
+} // namespace
+
+FoundRowCell::FoundRowCell(std::string reuseIdentifier)
+    : TableCell(std::move(reuseIdentifier))
+    , _name(new TextLabel(Theme::boldSystemFont(kFontSize), contentView()))
+    , _value(greyLabel(kFontSize, contentView()))
+    , _place(greyLabel(kPlaceFontSize, contentView()))
+{
+}
+
+void FoundRowCell::setTexts(const QString& name, const QString& value, const QString& place)
+{
+    _name->setLine(name);
+    _value->setLine(value);
+    _place->setLine(place);
+    setAccessibleName(name + QStringLiteral(", ") + (value.isEmpty() ? place : value));
+    layoutSubviews();
+}
+
+void FoundRowCell::layoutSubviews()
+{
+    TableCell::layoutSubviews();
+    const int width = contentView()->width() - kMargin;
+    const int placeTop = static_cast<int>(height() * kPlaceTop);
+    const int valueWidth = std::min(sizeOfLine(_value->text(), _value->font()).width(), width);
+    _value->setGeometry(kMargin + width - valueWidth, 0, valueWidth, placeTop + kMargin / 2);
+    _name->setGeometry(kMargin, 0, std::max(0, width - valueWidth - kGap), placeTop + kMargin / 2);
+    _place->setGeometry(kMargin, placeTop, width, height() - placeTop);
+}
+
+} // namespace orvex

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "OrvexPaneController.h"
+#include "TreeSearch.h"
+
+#include <QObject>
+#include <QSize>
+#include <QString>
+
+#include <memory>
+#include <optional>
+
+namespace orvex {
+
+class NavigationStack;
+class Window;
+
+// A window with a stack of list screens, and what one does with them whatever they show: keyboard shortcuts,
+// the search, going back by a swipe, dropping files.
+class PaneWindow {
+public:
+    // Without a size the window fills the main screen. The host outlives the window. Not shown yet.
+    PaneWindow(const QString& title, const std::optional<QSize>& size, PaneHost& host,
+        std::unique_ptr<OrvexPaneController> root);
+    ~PaneWindow();
+    PaneWindow(const PaneWindow&) = delete;
+    PaneWindow& operator=(const PaneWindow&) = delete;
+
+    Window& window() const { return *_window; }
+    NavigationStack& stack() const { return *_stack; }
+
+    // Opens the search unless a modal screen is open.
+    void showFind();
+    // Goes to the row as far as the tree still has it: opens a branch, selects a leaf.
+    void goTo(const FoundRow& row);
+
+private:
+    void addShortcuts(PaneHost& host);
+    void closeFind();
+
+    std::unique_ptr<Window> _window;
+    NavigationStack* _stack; // the window's
+};
+
+} // namespace orvex

@@ -1,0 +1,106 @@
+// The session's window where it says more than its rows: silence, saving, nobody looking.
+
+#include "OrvexApp.h"
+#include "OrvexSaveViewController.h"
+
+#include "PaneFixture.h"
+#include "SessionFixture.h"
+
+#include "Bar.h"
+#include "Notice.h"
+#include "Storage.h"
+#include "Veil.h"
+
+#include <QLineEdit>
+#include <QWindow>
+
+#include <filesystem>
+
+namespace orvex::test {
+namespace {
+
+using namespace std::chrono_literals;
+
+// Counts the paint events of all widgets.
+class PaintCounter final : public QObject {
+public:
+    bool eventFilter(QObject*, QEvent* event) override
+    {
+        count += event->type() == QEvent::Paint ? 1 : 0;
+        return false;
+    }
+
+    int count = 0;
+};
+
+struct OrvexAppWindowTest : testing::Test, SessionFixture {
+    OrvexAppWindowTest()
+    {
+        std::filesystem::create_directories(paths::internalBuildMarker());
+        app->applicationDidFinishLaunching();
+        runLoop.runPosted();
+        deliverNeighbors(1);
+        refresh();
+    }
+    ~OrvexAppWindowTest() override { std::filesystem::remove_all(paths::internalBuildMarker()); }
+
+    template <typename Widget>
+    Widget* find(QWidget& parent) const
+    {
+        for (QObject* child : parent.children()) {
+            if (auto* const found = dynamic_cast<Widget*>(child))
+                return found;
+        }
+        return nullptr;
+    }
+    std::string version() const { return shownAt(paneAt(*app->navigationStack(), 1), 0); }
+
+    std::shared_ptr<OrvexApp> app = OrvexApp::create(platform());
+};
+
+TEST_F(OrvexAppWindowTest, DimsRowsAfterTenSecondsOfSilence)
+{
+    const Veil& veil = *find<Veil>(*app->navigationStack());
+    const auto isDimmedAfter = [&](std::chrono::milliseconds time) {
+        runLoop.advance(time);
+        return veil.isVisible();
+    };
+    EXPECT_FALSE(isDimmedAfter(9900ms));
+    EXPECT_TRUE(isDimmedAfter(200ms));
+    deliverNeighbors(1);
+    EXPECT_FALSE(isDimmedAfter(2s));
+    EXPECT_TRUE(isDimmedAfter(10s));
+    app->applicationWillTerminate();
+    runLoop.advance(20s);
+}
+
+TEST_F(OrvexAppWindowTest, ShowsWhereItHasSaved)
+{
+    app->showSaveView();
+    static_cast<OrvexSaveViewController&>(*app->saveViewController()).savePressed();
+    const auto* const notice = find<Notice>(*app->window());
+    ASSERT_TRUE(notice);
+    EXPECT_EQ(notice->text().toStdString(),
+        "Saved " + paths::diagnosticReports() + "/OrvexSnapshot-1700000000.orvex");
+}
+
+TEST_F(OrvexAppWindowTest, UpdatesItsScreensWhenSomebodyLooksAgain)
+{
+    tapRow(paneAt(*app->navigationStack(), 0).tableList(), 1);
+    ASSERT_EQ(paneAt(*app->navigationStack(), 1).tableList().rowCount(), 1);
+    app->window()->windowHandle()->setVisible(false);
+    QCoreApplication::processEvents();
+    PaintCounter paints;
+    qApp->installEventFilter(&paints);
+    deliverNeighbors(2);
+    refresh();
+    QTest::qWait(100);
+    EXPECT_EQ(paints.count, 0);
+    EXPECT_EQ(paneAt(*app->navigationStack(), 1).tableList().rowCount(), 1);
+    app->window()->windowHandle()->setVisible(true);
+    EXPECT_TRUE(
+        QTest::qWaitFor([&] { return paneAt(*app->navigationStack(), 1).tableList().rowCount() == 2; }));
+}
+
+} // namespace
+} // namespace orvex::test
