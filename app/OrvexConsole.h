@@ -1,52 +1,58 @@
 #pragma once
 
 #include "AppPlatform.h"
+#include "ConsoleOptions.h"
 #include "ConsoleOutput.h"
+#include "ConsoleView.h"
 
+#include <functional>
 #include <memory>
 #include <string>
-#include <vector>
+#include <utility>
 
 namespace orvex {
 
-// A screenful: the status line above the body. A body taller than the terminal goes into columns where these
-// are wide enough to read; if it still does not fit, its last line says how much is missing. Lines are cut to
-// their column.
-std::vector<std::string> terminalFrame(
-    const std::string& status, const std::vector<std::string>& body, TerminalSize size);
-
-// Cuts a text to a number of terminal cells, with an ellipsis where something is missing, and pads it with
-// blanks if asked. The text is UTF-8 without control characters.
-std::string fittedToCells(const std::string& text, int cells, bool padded);
-
-// The application without a window: writes the status line and the display tree at every refresh. On a
-// terminal each frame replaces the last; elsewhere a blank line separates them.
+// The application without a window: shows the status line and the display tree, or a branch of it, at every
+// refresh.
 class OrvexConsole final : public OrvexModelListener {
 public:
-    OrvexConsole(const AppPlatform& platform, ConsoleOutput& output);
+    // The view outlives the console.
+    OrvexConsole(const AppPlatform& platform, ConsoleView& view, ConsoleOptions options = {});
     ~OrvexConsole() override;
     OrvexConsole(const OrvexConsole&) = delete;
     OrvexConsole& operator=(const OrvexConsole&) = delete;
 
-    // Writes that it is connecting and queues the start of the session.
-    void start();
-    // Writes the home-screen preference and closes the session. Further calls do nothing.
+    // Shows that it is connecting and queues the start of the session. `onEnd` is called once when the
+    // options say that it is time to end.
+    void start(std::function<void()> onEnd = {});
+    // Saves a snapshot if asked to, writes the home-screen preference and closes the session. Further calls
+    // do nothing.
     void applicationWillTerminate();
+
+    // Why the program has failed, in one line; empty if it has not.
+    const std::string& failure() const { return _failure; }
 
     void updateViewControllerFromModel() override;
 
 private:
     void checkConnection();
     void sayConnecting();
-    void write(const std::string& status);
+    void show(const std::string& status, const OrvexModelNodeRef& tree);
+    void timeIsUp();
+    void save();
+    void end();
 
     AppPlatform _platform;
-    ConsoleOutput& _output;
+    ConsoleView& _view;
+    ConsoleOptions _options;
+    std::function<void()> _onEnd;
     std::shared_ptr<OrvexModel> _model;
     std::unique_ptr<RunLoop::Timer> _connectionTimer;
-    std::vector<std::string> _tree; // lines of the last update
-    bool _saidConnecting = false;   // and nothing else since
-    bool _wroteBefore = false;
+    std::unique_ptr<RunLoop::Timer> _timeout;
+    OrvexModelNodeRef _tree;      // of the last update
+    bool _saidConnecting = false; // and nothing else since
+    bool _cameUp = false;         // the session did, at some time
+    std::string _failure;
 };
 
 } // namespace orvex

@@ -1,9 +1,11 @@
 #include "PaneWindow.h"
 
+#include "FileDrop.h"
 #include "FindScreen.h"
 
 #include "EdgeSwipe.h"
 #include "NavigationStack.h"
+#include "Notice.h"
 #include "Window.h"
 
 #include <QCoreApplication>
@@ -20,6 +22,10 @@ PaneWindow::PaneWindow(const QString& title, const std::optional<QSize>& size, P
     new EdgeSwipe(*_stack); // the stack's
     _window->setRootView(std::move(stack));
     addShortcuts(host);
+    new FileDrop(*_window, [this](const std::string& path) { // the window's
+        if (!openInAnotherProcess(path, *_window))
+            Notice::show(*_window, QStringLiteral("The file cannot be opened."));
+    });
 }
 
 PaneWindow::~PaneWindow() = default;

@@ -2,75 +2,33 @@
 
 #include "AppOptions.h"
 #include "ConsoleOutput.h"
+#include "ConsoleProgram.h"
+#include "LinuxPlatform.h"
+#include "OpenedFile.h"
 #include "OrvexApp.h"
-#include "OrvexConsole.h"
 #include "SnapshotViewer.h"
 #include "Window.h"
 
-#include "DisplayTreePrinter.h"
-#include "SnapshotTree.h"
-
-#include "FileStorage.h"
-#include "KoratTelephonyService.h"
 #include "LinuxSystemLog.h"
 #include "Process.h"
-#include "QtRunLoop.h"
-#include "SocketMessagePorts.h"
-
 #include "SystemLog.h"
-#include "VisibleText.h"
 
 #include <QApplication>
 #include <QScreen>
-#include <QTimer>
 
 #include <algorithm>
-#include <cerrno>
-#include <clocale>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
-#include <cstring>
 #include <filesystem>
 #include <functional>
 #include <optional>
-#include <unistd.h>
 
 namespace {
 
 using namespace orvex;
 
 constexpr int kExitFailure = 1;
-
-void printError(const std::string& why)
-{
-    std::fprintf(stderr, "orvex: %s\n", visibleText(why).c_str());
-}
-
-// The implementations of the platform, in the order of their dependencies.
-struct LinuxPlatform {
-    explicit LinuxPlatform(const std::string& resourceDirectory)
-        : resources(resourceDirectory)
-    {
-    }
-
-    AppPlatform forApp()
-    {
-        return {.session = {.runLoop = runLoop,
-                    .ports = ports,
-                    .telephony = telephony,
-                    .generators = {.resources = resources, .clock = clock, .buildVersion = ORVEX_VERSION},
-                    .printError = printError},
-            .preferences = preferences};
-    }
-
-    QtRunLoop runLoop;
-    SocketMessagePorts ports;
-    KoratTelephonyService telephony{ports};
-    FileResources resources;
-    SystemClock clock;
-    IniPreferences preferences;
-};
 
 void printNoDisplay()
 {
@@ -96,45 +54,10 @@ void endWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString&
     std::_Exit(kExitFailure);
 }
 
-// Qt sets the user's locale, which may have decimal commas. Values and property lists have points.
-void keepDecimalPoints()
-{
-    std::setlocale(LC_NUMERIC, "C");
-}
-
 // For programs whose standard output is read by other programs.
 void writeConsoleToStandardError(std::string_view line)
 {
     std::fprintf(stderr, "%.*s\n", static_cast<int>(line.size()), line.data());
-}
-
-int runConsole(int argc, char** argv, const std::string& resourceDirectory)
-{
-    const QCoreApplication application(argc, argv);
-    keepDecimalPoints();
-    // Standard output is for the tree alone, and a terminal redrawn in place has no room for other lines.
-    const bool wouldDisturb = ::isatty(STDOUT_FILENO) && ::isatty(STDERR_FILENO);
-    installConsole([wouldDisturb](std::string_view line) {
-        if (!wouldDisturb)
-            writeConsoleToStandardError(line);
-    });
-    LinuxPlatform platform(resourceDirectory);
-    int status = EXIT_SUCCESS;
-    StandardOutput output([&status](int error) {
-        if (error != EPIPE) {
-            printError(
-                std::string("standard output: ") + std::strerror(error)); // NOLINT(concurrency-mt-unsafe)
-            status = kExitFailure;
-        }
-        installConsole([](std::string_view) {});        // nobody reads them any more
-        QTimer::singleShot(0, &QCoreApplication::quit); // the event loop may not run yet
-    });
-    OrvexConsole console(platform.forApp(), output);
-    const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
-    console.start();
-    QCoreApplication::exec();
-    console.applicationWillTerminate();
-    return status;
 }
 
 std::optional<QSize> windowSize(const AppOptions& options)
@@ -159,10 +82,10 @@ int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<in
     return body();
 }
 
-int runWindow(int argc, char** argv, const std::string& resourceDirectory, const AppOptions& options)
+int runWindow(int argc, char** argv, const AppOptions& options)
 {
-    return runInWindow(argc, argv, options.theme, [&resourceDirectory, &options] {
-        LinuxPlatform platform(resourceDirectory);
+    return runInWindow(argc, argv, options.theme, [&options] {
+        LinuxPlatform platform(options.resourceDirectory());
         const auto app = OrvexApp::create(platform.forApp(), windowSize(options));
         std::optional<StandardOutput> output;
         std::optional<StatusPrinter> statusPrinter;
@@ -187,24 +110,18 @@ int runWindow(int argc, char** argv, const std::string& resourceDirectory, const
     });
 }
 
-// Shows the tree of the file, on the terminal or in a window.
-int showSnapshot(int argc, char** argv, const AppOptions& options)
+// Shows the tree of the file that the options name.
+int showFile(int argc, char** argv, const AppOptions& options)
 {
-    const std::string& path = *options.snapshot;
-    const auto [snapshot, error] = readSnapshot(path);
-    if (!snapshot) {
-        printError(error);
-        return kExitFailure;
-    }
-    if (options.usesConsole) {
-        const std::string tree = DisplayTreePrinter::text(*snapshotTree(*snapshot));
-        const bool written = std::printf("%s\n%s", snapshotMessage(*snapshot).c_str(), tree.c_str()) >= 0
-            && std::fflush(stdout) == 0;
-        return written ? EXIT_SUCCESS : kExitFailure;
-    }
-    return runInWindow(argc, argv, options.theme, [&, &shown = *snapshot] {
-        const SnapshotViewer viewer(
-            shown, std::filesystem::path(path).filename().string(), windowSize(options));
+    return runInWindow(argc, argv, options.theme, [&options] {
+        LinuxPlatform platform(options.resourceDirectory());
+        const OpenedFile opened = openFile(*options.file, platform.forFiles());
+        if (!opened.tree) {
+            printError(opened.error);
+            return kExitFailure;
+        }
+        const std::string name = std::filesystem::path(*options.file).filename().string();
+        const SnapshotViewer viewer(opened.tree, opened.status, name, windowSize(options));
         const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
         return QApplication::exec();
     });
@@ -223,12 +140,12 @@ int main(int argc, char** argv)
     const auto log = makeLinuxSystemLog("orvex");
     SystemLog::install(log.get());
     installFatalErrorHandler();
-    const std::string directory = options.resources.value_or(FileResources::defaultDirectory());
     const auto run = [&] {
-        if (options.snapshot)
-            return showSnapshot(argc, argv, options);
-        return options.usesConsole ? runConsole(argc, argv, directory)
-                                   : runWindow(argc, argv, directory, options);
+        if (options.diagnoses)
+            return printDiagnosis(argc, argv, options);
+        if (options.usesConsole)
+            return options.file ? printFile(argc, argv, options) : runConsole(argc, argv, options);
+        return options.file ? showFile(argc, argv, options) : runWindow(argc, argv, options);
     };
     const int status = run();
     SystemLog::install(nullptr);

@@ -16,8 +16,12 @@ namespace orvex {
 // control a terminal are escaped: a line break as \n, others as \x1b.
 class DisplayTreePrinter {
 public:
-    static std::vector<std::string> lines(
-        const OrvexModelNode& root, std::size_t longest = kLongestVisibleText);
+    struct Line {
+        std::string text;
+        std::size_t nameEnd; // in bytes, with the indent; the size of the text where there is no value
+    };
+
+    static std::vector<Line> lines(const OrvexModelNode& root, std::size_t longest = kLongestVisibleText);
     // The same lines, each ended by a line break.
     static std::string text(const OrvexModelNode& root, std::size_t longest = kLongestVisibleText);
 };

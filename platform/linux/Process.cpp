@@ -29,6 +29,7 @@ constexpr unsigned kSecondsToEnd = 1;
 
 std::atomic<int> theWriteEnd = -1;
 std::atomic<int> theSignal = 0;
+std::atomic<void (*)()> theLastAct = nullptr;
 static_assert(std::atomic<int>::is_always_lock_free);
 
 // Writing to a pipe is all a handler may do here; the event loop reads the other end.
@@ -46,6 +47,8 @@ extern "C" void passToEventLoop(int signal)
 // Interrupts whatever the process is stuck in.
 extern "C" void die(int)
 {
+    if (void (*const act)() = theLastAct.load())
+        act();
     std::signal(theSignal, SIG_DFL);
     std::raise(theSignal);
 }
@@ -133,6 +136,11 @@ void occupyStandardStreams()
 void installFatalErrorHandler()
 {
     std::set_terminate(logAndAbort);
+}
+
+void setLastAct(void (*act)())
+{
+    theLastAct = act;
 }
 
 TerminationSignals::TerminationSignals(std::function<void()> onSignal)

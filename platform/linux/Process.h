@@ -30,7 +30,7 @@ void installFatalErrorHandler();
 // destructor restores the signals' default effect.
 //
 // A process that has not ended one second after a signal, because it waits for a reader, a bus or a service,
-// dies of that signal.
+// dies of that signal, after the act of setLastAct().
 class TerminationSignals {
 public:
     explicit TerminationSignals(std::function<void()> onSignal);
@@ -43,5 +43,8 @@ private:
     int _writeEnd = -1;
     std::unique_ptr<QSocketNotifier> _notifier;
 };
+
+// Called before a process that is stuck dies of a signal; null for nothing. It runs in a signal handler.
+void setLastAct(void (*act)());
 
 } // namespace orvex

@@ -23,9 +23,16 @@ TEST(AppOptions, ReadsEachOption)
     EXPECT_TRUE(options.printsStatus);
     EXPECT_TRUE(options.endsWhenPainted);
     options = parse({"--open", "a", "--light"});
-    EXPECT_EQ(options.snapshot, "a");
+    EXPECT_EQ(options.file, "a");
     EXPECT_EQ(options.theme, Theme::Mode::light);
     EXPECT_TRUE(parse({"--open", "a", "--console"}).usesConsole);
+    options = parse({"--console", "--path", "/A//", "--timeout", "1.5", "--save", "s", "--json"});
+    EXPECT_EQ(options.console.path, "/A");
+    EXPECT_EQ(options.console.timeout, std::chrono::milliseconds(1500));
+    EXPECT_EQ(options.console.saveFile, "s");
+    EXPECT_TRUE(options.console.json);
+    EXPECT_EQ(parse({"--console", "--path", "//", "\xff"}).console.path, "/");
+    EXPECT_EQ(parse({"--", "-\xff"}).file, "-\xff");
 }
 
 TEST(AppOptions, EndsForHelpVersionAndWrongUsage)
@@ -39,7 +46,12 @@ TEST(AppOptions, EndsForHelpVersionAndWrongUsage)
         {{"--light", "--dark", "--help"}, 0, "  --open <FILE> "},
         {{"--version", "--console"}, 0, "orvex "},
         {{"--no-such"}, 2, "orvex: Unknown option 'no-such'. Try 'orvex --help'.\n"},
-        {{"file"}, 2, "orvex: Unexpected argument 'file'. Try 'orvex --help'.\n"},
+        {{"a", "file"}, 2, "orvex: Unexpected argument 'file'."},
+        {{"--open", "a", "file"}, 2, "orvex: Unexpected argument 'file'."},
+        {{"a", "--diagnose"}, 2, "--diagnose cannot be combined with a file."},
+        {{"--once"}, 2, "--once goes with --console."},
+        {{"--console", "--path", "A"}, 2, "--path takes a path that begins with '/'."},
+        {{"--console", "--timeout", "-1"}, 2, "--timeout takes a number of seconds above 0."},
         {{"--open", "a", "--open", "a"}, 2, "--open is given more than once."},
         {{"--light", "--dark"}, 2, "--light cannot be combined with --dark."},
         {{"--console", "--light"}, 2, "--console cannot"},
@@ -47,7 +59,6 @@ TEST(AppOptions, EndsForHelpVersionAndWrongUsage)
         {{"--console", "--print-status"}, 2, "--console cannot"},
         {{"--console", "--until-painted"}, 2, "--console cannot"},
         {{"--console", "--size", "1x1"}, 2, "--console cannot"},
-        {{"--open", "a", "--resources", "/r"}, 2, "--open cannot"},
         {{"--open", "a", "--print-status"}, 2, "--open cannot"},
         {{"--open", "a", "--until-painted"}, 2, "--open cannot"},
     };

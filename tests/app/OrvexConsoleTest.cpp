@@ -1,4 +1,7 @@
 #include "OrvexConsole.h"
+#include "LineView.h"
+#include "TerminalView.h"
+
 #include "DisplayTreePrinter.h"
 #include "NodesByPath.h"
 
@@ -15,7 +18,8 @@ using Lines = std::vector<std::string>;
 
 struct OrvexConsoleTest : testing::Test, SessionFixture {
     RecordingOutput output;
-    OrvexConsole console{platform(), output};
+    LineView lines{output, false};
+    OrvexConsole console{platform(), lines};
 };
 
 constexpr const char* kBlock = "\nUpdated 2023-11-15 at 00:13:20\n"
@@ -47,7 +51,9 @@ TEST_F(OrvexConsoleTest, WritesABlockAtEveryRefreshAndALossOnce)
 TEST_F(OrvexConsoleTest, RedrawsATerminalInPlace)
 {
     output.size = TerminalSize{.columns = 20, .rows = 6};
-    console.start();
+    TerminalView screen(output, {});
+    OrvexConsole redrawn(platform(), screen);
+    redrawn.start();
     EXPECT_EQ(output.take(), "\x1b[H\x1b[2JConnecting...\x1b[K\n\x1b[J");
     runLoop.runPosted();
     deliverNeighbors(0);

@@ -199,7 +199,7 @@ TEST_F(LiveSession, FileNamesAreBytes)
             0, "Orvex: (unknown)"},
         {"$DECODE --dlf $ODD/dlf $ODD/snapshot && test -s $ODD/dlf", 0, "DLF binary (161 bytes)"},
         {"$ORVEX --console --open $ODD/snapshot", 0, "Saved "},
-        {"$ORVEX --console $ODD", 2, R"(\xff\xe4'.)"},
+        {"$ORVEX --console $ODD", 1, R"(\xff\xe4: )"},
         {"$KORATD --capture $ODD/log", 1, R"(\xff\xe4/log: neither a pcap nor a DLF file)"},
     };
     for (const char* locale : {"C", "C.UTF-8"}) {

@@ -1,0 +1,96 @@
+// The monitor on a terminal of its own: whatever ends or stops it, the terminal's modes are as before.
+
+#include "Program.h"
+
+#include <gtest/gtest.h>
+
+#include <pty.h>
+#include <sys/wait.h>
+#include <termios.h>
+#include <unistd.h>
+
+namespace orvex::test {
+namespace {
+
+class TerminalProgram {
+public:
+    explicit TerminalProgram(const ProgramFolder& folder)
+    {
+        const QStringList variables = folder.environment().toStringList();
+        std::vector<QByteArray> bytes;
+        for (const QString& variable : variables)
+            bytes.push_back(variable.toLocal8Bit());
+        std::vector<char*> environment;
+        for (QByteArray& variable : bytes)
+            environment.push_back(variable.data());
+        environment.push_back(nullptr);
+        const winsize size{.ws_row = 24, .ws_col = 80, .ws_xpixel = 0, .ws_ypixel = 0};
+        _process = ::forkpty(&_terminal, nullptr, nullptr, &size);
+        if (_process == 0) {
+            ::execle(ORVEX_PATH, "orvex", "--console", nullptr, environment.data());
+            ::_exit(127);
+        }
+    }
+    ~TerminalProgram()
+    {
+        ::kill(_process, SIGKILL);
+        ::waitpid(_process, nullptr, 0);
+        ::close(_terminal);
+    }
+    TerminalProgram(const TerminalProgram&) = delete;
+    TerminalProgram& operator=(const TerminalProgram&) = delete;
+
+    bool isRaw() const
+    {
+        termios modes{};
+        EXPECT_EQ(::tcgetattr(_terminal, &modes), 0);
+        return (modes.c_lflag & (ICANON | ECHO)) == 0;
+    }
+    void type(char character) const { EXPECT_EQ(::write(_terminal, &character, 1), 1); }
+    void send(int signal) const { ::kill(_process, signal); }
+    // The status of waitpid() once it has ended or stopped.
+    int waitForEndOrStop() const
+    {
+        int status = 0;
+        EXPECT_TRUE(waitUntil([&] { return ::waitpid(_process, &status, WNOHANG | WUNTRACED) == _process; }));
+        return status;
+    }
+
+private:
+    pid_t _process = 0;
+    int _terminal = -1;
+};
+
+TEST(ConsoleTerminal, GetsItsModesBackWhateverHappens)
+{
+    const struct {
+        const char* name;
+        char key;
+        int signal;
+    } cases[] = {
+        {"q", 'q', 0},
+        {"Ctrl+C", '\x03', 0},
+        {"Ctrl+Z", '\x1a', 0},
+        {"Ctrl+\\", '\x1c', 0},
+        {"terminated", 0, SIGTERM},
+        {"aborted", 0, SIGABRT},
+    };
+    for (const auto& [name, key, signal] : cases) {
+        const ProgramFolder folder;
+        const TerminalProgram monitor(folder);
+        ASSERT_TRUE(waitUntil([&] { return monitor.isRaw(); })) << name;
+        if (key != 0)
+            monitor.type(key);
+        else
+            monitor.send(signal);
+        const int status = monitor.waitForEndOrStop();
+        EXPECT_FALSE(monitor.isRaw()) << name;
+        if (!WIFSTOPPED(status))
+            continue;
+        monitor.send(SIGCONT);
+        EXPECT_TRUE(waitUntil([&] { return monitor.isRaw(); })) << name << ", continued";
+    }
+}
+
+} // namespace
+} // namespace orvex::test
