@@ -33,12 +33,13 @@ struct Technology {
     const char* target;
 };
 
+// In the order of telephony::kTechnologies, by which the targets count.
 constexpr Technology kTechnologies[] = {
+    {telephony::kTechnologyIFX, "IFX"},
     {telephony::kTechnologyMRL_GSM, "GSM"},
     {telephony::kTechnologyMRL_CDMA, "C2K"},
     {telephony::kTechnologyMRL_LTE, "LTE"},
     {telephony::kTechnologyMRL_UTRAN2, "UTRAN"},
-    {telephony::kTechnologyIFX, "IFX"},
 };
 
 class SeedWriter {
@@ -218,15 +219,16 @@ private:
     // The technology's number, its template and a packet; see TemplateTarget.
     void writeTemplates() const
     {
+        // IFX, the first technology, has none.
         static constexpr const char* kTemplates[] = {"MRL_GSM", "C2KTemplate", "LTE", "MRL_UTRAN2"};
         const FileResources resources(ORVEX_RESOURCES);
         for (std::size_t i = 0; i < std::size(kTemplates); ++i) {
-            Messages messages = firstMessages(kTechnologies[i].identifier, 3);
+            Messages messages = firstMessages(kTechnologies[i + 1].identifier, 3);
             const Bytes list =
                 propertyListBinary(resources.dictionaryNamed(kTemplates[i]).dictionary).value();
             messages.insert(messages.begin(), list);
             Bytes input = InputMessages::inputOf(messages);
-            input.insert(input.begin(), static_cast<std::uint8_t>(i));
+            input.insert(input.begin(), static_cast<std::uint8_t>(i + 1));
             write("Template", kTemplates[i], input);
         }
     }

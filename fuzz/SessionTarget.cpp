@@ -11,10 +11,6 @@ namespace {
 
 using namespace orvex;
 
-// In the order of the seeds.
-constexpr const char* kTechnologies[] = {telephony::kTechnologyMRL_GSM, telephony::kTechnologyMRL_CDMA,
-    telephony::kTechnologyMRL_LTE, telephony::kTechnologyMRL_UTRAN2, telephony::kTechnologyIFX};
-
 constexpr std::int32_t kLogChannelMessageId = 0;
 
 bool takeAll(FrameReader& reader, fuzz::FuzzSession& session)
@@ -32,7 +28,7 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
 {
     if (size == 0)
         return 0;
-    fuzz::FuzzSession session(kTechnologies[data[0] % std::size(kTechnologies)]);
+    fuzz::FuzzSession session(telephony::kTechnologies[data[0] % std::size(telephony::kTechnologies)]);
     FrameReader reader;
     fuzz::InputMessages pieces({data + 1, size - 1});
     while (const auto piece = pieces.next()) {

@@ -10,13 +10,12 @@
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
 {
     using namespace orvex;
-    static constexpr const char* kTechnologies[] = {telephony::kTechnologyMRL_GSM,
-        telephony::kTechnologyMRL_CDMA, telephony::kTechnologyMRL_LTE, telephony::kTechnologyMRL_UTRAN2};
     if (size == 0)
         return 0;
     fuzz::InputMessages messages({data + 1, size - 1});
     const auto list = propertyListFromData(messages.next().value_or(Bytes()));
     if (const auto skeleton = list.value ? list.value->dictionary() : nullptr)
-        fuzz::FuzzSession(kTechnologies[data[0] % std::size(kTechnologies)], skeleton).run(messages);
+        fuzz::FuzzSession(telephony::kTechnologies[data[0] % std::size(telephony::kTechnologies)], skeleton)
+            .run(messages);
     return 0;
 }
