@@ -124,12 +124,6 @@ int DlfRecords::bestScoreAt(std::size_t place, std::size_t before, int depth) co
     return best;
 }
 
-bool DlfRecords::beginsWithRecords() const
-{
-    return makeUp(_bytes.size(),
-        [this](std::uint64_t place) { return _bytes.from(static_cast<std::size_t>(place)).bytes(); });
-}
-
 bool DlfRecords::makeUp(std::uint64_t size, const std::function<ByteView(std::uint64_t place)>& headerAt)
 {
     // Many files begin with two bytes that could be a length, and have such bytes again where it leads. But

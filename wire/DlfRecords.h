@@ -55,9 +55,8 @@ public:
     std::optional<Record> next();
 
     std::size_t skippedBytes() const { return _skipped; }
-    // Whether the bytes begin with records that belong together, as a DLF does.
-    bool beginsWithRecords() const;
-    // The same for a file of any size; the function returns the record header at an offset, possibly cut.
+    // Whether a file begins with records that belong together, as a DLF does. The function returns the record
+    // header at an offset, possibly cut.
     static bool makeUp(std::uint64_t size, const std::function<ByteView(std::uint64_t place)>& headerAt);
 
 private:

@@ -10,16 +10,12 @@
 #include <gmock/gmock.h>
 
 #include <QEventLoop>
+#include <QLocalSocket>
 #include <QTemporaryDir>
 
-#include <cerrno>
 #include <future>
 #include <string>
 #include <thread>
-
-#include <sys/socket.h>
-#include <sys/un.h>
-#include <unistd.h>
 
 namespace orvex::test {
 
@@ -49,87 +45,48 @@ protected:
 };
 
 // A socket that talks to a message port byte by byte, without the code under test.
-class RawPeer {
+class RawPeer : public QLocalSocket {
 public:
     explicit RawPeer(const std::string& path)
-        : _socket(::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0))
     {
-        sockaddr_un address{};
-        address.sun_family = AF_UNIX;
-        path.copy(address.sun_path, sizeof address.sun_path - 1);
-        EXPECT_EQ(::connect(_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address), 0) << path;
+        connectToServer(QString::fromStdString(path));
+        EXPECT_TRUE(waitForConnected()) << path;
     }
-    ~RawPeer() { ::close(_socket); }
-    RawPeer(const RawPeer&) = delete;
-    RawPeer& operator=(const RawPeer&) = delete;
-
-    // While the socket is full, runs the event loop and so the port at the other end.
-    void write(ByteView bytes) const
+    void send(const Bytes& bytes)
     {
-        while (!bytes.empty()) {
-            const auto count = ::send(_socket, bytes.data(), bytes.size(), MSG_NOSIGNAL | MSG_DONTWAIT);
-            if (count < 0 && errno == EAGAIN) {
-                QCoreApplication::processEvents();
-                continue;
-            }
-            ASSERT_GT(count, 0);
-            bytes = bytes.subspan(static_cast<std::size_t>(count));
-        }
+        write(reinterpret_cast<const char*>(bytes.data()), static_cast<qint64>(bytes.size()));
+        flush(); // the event loop sends what does not fit now
     }
-    void write(const Frame& frame) const { write(encodedFrame(frame)); }
     // Sends a one-way message.
-    void say(std::int32_t messageId, std::string_view word) const
+    void say(std::int32_t messageId, std::string_view word)
     {
-        write({messageId, FrameKind::oneWay, 0, bytesOf(word)});
+        send(encodedFrame({messageId, FrameKind::oneWay, 0, bytesOf(word)}));
     }
-
-    // Reads what has arrived.
-    Bytes read() const
-    {
-        Bytes bytes(1 << 20);
-        const auto count = ::recv(_socket, bytes.data(), bytes.size(), MSG_DONTWAIT);
-        bytes.resize(count > 0 ? static_cast<std::size_t>(count) : 0);
-        return bytes;
-    }
-
-    bool isClosedByOther() const
-    {
-        std::uint8_t byte = 0;
-        const auto count = ::recv(_socket, &byte, 1, MSG_DONTWAIT | MSG_PEEK);
-        return count == 0 || (count < 0 && errno != EAGAIN);
-    }
-
-private:
-    int _socket;
+    bool isClosedByOther() const { return state() == UnconnectedState; }
 };
 
 // A local port served by its own thread, as another process would serve it.
 class ServedPort {
 public:
     ServedPort(const std::string& directory, const std::string& name, MessagePorts::Receiver receiver)
-    {
-        std::promise<void> ready;
-        _thread = std::thread([&, receiver = std::move(receiver)] {
+        : _thread([=, this] {
             QEventLoop loop;
-            _loop = &loop;
             SocketMessagePorts ports(directory);
             const auto port = ports.createLocalPort(name, receiver).port;
-            ready.set_value();
+            _loop.set_value(&loop);
             loop.exec();
-        });
-        ready.get_future().wait();
-    }
-    ~ServedPort()
+        })
+        , _running(_loop.get_future().get())
     {
-        QMetaObject::invokeMethod(_loop, &QEventLoop::quit, Qt::QueuedConnection);
-        _thread.join();
     }
+    ~ServedPort() { QMetaObject::invokeMethod(_running, &QEventLoop::quit, Qt::QueuedConnection); }
     ServedPort(const ServedPort&) = delete;
     ServedPort& operator=(const ServedPort&) = delete;
 
 private:
-    QEventLoop* _loop = nullptr;
-    std::thread _thread;
+    std::promise<QEventLoop*> _loop;
+    std::jthread _thread;
+    QEventLoop* _running;
 };
 
 } // namespace orvex::test

@@ -3,8 +3,8 @@
 #include "Recorder.h"
 #include "Streamer.h"
 
+#include "Array.h"
 #include "Captures.h"
-#include "Decoding.h"
 #include "FakeTelephony.h"
 #include "ManualRunLoop.h"
 #include "PcapWriter.h"
@@ -14,67 +14,37 @@
 
 #include <thread>
 
-namespace orvex::korat {
+namespace orvex::test {
 namespace {
 
+using namespace korat;
 using namespace std::chrono_literals;
 
 TEST(Subscription, TakesTheCodesThatTheCommandNames)
 {
     const LogCode sample[] = {0xB179, 0xB17F, 0xFF0000, 0xFF0002};
-    const struct {
-        const char* name;
-        DictionaryRef command;
-        std::set<LogCode> wanted; // of the sample
-    } cases[] = {
-        {"no lists: everything", Dictionary::make(), {std::begin(sample), std::end(sample)}},
-        {"both lists",
-            Dictionary::make(
-                {{"SetMarlinLogCodes", Array::make({0xB17F})}, {"SetKoratExtraCodes", Array::make({2})}}),
-            {0xB17F, 0xFF0002}},
-        {"one list: no extra packets",
-            Dictionary::make({{"SetMarlinLogCodes", Array::make({0xB179, 0xB17F})}}), {0xB179, 0xB17F}},
-        {"empty list: nothing", Dictionary::make({{"SetMarlinLogCodes", Array::make()}}), {}},
-        {"no codes in the list",
-            Dictionary::make({{"SetMarlinLogCodes", Array::make({"45433", 0xB179 + 0x10000, -1, 45433.0})}}),
-            {}},
-        {"no list at all", Dictionary::make({{"SetMarlinLogCodes", "all"}}), {}},
+    const auto list = [](const char* key, Value codes) { return Dictionary::make({{key, codes}}); };
+    const auto both = list("SetMarlinLogCodes", Array::make({0xB17F}));
+    both->set("SetKoratExtraCodes", Array::make({2}));
+    const std::pair<DictionaryRef, std::set<LogCode>> cases[] = {
+        // the codes of the sample that are wanted
+        {Dictionary::make(), {std::begin(sample), std::end(sample)}},
+        {both, {0xB17F, 0xFF0002}},
+        {list("SetMarlinLogCodes", Array::make({0xB179, 0xB17F})), {0xB179, 0xB17F}},
+        {list("SetMarlinLogCodes", Array::make({"45433", 0xB179 + 0x10000, -1, 45433.0})), {}},
+        {list("SetMarlinLogCodes", "all"), {}},
     };
-    for (const auto& [name, command, wanted] : cases) {
+    for (const auto& [command, wanted] : cases) {
         const Subscription subscription(*command);
         for (const LogCode code : sample)
-            EXPECT_EQ(subscription.wants(code), wanted.contains(code)) << name << ": " << code;
-        EXPECT_TRUE(subscription.wants(std::nullopt)) << name;
-    }
-}
-
-TEST(GarbageSource, NothingOfItIsFatalToAGenerator)
-{
-    for (const char* technology : test::kTechnologies) {
-        SCOPED_TRACE(technology);
-        const bool arePackets = technology != std::string_view(telephony::kTechnologyIFX);
-        GarbageSource garbage(50);
-        test::Decoding decoding(technology);
-        std::size_t messages = 0;
-        std::size_t changed = 0;
-        for (int round = 0; round < (arePackets ? 8 : 1); ++round) {
-            CaptureSource source(test::capturePath(technology), true);
-            while (auto message = source.next()) {
-                const Bytes before = message->bytes;
-                garbage.spoil(*message);
-                ++messages;
-                changed += message->bytes == before ? 0U : 1U;
-                ASSERT_NO_THROW(decoding.feed(message->bytes)) << messages;
-            }
-        }
-        const auto count = static_cast<double>(messages);
-        EXPECT_NEAR(static_cast<double>(changed), arePackets ? count / 2 : 0, count / 20);
+            EXPECT_EQ(subscription.wants(code), wanted.contains(code)) << wanted.size() << ": " << code;
+        EXPECT_TRUE(subscription.wants(std::nullopt));
     }
 }
 
 TEST(Recorder, SaysOnceThatAMessageIsTooLongAndGoesOn)
 {
-    const test::TemporaryFile file;
+    const TemporaryFile file;
     testing::internal::CaptureStderr();
     {
         Recorder recorder(file.path);
@@ -90,7 +60,7 @@ TEST(Recorder, SaysOnceThatAMessageIsTooLongAndGoesOn)
 }
 
 // A client that takes what it is sent only when the test says so.
-struct SlowClient final : test::FakePort<RemotePort> {
+struct SlowClient final : FakePort<RemotePort> {
     Status send(std::int32_t, ByteView data, std::chrono::milliseconds) override
     {
         if (refusals > 0) {
@@ -117,7 +87,7 @@ protected:
     void stream(const DictionaryRef& command, const Streamer::Pace& pace, CaptureSource source)
     {
         streamer = std::make_unique<Streamer>(runLoop, client, std::move(source), Subscription(*command),
-            GarbageSource(0), pace, [this](const Message& message) { told.push_back(message.bytes); });
+            GarbageSource(0), pace, Streamer::Listener());
     }
     // Lets the run loop tick while real time goes on.
     bool tickUntil(const std::function<bool()>& condition, int times = 2000)
@@ -129,9 +99,8 @@ protected:
         return condition();
     }
 
-    test::ManualRunLoop runLoop;
+    ManualRunLoop runLoop;
     std::shared_ptr<SlowClient> client = std::make_shared<SlowClient>();
-    std::vector<Bytes> told; // by the streamer, of what it sent
     std::unique_ptr<Streamer> streamer;
 };
 
@@ -139,7 +108,7 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
 {
     constexpr std::size_t kBacklog = std::size_t{4} << 20;
     constexpr std::size_t kLargestMessage = 1 << 16;
-    const std::string capture = test::capturePath("MRL_LTE");
+    const std::string capture = capturePath("MRL_LTE");
     client->refusals = 3;
     stream(Dictionary::make(), {1e6, std::nullopt}, {capture, false});
     ASSERT_TRUE(tickUntil([&] { return client->pending > kBacklog; }));
@@ -150,8 +119,6 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
 
     client->pending = 0;
     ASSERT_TRUE(tickUntil([&] { return client->received.size() > sent + 100; }));
-    EXPECT_EQ(streamer->sent(), client->received.size());
-    EXPECT_EQ(told, client->received);
     CaptureSource source(capture, false);
     for (const Bytes& message : client->received) {
         auto expected = source.next();
@@ -163,11 +130,11 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
 
 TEST_F(StreamerTest, RestsAfterTheEndAndRepeatsOnlyWhatIsWanted)
 {
-    const test::TemporaryFile file;
+    const TemporaryFile file;
     const struct {
         const char* name;
         int wantedCode;
-        std::size_t length;
+        std::uint8_t length;
         bool once;
         std::optional<std::uint64_t> count;
         std::size_t atLeast;
@@ -183,10 +150,10 @@ TEST_F(StreamerTest, RestsAfterTheEndAndRepeatsOnlyWhatIsWanted)
         client->received.clear();
         {
             PcapWriter capture(file.path);
-            for (std::uint8_t i = 0; i < length; ++i) {
-                capture.write(Bytes{1, 13, 0, 3, 0, 0, 0, 0, 0, 0, 0, 0, 0, i}, {}); // never wanted
-                capture.write(Bytes{1, 13, 0, 1, 0, 0, 0, 0, 0, 0, 0, 0, 0, i}, {});
-            }
+            for (std::uint8_t i = 0; i < 2 * length; ++i) // every other one is never wanted
+                capture.write(
+                    Bytes{1, 13, 0, static_cast<std::uint8_t>(i % 2 ? 1 : 3), 0, 0, 0, 0, 0, 0, 0, 0, 0, i},
+                    {});
         }
         stream(Dictionary::make({{"SetMarlinLogCodes", Array::make({wantedCode})}}), {2000, count},
             {file.path, once});
@@ -195,9 +162,9 @@ TEST_F(StreamerTest, RestsAfterTheEndAndRepeatsOnlyWhatIsWanted)
         EXPECT_GE(client->received.size(), atLeast) << name;
         EXPECT_TRUE(!rests || client->received.size() == atLeast) << name;
         for (std::size_t i = 0; i < client->received.size(); ++i)
-            EXPECT_EQ(client->received[i].at(13), i % length) << name;
+            EXPECT_EQ(client->received[i].at(13), i % length * 2 + 1) << name;
     }
 }
 
 } // namespace
-} // namespace orvex::korat
+} // namespace orvex::test

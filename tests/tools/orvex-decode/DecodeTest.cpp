@@ -1,7 +1,10 @@
-#include "DecodeProgram.h"
-#include "PacketText.h"
+// orvex-decode as a program.
 
-#include "TextFormat.h"
+#include "Captures.h"
+#include "PacketText.h"
+#include "PcapWriter.h"
+#include "Programs.h"
+#include "PropertyListForms.h"
 
 #include <nlohmann/json.hpp>
 
@@ -9,12 +12,15 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <fstream>
+#include <iterator>
 
 namespace orvex::test {
 namespace {
 
 using Json = nlohmann::ordered_json;
 using testing::HasSubstr;
+using testing::StartsWith;
 
 // An antenna packet that shows this number.
 Bytes antennas(std::uint8_t count)
@@ -22,104 +28,103 @@ Bytes antennas(std::uint8_t count)
     return packet(0xB0C1, {0, 1, 2, 3, 4, 5, 6, count, 8});
 }
 
-class DecodeTest : public DecodeProgram, public testing::Test {
-public:
-    Result decodeCaptures(const std::vector<Bytes>& captures, QStringList arguments = {}) const
+class DecodeTest : public testing::Test {
+protected:
+    static Result decode(const QStringList& arguments) { return run(ORVEX_DECODE, arguments); }
+    static Json parsed(const Result& result)
     {
-        arguments << "--technology"
-                  << "MRL_LTE"
-                  << "--resources" << ORVEX_RESOURCES;
-        for (std::size_t i = 0; i < captures.size(); ++i)
-            arguments << write(text("%zu.pcap", i).c_str(), captures[i]);
-        return decode(arguments);
+        EXPECT_EQ(result.status, 0) << result.errors;
+        Json document = Json::parse(result.output);
+        EXPECT_EQ(result.output, document.dump(2) + "\n");
+        return document;
     }
+
+    QString capture(const char* file, const std::vector<Bytes>& messages) const
+    {
+        PcapWriter writer(path(file));
+        for (const Bytes& message : messages)
+            writer.write(message, {});
+        return name(file);
+    }
+    std::string path(const char* name) const { return folder.path(name); }
+    QString name(const char* file) const { return folder.name(file); }
+    std::string contentsOf(const char* name) const
+    {
+        std::ifstream stream(path(name), std::ios::binary);
+        return {std::istreambuf_iterator<char>(stream), {}};
+    }
+
+    const ProgramFolder folder{};
+    const QStringList lte{"--technology", "MRL_LTE", "--resources", ORVEX_RESOURCES};
 };
 
 TEST_F(DecodeTest, PrintsTheTreeOfTheCaptures)
 {
-    const std::vector<Bytes> captures = {
-        PcapFile().add(antennas(1)).bytes(), PcapFile().add(antennas(4)).bytes()};
-    const Result tree = decodeCaptures(captures);
+    const QStringList captures{capture("1", {antennas(1)}), capture("2", {antennas(4)})};
+    const Result tree = decode(lte + captures);
     EXPECT_EQ(tree.status, 0);
     EXPECT_EQ(tree.errors, "");
-    EXPECT_THAT(tree.output, HasSubstr("Orvex\n  Serving Cell Info\n"));
+    EXPECT_THAT(tree.output, StartsWith("Orvex\n  Serving Cell Info\n"));
     EXPECT_THAT(tree.output, HasSubstr("    Num Tx Antennas: 4\n"));
 
-    const std::string document = decodeCaptures(captures, {"--format", "json"}).output;
-    const auto root = Json::parse(document);
-    EXPECT_EQ(document, root.dump(2) + "\n");
+    const QStringList json{"--format", "json"};
+    const Json root = parsed(decode(lte + json + captures));
     EXPECT_EQ(root["name"], "Orvex");
     EXPECT_EQ(root["path"], "/");
     ASSERT_EQ(root["children"].size(), 11U);
-    const char* expected =
-        R"({"name":"Num Tx Antennas","path":"/Serving Cell Info/Num Tx Antennas","value":"4"})";
-    EXPECT_EQ(root["children"][0]["children"].back().dump(), expected);
+    EXPECT_EQ(root["children"][0]["children"].back().dump(),
+        R"({"name":"Num Tx Antennas","path":"/Serving Cell Info/Num Tx Antennas","value":"4"})");
     EXPECT_EQ(root["children"][3]["children"], Json::array());
 
-    const std::vector<Bytes> nothing = {PcapFile().bytes()};
-    EXPECT_EQ(decodeCaptures(nothing).output, "Orvex: (unknown)\n");
-    EXPECT_EQ(Json::parse(decodeCaptures(nothing, {"--format", "json"}).output),
-        (Json{{"name", "Orvex"}, {"path", "/"}, {"value", "(unknown)"}}));
+    const QStringList nothing = lte + QStringList{capture("none", {})};
+    EXPECT_EQ(decode(nothing).output, "Orvex: (unknown)\n");
+    EXPECT_EQ(
+        parsed(decode(json + nothing)), (Json{{"name", "Orvex"}, {"path", "/"}, {"value", "(unknown)"}}));
 }
 
 TEST_F(DecodeTest, PrintsDeepTreesCompactAndWithoutPaths)
 {
     for (const auto& [levels, hasPaths] : {std::pair(31, true), {32, false}, {250, false}}) {
-        std::string list = "<plist>";
+        std::string list = "<dict><key>c</key><string>y</string><key>d</key><string/></dict>";
         for (int i = 1; i < levels; ++i)
-            list += "<dict><key>b\xC3\xA4</key><string>x</string><key>a</key>";
-        list += "<dict><key>c</key><string>y</string><key>d</key><string/></dict>";
-        for (int i = 1; i < levels; ++i)
-            list += "</dict>";
-        list += "</plist>";
+            list = "<dict><key>b\xC3\xA4</key><string>x</string><key>a</key>" + list + "</dict>";
         const Result result = decode({"--technology", "IFX", "--format", "json",
-            write("deep.pcap", PcapFile().add(Bytes(list.begin(), list.end())).bytes())});
+            capture("deep", {bytesOf("<plist>" + list + "</plist>")})});
         ASSERT_EQ(result.status, 0) << result.errors;
-        const auto root = Json::parse(result.output);
-        EXPECT_EQ(result.output, root.dump(hasPaths ? 2 : -1) + "\n") << levels;
+        EXPECT_EQ(result.output, Json::parse(result.output).dump(hasPaths ? 2 : -1) + "\n") << levels;
         EXPECT_EQ(result.output.find("path") != std::string::npos, hasPaths) << levels;
-        EXPECT_LT(result.output.size(), hasPaths ? 50'000 : 2 * list.size()) << levels;
     }
-}
-
-TEST_F(DecodeTest, WritesDocumentAndLogToFiles)
-{
-    const Result result = decodeCaptures({PcapFile().add(antennas(4)).add(Bytes(13, 2)).bytes()},
-        {"--output", name("tree"), "--log", name("log")});
-    EXPECT_EQ(result.status, 0) << result.errors;
-    EXPECT_EQ(result.output, "") << "without lines of the console";
-    EXPECT_THAT(contentsOf(path("tree")), HasSubstr("Num Tx Antennas: 4\n"));
-    EXPECT_THAT(contentsOf(path("log")),
-        HasSubstr("\n<4>LTE Serving Cell Info\n<3>Received an unknown log message: 45249\n"
-                  "<3>Invalid log type: 2. Dropping.\n"));
 }
 
 TEST_F(DecodeTest, SaysInOneLineWhatItCannotReadOrWrite)
 {
-    const Bytes good = PcapFile().add(antennas(4)).bytes();
+    const QString good = capture("good", {antennas(4)});
+    for (const char* cut : {"cut", "cut later"}) {
+        capture(cut, std::vector<Bytes>(cut == std::string("cut") ? 1 : 2, antennas(4)));
+        std::filesystem::resize_file(path(cut), std::filesystem::file_size(path(cut)) - 1);
+    }
+    std::ofstream(path("broken.orvex")) << "<<<";
     const struct {
-        Bytes bytes;
         QStringList arguments;
         int status;
         bool isShown;
-        const char* error;
+        std::string error;
     } cases[] = {
-        {PcapFile().add(antennas(4)).cut(1).bytes(), {}, 1, false, "0.pcap: truncated"},
-        {PcapFile().add(antennas(4)).add(antennas(9)).cut(1).bytes(), {}, 1, true,
-            "(after 1 whole messages)\n"},
-        {PcapFile().add(antennas(4)).add(antennas(9), 21).bytes(), {}, 0, true,
-            "0.pcap: 1 packets hold only the beginning of their message"},
-        {good, {"/no/such/capture"}, 1, true, "orvex-decode: /no/such/capture: No such file or directory\n"},
-        {good, {"--output", "/dev/full"}, 1, false, "/dev/full: No space left on device"},
-        {good, {"--log", "/dev/full"}, 1, true, "/dev/full: No space left on device"},
-        {good, {"--snapshot", "/dev/full"}, 1, true, "/dev/full: No space left on device"},
-        {good, {"--output", "/no/such/folder/file"}, 1, false, "/no/such/folder/file: No such file or dir"},
+        {{name("cut")}, 1, false, "cut: truncated"},
+        {{name("cut later")}, 1, true, "(after 1 whole messages)\n"},
+        {{good, "/no/such/capture"}, 1, true, "orvex-decode: /no/such/capture: No such file or directory\n"},
+        {{good, "--output", "/dev/full"}, 1, false, "/dev/full: No space left on device"},
+        {{good, "--log", "/dev/full"}, 1, true, "/dev/full: No space left on device"},
+        {{good, "--snapshot", "/dev/full"}, 1, true, "/dev/full: No space left on device"},
+        {{good, "--output", "/no/such/folder/file"}, 1, false, "/no/such/folder/file: No such file or dir"},
+        {{name("broken.orvex")}, 1, false, "orvex-decode: " + path("broken.orvex") + ": "},
     };
-    for (const auto& [bytes, arguments, status, isShown, error] : cases) {
-        const Result result = decodeCaptures({bytes}, arguments);
+    for (const auto& [arguments, status, isShown, error] : cases) {
+        const bool isSnapshot = arguments[0].endsWith(".orvex");
+        const Result result = decode(isSnapshot ? arguments : lte + arguments);
         EXPECT_EQ(result.status, status) << error;
         EXPECT_THAT(result.errors, HasSubstr(error));
-        EXPECT_EQ(std::ranges::count(result.errors, '\n'), 1) << error;
+        EXPECT_EQ(std::ranges::count(result.errors, '\n'), 1) << result.errors;
         EXPECT_EQ(result.output.find("Num Tx Antennas: 4\n") != std::string::npos, isShown) << error;
     }
 }
@@ -127,59 +132,40 @@ TEST_F(DecodeTest, SaysInOneLineWhatItCannotReadOrWrite)
 TEST_F(DecodeTest, RefusesToWriteAFileItReadsOrWritesAlready)
 {
     namespace fs = std::filesystem;
-    const Bytes bytes = PcapFile().add(antennas(4)).bytes();
-    const QString capture = write("x.pcap", bytes);
-    fs::create_hard_link(path("x.pcap"), path("hard"));
-    fs::create_symlink("x.pcap", path("soft"));
-    fs::create_symlink("new", path("dangling"));
-    fs::create_directory(path("folder"));
-    fs::create_symlink("folder/../dangling", path("further"));
+    const QString input = capture("x.pcap", {antennas(4)});
+    const std::string before = contentsOf("x.pcap");
+    fs::create_symlink("x.pcap", path("link"));
     fs::copy_file(ORVEX_RESOURCES "/LTE.plist", path("LTE.plist"));
-    const struct {
-        QStringList arguments;
-        const char* conflict; // empty: none
-    } cases[] = {
-        {{"--output", name("x.pcap")}, "--output %1/x.pcap and the input %1/x.pcap"},
-        {{"--snapshot", name("folder/../x.pcap")}, "--snapshot %1/folder/../x.pcap and the input %1/x.pcap"},
-        {{"--log", name("hard")}, "--log %1/hard and the input %1/x.pcap"},
-        {{"--log", name("soft")}, "--log %1/soft and the input %1/x.pcap"},
-        {{"--output", name("new"), "--log", name("./new")}, "--log %1/./new and --output %1/new"},
-        {{"--output", name("new"), "--log", name("further")}, "--log %1/further and --output %1/new"},
-        {{"--log", name("dangling"), "--snapshot", name("further")},
-            "--snapshot %1/further and --log %1/dangling"},
-        {{"--output", name("LTE.plist")}, "--output %1/LTE.plist and the template LTE.plist"},
-        {{"--output", "/dev/null", "--log", "/dev/null"}, ""},
+    const std::pair<QStringList, std::string> cases[] = {
+        {{"--snapshot", name("link")}, "--snapshot " + path("link") + " and the input " + path("x.pcap")},
+        {{"--output", name("new"), "--log", name("./new")},
+            "--log " + path("./new") + " and --output " + path("new")},
+        {{"--output", name("LTE.plist")}, "--output " + path("LTE.plist") + " and the template LTE.plist"},
     };
-    const QString folder = name(".").chopped(2);
     for (const auto& [arguments, conflict] : cases) {
-        const QStringList common{"--technology", "MRL_LTE", "--resources", folder, capture};
-        const Result result = decode(arguments + common);
-        const bool isConflict = *conflict;
-        EXPECT_EQ(result.status, isConflict ? 2 : 0) << conflict;
-        EXPECT_EQ(result.errors,
-            isConflict
-                ? ("orvex-decode: " + QString(conflict).arg(folder) + " are the same file\n").toStdString()
-                : "");
-        EXPECT_EQ(contentsOf(path("x.pcap")), std::string(bytes.begin(), bytes.end())) << conflict;
-        EXPECT_FALSE(fs::exists(path("new"))) << conflict;
+        const Result result =
+            decode(arguments + QStringList{"--technology", "MRL_LTE", "--resources", name(""), input});
+        EXPECT_EQ(result.status, 2) << conflict;
+        EXPECT_EQ(result.errors, "orvex-decode: " + conflict + " are the same file\n");
+        EXPECT_EQ(contentsOf("x.pcap"), before);
+        EXPECT_FALSE(fs::exists(path("new")));
     }
 }
 
-TEST_F(DecodeTest, AsksForTheDisplayAfterEveryNMessages)
+TEST_F(DecodeTest, AsksForTheDisplayAfterEveryNMessagesAndNamesAMissingTemplate)
 {
-    const Bytes five = PcapFile().add({1}).add({1}).add({1}).add({1}).add({1}).bytes();
+    const QString five = capture("five", std::vector<Bytes>(5, {1}));
     // Without a template, each request and each message logs a line.
-    const auto failures = [&](const char* messages) {
-        const Result result = decode({"--log", name("log"), "--technology", "MRL_LTE", "--resources",
-            name("none"), "--refresh-every", messages, write("five.pcap", five)});
+    for (const auto& [messages, requests] : {std::pair("6", 1), {"2", 3}, {"1", 6}}) {
+        const Result result = decode({"--output", name("tree"), "--log", name("log"), "--technology",
+            "MRL_LTE", "--resources", name("none"), "--refresh-every", messages, five});
         EXPECT_EQ(result.status, 1);
+        EXPECT_EQ(result.output, "");
         EXPECT_EQ(result.errors, "orvex-decode: " + path("none/LTE.plist") + ": No such file or directory\n");
-        EXPECT_EQ(contentsOf(path("log")).find("No such"), std::string::npos);
-        return QString::fromStdString(contentsOf(path("log"))).count("Cannot load template");
-    };
-    EXPECT_EQ(failures("6"), 5 + 1);
-    EXPECT_EQ(failures("2"), 5 + 2 + 1);
-    EXPECT_EQ(failures("1"), 5 + 5 + 1);
+        EXPECT_EQ(contentsOf("tree"), "Orvex: (unknown)\n");
+        EXPECT_EQ(QString::fromStdString(contentsOf("log")).count("\n<3>Cannot load template for display\n"),
+            5 + requests);
+    }
 }
 
 TEST_F(DecodeTest, RefusesWrongUsageInOneLine)
@@ -213,8 +199,52 @@ TEST_F(DecodeTest, RefusesWrongUsageInOneLine)
     }
     const Result help = decode({"--help"});
     EXPECT_EQ(help.status, 0);
-    EXPECT_THAT(help.output, testing::StartsWith("Usage: orvex-decode [options] INPUT...\n"));
-    EXPECT_THAT(decode({"--version"}).output, testing::StartsWith("orvex-decode "));
+    EXPECT_THAT(help.output, StartsWith("Usage: orvex-decode [options] INPUT...\n"));
+}
+
+TEST_F(DecodeTest, SnapshotsKeepTheDisplayOfEveryTechnology)
+{
+    for (const std::string technology : kTechnologies) {
+        SCOPED_TRACE(technology);
+        const bool hasDLF = technology != "IFX";
+        const QStringList options{"--technology", QString::fromStdString(technology), "--resources",
+            ORVEX_RESOURCES, "--format", "json"};
+        const Json shown = parsed(decode(options
+            + QStringList{"--refresh-every", "4", "--snapshot", name("saved.orvex"), "--description",
+                "öst & <west>", QString::fromStdString(capturePath(technology))}));
+
+        const Json document = parsed(decode(options + QStringList{name("saved.orvex")}));
+        ASSERT_EQ(document["snapshots"].size(), 1U);
+        const Json& saved = document["snapshots"][0];
+        EXPECT_EQ(saved["description"], "öst & <west>");
+        ASSERT_EQ(saved["entries"].size(), hasDLF ? 6 : 5);
+        const Json& last = saved["entries"][4];
+        EXPECT_THAT(last["description"].get<std::string>(), StartsWith("Snapshot (2"));
+        EXPECT_EQ(last["display"], shown);
+        // Only the five intervals of the history; for IFX they hold everything.
+        EXPECT_EQ(last["decoded"].size(), 3U);
+        EXPECT_TRUE(hasDLF || last["decoded"] == shown);
+
+        const Result dlf = decode({"--dlf", name("saved.dlf"), name("saved.orvex")});
+        EXPECT_EQ(dlf.status, hasDLF ? 0 : 1);
+        EXPECT_EQ(
+            dlf.errors, hasDLF ? "" : "orvex-decode: " + path("saved.orvex") + ": holds no binary log\n");
+        if (technology == "MRL_CDMA") { // has no extra packets, which a DLF lacks
+            EXPECT_EQ(parsed(decode(options + QStringList{name("saved.dlf")})), last["decoded"]);
+        }
+    }
+}
+
+TEST_F(DecodeTest, NamesTheValueItCannotSave)
+{
+    Bytes key = bytesOf("\x5EkSimFile_ICCID"); // 14 characters
+    const Bytes files = binaryList({{0xD1, 1, 2}, key, {0x33, 0x7F, 0xF0, 0, 0, 0, 0, 0, 0}});
+    const Result result = decode(
+        lte + QStringList{"--snapshot", name("saved.orvex"), capture("sim", {packet(0xFF0000, files)})});
+    EXPECT_EQ(result.status, 1);
+    EXPECT_EQ(result.errors,
+        "orvex-decode: " + path("saved.orvex")
+            + ": the value at /Data/0/Display/SIM Info/EF-ICCID is a date outside of the years 1 to 9999\n");
 }
 
 } // namespace

