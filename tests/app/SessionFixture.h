@@ -13,7 +13,6 @@
 #include "Dictionary.h"
 
 #include <string>
-#include <vector>
 
 namespace orvex::test {
 
@@ -22,15 +21,15 @@ class RecordingPreferences final : public Preferences {
 public:
     void setValue(const std::string& domain, const std::string& key, const Value& value) override
     {
-        done.push_back("set " + domain + " " + key + (value == Value(false) ? " false" : " ?"));
+        done += "set " + domain + ' ' + key + (value == Value(false) ? " false, " : " ?, ");
     }
-    void synchronize(const std::string& domain) override { done.push_back("synchronize " + domain); }
+    void synchronize(const std::string& domain) override { done += "synchronize " + domain + ", "; }
     void postChanged(const std::string& domain, const std::string& key) override
     {
-        done.push_back("changed " + domain + " " + key);
+        done += "changed " + domain + ' ' + key;
     }
 
-    std::vector<std::string> done;
+    std::string done;
 };
 
 class RecordingOutput final : public ConsoleOutput {
@@ -46,11 +45,8 @@ private:
     std::string _written;
 };
 
-inline const std::vector<std::string> kHomeScreenWrite = {
-    "set org.orvex.HomeScreen HXShowGSMRSSI false",
-    "synchronize org.orvex.HomeScreen",
-    "changed org.orvex.HomeScreen HXShowGSMRSSI",
-};
+constexpr const char* kHomeScreenWrite = "set org.orvex.HomeScreen HXShowGSMRSSI false, synchronize "
+                                         "org.orvex.HomeScreen, changed org.orvex.HomeScreen HXShowGSMRSSI";
 
 // A platform whose session decodes LTE packets.
 struct SessionFixture {
