@@ -1,64 +1,17 @@
 #include "LogGenerator.h"
-#include "GSM/MRL_GSMLogGenerator.h"
-#include "LTE/LTELogGenerator.h"
 
 #include "GeneratorFixture.h"
-#include "SectionCases.h"
-#include "SystemLog.h"
-#include "TelephonyConstants.h"
-
-#include <gmock/gmock.h>
 
 namespace orvex::test {
 namespace {
 
 class LogGeneratorTest : public GeneratorFixture { };
 
-TEST_F(LogGeneratorTest, EachTechnologyHasItsGenerator)
+TEST_F(LogGeneratorTest, OtherTechnologiesHaveNoGenerator)
 {
-    resources.templates["MRL_UTRAN2"] = Dictionary::make();
-    const std::pair<const char*, int> firstCodes[] = {
-        {"IFX", 0}, {"MRL_GSM", 0x417A}, {"MRL_CDMA", 0x108A}, {"MRL_LTE", 0xB0C2}, {"MRL_UTRAN2", 0xD0E0}};
-    const QuietConsole quiet;
-    for (const auto& [technology, firstCode] : firstCodes) {
-        const auto generator = LogGenerator::generatorFromTechnology(technology, environment());
-        ASSERT_NE(generator, nullptr) << technology;
-        const auto codes = (*generator->getStartCommand())["SetMarlinLogCodes"].array();
-        EXPECT_EQ(codes ? (*codes)[0] : Value(0), Value(firstCode)) << technology;
-    }
-    EXPECT_EQ(std::size(telephony::kTechnologies), std::size(firstCodes));
     for (const Value& unknown :
         {Value("MRL_LTE "), Value("mrl_lte"), Value("MRL_UTRAN"), Value(""), Value(), Value(1)})
         EXPECT_EQ(LogGenerator::generatorFromTechnology(unknown, environment()), nullptr);
-}
-
-// Every line that a generator logs, from its creation to its destruction.
-template <typename Generator, typename Index>
-void expectLines(const GeneratorEnvironment& environment, const std::string& name)
-{
-    using testing::StartsWith;
-    RecordingLog log;
-    std::string console;
-    installConsole([&console](std::string_view line) { console += line; });
-    Index();
-    const std::size_t sections = log.take().size();
-    console.clear();
-    Generator::generator(environment);
-    installConsole({});
-    std::vector<testing::Matcher<std::string>> expected(sections, StartsWith("<4>Array Count: "));
-    expected.insert(expected.begin(), "<3>Creating " + name + " object");
-    expected.insert(expected.end(),
-        {StartsWith("<3>Creating MRLLogGenerator2 object with 0x"), StartsWith("<4>Creating Log object: 0x"),
-            "<3>Class Index: 1", StartsWith("<4>" + name + " is destructed 0x"),
-            StartsWith("<4>MRL_GSMLogGenerator is destructed 0x")});
-    EXPECT_THAT(log.take(), testing::ElementsAreArray(expected));
-    EXPECT_THAT(console, testing::MatchesRegex("Deallocing (LTE|MRL_GSM)ClassIndexDeallocing ClassIndex"));
-}
-
-TEST_F(LogGeneratorTest, MarlinGeneratorsLogTheirCreationAndDestruction)
-{
-    expectLines<LTELogGenerator, LTEClassIndex>(environment(), "LTELogGenerator");
-    expectLines<MRL_GSMLogGenerator, MRL_GSMClassIndex>(environment(), "MRL_GSMLogGenerator");
 }
 
 TEST_F(LogGeneratorTest, HistoryKeepsTheNewestFive)
