@@ -1,7 +1,11 @@
 #include "Base.h"
+#include "C2K/OneXStatus.h"
 #include "ClassIndex.h"
+#include "LTE/ReselectionCandidates.h"
 #include "PacketReader.h"
+#include "UTRAN/TransportChannels.h"
 
+#include "PacketText.h"
 #include "RecordingLog.h"
 
 #include <gtest/gtest.h>
@@ -68,6 +72,17 @@ TEST(Base, LooksUpEcNoInTheMeasuredBands)
     EXPECT_EQ(Base::lookUpECNO(4294967295), 0);
     EXPECT_EQ(Base::lookUpECNO(706), -31);
     EXPECT_EQ(Base::lookUpECNO(705), 0);
+}
+
+TEST(RecordList, ThrowsBeyondItsCount)
+{
+    const Bytes channels = packetOfText("D00C: 00 6:0 6:2 4:1 @400");
+    EXPECT_THROW(LogCode_0xD00C(channels).transportChannels()[2], ArrayOutOfBoundsException);
+    EXPECT_THROW(LogCode_0xD00C(channels).compositeChannels()[0].sir(6), ArrayOutOfBoundsException);
+    const Bytes gsm = packetOfText("B186: @19 0100 0000 0200 00000000");
+    EXPECT_THROW(LogCode_0xB186(gsm).candidates()[0].lteFields(), ArrayOutOfBoundsException);
+    const Bytes set = PacketText("03 EE 7800 0100 01 00 01 00 0000 0700 00*108").bytes();
+    EXPECT_THROW(LogCode_0x119C_ActiveSet(Subpacket(PacketReader(set))).pilot(1), ArrayOutOfBoundsException);
 }
 
 TEST(PacketReader, ReadsStayInsideThePacket)

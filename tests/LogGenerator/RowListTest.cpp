@@ -79,6 +79,17 @@ TEST(RowListTest, LeavesWhatSomebodyElseHoldsAndElementsOfAnotherKind)
     EXPECT_EQ(*kept, Dictionary({{"Z", "1"}}));
 }
 
+TEST(RowsTest, ListThatSomebodyElseHoldsIsReplaced)
+{
+    const auto dictionary = Dictionary::make();
+    for (const int number : {1, 2}) {
+        const ArrayRef held = (*dictionary)["List"].array(); // as an older history entry may hold it
+        fill(RowWriter(dictionary).list("List"), {{{"A", number}}});
+        EXPECT_TRUE(!held || described(*held) == "A=1 | ");
+        EXPECT_EQ(described(*(*dictionary)["List"].array()), number == 1 ? "A=1 | " : "A=2 | ");
+    }
+}
+
 TEST(RowsTest, KeepsTheOthersAndTheirOrder)
 {
     const auto dictionary = Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}});

@@ -82,13 +82,6 @@ inline Bytes packet(LogCode code, const Bytes& payload)
     return result;
 }
 
-// The same with the inner part of a property list in XML.
-inline Bytes propertyListPacket(LogCode code, const std::string& inner)
-{
-    const std::string list = "<plist version=\"1.0\">" + inner + "</plist>";
-    return packet(code, Bytes(list.begin(), list.end()));
-}
-
 // Cells of a cell-monitor list as a property list: "GSM Serving CellID=-5 ARFCN=7, UMTS Neighbor".
 inline std::string cellList(const std::string& cells)
 {
@@ -118,13 +111,13 @@ inline Bytes packetOfText(const std::string& text)
 {
     const auto colon = text.find(": ");
     const auto code = static_cast<LogCode>(std::stol(text, nullptr, 16));
-    const std::string payload = colon == std::string::npos ? "" : text.substr(colon + 2);
+    std::string payload = colon == std::string::npos ? "" : text.substr(colon + 2);
     if (code < kExtraCodeBase)
         return PacketText(payload, packetHeader(code)).bytes();
+    if (code == kExtraCodeCellMonitorList && !payload.starts_with('<') && payload != "no list")
+        payload = cellList(payload);
     if (payload.starts_with('<'))
-        return propertyListPacket(code, payload);
-    if (code == kExtraCodeCellMonitorList && payload != "no list")
-        return propertyListPacket(code, cellList(payload));
+        payload = "<plist version=\"1.0\">" + payload + "</plist>";
     return packet(code, Bytes(payload.begin(), payload.end()));
 }
 

@@ -1,44 +1,12 @@
-#include "C2KFixture.h"
 #include "GeneratorFixture.h"
+#include "PacketText.h"
 
+#include "C2K/C2KLogGenerator.h"
 #include "GSM/GSMLogGenerator.h"
 #include "MRLLogGenerator2.h"
 
-#include <gtest/gtest.h>
-
 namespace orvex::test {
 namespace {
-
-// The minimum length of each decoder's packets.
-const struct {
-    LogCode code;
-    std::size_t minimumLength;
-    const char* complaint; // after the length
-} kLengths[] = {
-    {0x108A, 23, "must be at least 23"},
-    {0x1183, 50, "should be 50"},
-    {0x1192, 241, "must be at least 241"},
-    {0x119C, 17, "must be at least 17"},
-    {0x119D, 17, "must be at least 17"},
-    {0x127E, 1750, "must be at least 1750"},
-    {0x12B6, 25, "must be at least 25"},
-    {0x134F, 171, "must be at least 171"},
-};
-
-TEST(C2KDecoders, RefuseShortPackets)
-{
-    C2KFixture fixture;
-    for (const auto& [code, minimumLength, complaint] : kLengths) {
-        fixture.clear();
-        fixture.feed(packet(code, Bytes(minimumLength - 1 - kPacketHeaderLength)));
-        EXPECT_TRUE(fixture.display->isEmpty());
-        EXPECT_EQ(fixture.linesNow(),
-            text("<3>Log code 0x%x is %zu bytes long but %s bytes.", static_cast<unsigned>(code),
-                minimumLength - 1, complaint));
-        fixture.feed(packet(code, Bytes(minimumLength - kPacketHeaderLength)));
-        EXPECT_EQ(fixture.linesNow().find("bytes long"), std::string::npos) << minimumLength;
-    }
-}
 
 class C2KLogGeneratorTest : public GeneratorFixture {
 public:
@@ -88,9 +56,6 @@ TEST_F(C2KLogGeneratorTest, ShowsAValueInEveryRowThatNamesItsKey)
         "Copies={_sorted=_sorted, 1;SID=258, Deep={SID=258, Mark=_sorted}}");
     EXPECT_EQ(log.take(), Lines{});
     EXPECT_EQ(*state["Template"].dictionary(), *resources.templates["C2KTemplate"]);
-    EXPECT_EQ(*generator->getStartCommand(),
-        Dictionary({{"SetState", "Streaming"},
-            {"SetMarlinLogCodes", Array::make({4234, 4483, 4498, 4790, 4508, 4509, 4734, 4943})}}));
 }
 
 TEST_F(C2KLogGeneratorTest, FramesAndKeepsWhatReachesADecoder)

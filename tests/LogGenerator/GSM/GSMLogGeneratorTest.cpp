@@ -1,6 +1,7 @@
 #include "GSM/GSMLogGenerator.h"
 
 #include "GeneratorFixture.h"
+#include "PropertyList.h"
 #include "PropertyListForms.h"
 
 namespace orvex::test {
@@ -8,57 +9,33 @@ namespace {
 
 class GSMLogGeneratorTest : public GeneratorFixture {
 public:
-    static Bytes message(const std::string& inner)
-    {
-        const std::string list = "<plist version=\"1.0\">" + inner + "</plist>";
-        return {list.begin(), list.end()};
-    }
+    static Bytes message(const std::string& inner) { return bytesOf(xmlList(inner)); }
 
     GSMLogGenerator generator{environment()};
 };
 
-// A property list of a tree as text: "{A=x, B=[h, y]}".
-std::string listOf(std::string_view& tree)
-{
-    const bool isDictionary = tree.starts_with('{');
-    if (!isDictionary && !tree.starts_with('[')) {
-        const std::string_view word = tree.substr(0, tree.find_first_of(",]}"));
-        tree.remove_prefix(word.size());
-        return "<string>" + std::string(word) + "</string>";
-    }
-    std::string result;
-    tree.remove_prefix(1);
-    while (!tree.starts_with('}') && !tree.starts_with(']')) {
-        if (tree.starts_with(", "))
-            tree.remove_prefix(2);
-        if (isDictionary) {
-            result += "<key>" + std::string(1, tree[0]) + "</key>";
-            tree.remove_prefix(2);
-        }
-        result += listOf(tree);
-    }
-    tree.remove_prefix(1);
-    return isDictionary ? "<dict>" + result + "</dict>" : "<array>" + result + "</array>";
-}
-
 TEST_F(GSMLogGeneratorTest, SimplifiesTheNesting)
 {
+    const auto only = [](const char* key, const Value& value) { return Dictionary::make({{key, value}}); };
     const struct {
-        std::string_view message;
+        Value message;
         const char* display;
     } cases[] = {
-        {"x", "x"}, {"{A=x}", "{A=x}"}, // the top level stays
-        {"{A={B={C={D=x}}}}", "{A=x}"}, {"{A={B={C=x, D=y}}}", "{A={C=x, D=y}}"}, {"{A={}}", "{A={}}"},
-        {"{A=[h, x, y]}", "{A=[x | y]}"}, // without its first
-        {"{A=[]}", "{A=[]}"}, {"{A=[h, {B=x}]}", "{A=[x]}"}, {"[h, [h, x]]", "[[x]]"},
-        {"{A={B=[h], C=x}}", "{A={B=[], C=x}}"}, // what is left out counts
+        {"x", "x"}, {only("A", "x"), "{A=x}"}, // the top level stays
+        {only("A", only("B", only("C", "x"))), "{A=x}"},
+        {only("A", only("B", Dictionary::make({{"C", "x"}, {"D", "y"}}))), "{A={C=x, D=y}}"},
+        {only("A", Dictionary::make()), "{A={}}"},
+        {only("A", Array::make({"h", "x", "y"})), "{A=[x | y]}"}, // without its first
+        {only("A", Array::make()), "{A=[]}"}, {only("A", Array::make({"h", only("B", "x")})), "{A=[x]}"},
+        {Array::make({"h", Array::make({"h", "x"})}), "[[x]]"},
+        {only("A", Dictionary::make({{"B", Array::make({"h"})}, {"C", "x"}})),
+            "{A={B=[], C=x}}"}, // what is left out counts
     };
-    for (auto [tree, expected] : cases) {
-        generator.updateState(state, message(listOf(tree)));
+    for (const auto& [message, expected] : cases) {
+        generator.updateState(state, propertyListXML(message).value());
         EXPECT_EQ(shown(generator.generateLogUsingState(state)), expected);
     }
-    const Value only = Dictionary::make({{"A", "x"}});
-    EXPECT_EQ(generator.canCollapse(only), Value("x"));
+    EXPECT_EQ(generator.canCollapse(only("A", "x")), Value("x"));
     EXPECT_TRUE(generator.canCollapse("x").isNull());
 }
 
@@ -67,8 +44,8 @@ TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheDisplay)
     EXPECT_TRUE(generator.generateLogUsingState(state).isNull());
     generator.updateState(state, message("<string>first</string>"));
     state.set("ExtraInfo", Dictionary::make({{"of", "another"}}));
-    std::string_view second = "{B=[h, x]}";
-    generator.updateState(state, message(listOf(second)));
+    generator.updateState(
+        state, message("<dict><key>B</key><array><string>h</string><string>x</string></array></dict>"));
     EXPECT_EQ(shown(generator.generateLogUsingState(state)), "{B=[x]}");
     EXPECT_EQ(shown(state["DisplayState"]), "{B=[h | x]}") << "as it came";
     EXPECT_EQ(shown(state["ExtraInfo"]), "{}");

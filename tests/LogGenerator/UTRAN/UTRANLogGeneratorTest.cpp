@@ -28,10 +28,6 @@ TEST_F(UTRANLogGeneratorTest, TakesTheFirstTemplateThatMentionsUTRAN)
     EXPECT_EQ(generator->templateError(state), "");
     generator->updateState(state, packet(0xD0E0, {1, 3}));
     EXPECT_EQ(display(), "RRC Info={State=Cell DCH}");
-    EXPECT_EQ(*generator->getStartCommand(),
-        Dictionary({{"SetState", "Streaming"},
-            {"SetMarlinLogCodes", Array::make({0xD0E0, 0xD0E2, 0xD00A, 0xD00E, 0xD00C})},
-            {"SetKoratExtraCodes", Array::make({1, 2, 0})}}));
 }
 
 } // namespace
