@@ -8,24 +8,14 @@
 namespace orvex::test {
 namespace {
 
-// "/path=value" for a leaf, "/path" for a branch, in the order of the tree.
-void describe(const OrvexModelNode& node, const std::string& path, std::vector<std::string>& result)
+// " /path=value" for a leaf, " /path" for a branch, in the order of the tree.
+std::string described(const OrvexModelNode& node, const std::string& path)
 {
-    result.push_back(node.value() ? path + "=" + *node.value() : path);
-    if (!node.childNodes())
-        return;
-    for (const auto& child : *node.childNodes())
-        describe(*child, pathByAppending(path, child->displayName()), result);
-}
-
-std::vector<std::string> treeOf(const Value& display)
-{
-    NodesByPath nodesByPath;
-    const auto root = OrvexModelNode::makeTreeFromObject(display, nodesByPath);
-    EXPECT_EQ(root->displayName(), "Orvex");
-    EXPECT_EQ(nodesByPath["/"], root);
-    std::vector<std::string> result;
-    describe(*root, "/", result);
+    std::string result = " " + path + (node.value() ? "=" + *node.value() : "");
+    if (node.childNodes()) {
+        for (const auto& child : *node.childNodes())
+            result += described(*child, pathByAppending(path, child->displayName()));
+    }
     return result;
 }
 
@@ -36,38 +26,37 @@ DictionaryRef nested(const Value& value)
 
 TEST(OrvexModelNode, ShowsEveryKindOfObject)
 {
-    using Tree = std::vector<std::string>;
     const struct {
         const char* name;
         Value display;
-        Tree tree;
+        const char* tree;
     } cases[] = {
         {"an unsorted dictionary keeps its order and its keys",
-            Dictionary::make({{"02;B", "x"}, {"01;A", "y"}}), Tree{"/", "/02;B=x", "/01;A=y"}},
+            Dictionary::make({{"02;B", "x"}, {"01;A", "y"}}), " / /02;B=x /01;A=y"},
         {"a sorted dictionary is in string order, without prefixes",
-            Dictionary::make({{"2;B", "x"}, {"_sorted", ""}, {"10;A", Dictionary::make()}}),
-            Tree{"/", "/A", "/B=x"}},
+            Dictionary::make({{"2;B", "x"}, {"_sorted", ""}, {"10;A", Dictionary::make()}}), " / /A /B=x"},
         {"only one separator makes a prefix",
             Dictionary::make({{"_sorted", "no"}, {"a;b;c", "1"}, {"plain", "2"}, {"z;", "3"}}),
-            Tree{"/", "/a;b;c=1", "/plain=2", "/=3"}},
-        {"a null value is left out", Dictionary::make({{"A", Value()}, {"B", "b"}}), Tree{"/", "/B=b"}},
-        {"array elements are numbered", Dictionary::make({{"List", Array::make({"a", "b"})}}),
-            Tree{"/", "/List", "/List/0=a", "/List/1=b"}},
-        {"arrays in arrays", Array::make({Array::make(), Array::make({"a"})}),
-            Tree{"/", "/0", "/1", "/1/0=a"}},
+            " / /a;b;c=1 /plain=2 /=3"},
+        {"a null value is left out", Dictionary::make({{"A", Value()}, {"B", "b"}}), " / /B=b"},
+        {"array elements are numbered", nested(Array::make({"a", "b"})), " / /x /x/0=a /x/1=b"},
+        {"arrays in arrays", Array::make({Array::make(), Array::make({"a"})}), " / /0 /1 /1/0=a"},
         {"other values are unknown",
-            Dictionary::make({{"n", 1}, {"r", 1.5}, {"t", true}, {"d", Date()},
-                {"b", std::make_shared<Bytes>()}, {"u", UID()}, {"s", Set{Array::make({"a"})}}}),
-            Tree{"/", "/n=(unknown)", "/r=(unknown)", "/t=(unknown)", "/d=(unknown)", "/b=(unknown)",
-                "/u=(unknown)", "/s=(unknown)"}},
+            Array::make({1, 1.5, true, Date(), std::make_shared<Bytes>(), UID(), Set{Array::make({"a"})}}),
+            " / /0=(unknown) /1=(unknown) /2=(unknown) /3=(unknown) /4=(unknown) /5=(unknown) /6=(unknown)"},
         {"only the top dictionary is sorted",
             Dictionary::make({{"_sorted", ""}, {"1;S", Dictionary::make({{"2;b", ""}, {"1;a", ""}})}}),
-            Tree{"/", "/S", "/S/2;b=", "/S/1;a="}},
-        {"an absent display", Value(), Tree{"/=(unknown)"}},
-        {"a display that is a text", "text", Tree{"/=text"}},
+            " / /S /S/2;b= /S/1;a="},
+        {"an absent display", Value(), " /=(unknown)"},
+        {"a display that is a text", "text", " /=text"},
     };
-    for (const auto& [name, display, tree] : cases)
-        EXPECT_EQ(treeOf(display), tree) << name;
+    for (const auto& [name, display, tree] : cases) {
+        NodesByPath nodes;
+        const auto root = OrvexModelNode::makeTreeFromObject(display, nodes);
+        EXPECT_EQ(described(*root, "/"), tree) << name;
+        EXPECT_EQ(root->displayName(), "Orvex");
+        EXPECT_EQ(nodes["/"], root);
+    }
 }
 
 TEST(OrvexModelNode, PathDictionaryKeepsTheLaterOfTwoNodes)
