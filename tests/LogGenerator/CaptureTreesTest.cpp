@@ -1,6 +1,6 @@
-// What each capture shows, message by message, against captures/TECHNOLOGY.txt: the texts that a row had not
-// shown before, up to its tenth. To record the files anew, after a change that is meant to show, run this
-// test with ORVEX_RECORD=1 and review the difference.
+// What each capture logs and shows, message by message, against captures/TECHNOLOGY.txt: the first ten texts
+// of each row, and the first ten of log lines that differ in their numbers alone. To record the files anew,
+// after a change that is meant to show, run this test with ORVEX_RECORD=1 and review the difference.
 
 #include "Captures.h"
 #include "GeneratorFixture.h"
