@@ -11,13 +11,20 @@ namespace {
 
 constexpr int kFontSize = 15;
 constexpr int kPlaceFontSize = 12;
+constexpr double kMostGrowth = 1.2; // more would not leave room for two lines
 constexpr int kMargin = 10;
 constexpr int kGap = 10;
 constexpr double kPlaceTop = 0.55; // of the height
 
+QFont limited(QFont font, int designSize)
+{
+    font.setPixelSize(std::min(font.pixelSize(), qRound(designSize * kMostGrowth)));
+    return font;
+}
+
 TextLabel* greyLabel(int fontSize, QWidget* parent)
 {
-    auto* const label = new TextLabel(Theme::systemFont(fontSize), parent);
+    auto* const label = new TextLabel(limited(Theme::systemFont(fontSize), fontSize), parent);
     QPalette palette = label->palette();
     palette.setColor(QPalette::WindowText, Theme::current().secondaryText);
     label->setPalette(palette);
@@ -28,7 +35,7 @@ TextLabel* greyLabel(int fontSize, QWidget* parent)
 
 FoundRowCell::FoundRowCell(std::string reuseIdentifier)
     : TableCell(std::move(reuseIdentifier))
-    , _name(new TextLabel(Theme::boldSystemFont(kFontSize), contentView()))
+    , _name(new TextLabel(limited(Theme::boldSystemFont(kFontSize), kFontSize), contentView()))
     , _value(greyLabel(kFontSize, contentView()))
     , _place(greyLabel(kPlaceFontSize, contentView()))
 {

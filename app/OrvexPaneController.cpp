@@ -23,7 +23,8 @@ namespace {
 // the other kind than its row.
 constexpr const char* kCellIdentifier = "OrvexPaneControllerCell";
 constexpr int kStatusFontSize = 14;
-constexpr int kBesidesStatus = 110; // of the toolbar's width: margins, spinner and Save button
+constexpr double kBesidesStatus =
+    70; // of the toolbar's width: margins and Save button, which grows with the font
 
 // The row of the child with the name: the former row if it still has that name, else the first that does.
 std::optional<int> rowNamed(const std::string& name, const OrvexModelNode* node, int formerRow)
@@ -211,7 +212,7 @@ void OrvexPaneController::createToolbarItems()
     else
         indicator->stopAnimating();
 
-    const int room = width() - kBesidesStatus;
+    const int room = width() - qRound(kBesidesStatus * Theme::fontScale());
     auto label = std::make_unique<TextLabel>(fittedFont(
         Theme::systemFont(kStatusFontSize), QString::fromStdString(_status), room, kStatusFontSize));
     label->setLine(QString::fromStdString(_status));

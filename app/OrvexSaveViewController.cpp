@@ -5,6 +5,7 @@
 #include "Alert.h"
 #include "Snapshot.h"
 #include "SystemLog.h"
+#include "TextLabel.h"
 #include "Theme.h"
 
 #include <QKeyEvent>
@@ -16,6 +17,7 @@ namespace orvex {
 namespace {
 constexpr const char* kCellIdentifier = "SaveHistoryContentCell";
 constexpr int kTitleFontSize = 17;
+constexpr int kTitleRoom = 150;
 constexpr int kCaptionFontSize = 13;
 } // namespace
 
@@ -30,7 +32,9 @@ OrvexSaveViewController::OrvexSaveViewController(
     , _ui(std::make_unique<Ui::OrvexSaveViewController>())
 {
     _ui->setupUi(this);
-    _ui->titleLabel->setFont(Theme::boldSystemFont(kTitleFontSize));
+    // Between buttons that grow with the desktop's font.
+    _ui->titleLabel->setFont(fittedFont(
+        Theme::boldSystemFont(kTitleFontSize), _ui->titleLabel->text(), kTitleRoom, kTitleFontSize));
     _ui->caption->setFont(Theme::systemFont(kCaptionFontSize));
     setTitle(_ui->titleLabel->text());
     _ui->saveContentTable->setDataSource(*this);

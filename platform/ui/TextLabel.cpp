@@ -24,6 +24,7 @@ QString inOneLine(QString text)
 }
 
 constexpr int kFontSize = 15;
+constexpr int kLargestField = 22; // pixels, in a field of 34
 constexpr int kTextMargin = 8;
 constexpr int kCornerRadius = 6;
 
@@ -80,7 +81,9 @@ QFont fittedFont(QFont font, const QString& text, int room, int smallest)
 TextField::TextField(QWidget* parent)
     : QLineEdit(parent)
 {
-    setFont(Theme::systemFont(kFontSize));
+    QFont font = Theme::systemFont(kFontSize);
+    font.setPixelSize(std::min(font.pixelSize(), kLargestField));
+    setFont(font);
     QPalette colours = palette();
     colours.setColor(QPalette::Base, Qt::transparent);
     setPalette(colours);

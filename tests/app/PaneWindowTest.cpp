@@ -2,6 +2,7 @@
 
 #include "PaneWindow.h"
 
+#include "FileDrop.h"
 #include "FindScreen.h"
 #include "FoundRowCell.h"
 #include "PaneFixture.h"
@@ -13,7 +14,10 @@
 
 #include <QClipboard>
 #include <QContextMenuEvent>
+#include <QDropEvent>
 #include <QMenu>
+#include <QMimeData>
+#include <QUrl>
 
 namespace orvex::test {
 namespace {
@@ -176,6 +180,24 @@ TEST_F(PaneWindowTest, GoesAsFarAsTheTreeStillHasTheRow)
 {
     panes.goTo({{"Neighbours", "7", "PCI"}, nullptr});
     EXPECT_EQ(pathsOn(panes.stack()), (std::vector<std::string>{"/", "/Neighbours"}));
+}
+
+TEST(FileDrop, TakesLocalFilesAlone)
+{
+    QWidget window;
+    std::vector<std::string> files;
+    FileDrop drop(window, [&files](const std::string& path) { files.push_back(path); });
+    QMimeData data;
+    data.setUrls({QUrl("https://example.org/a"), QUrl::fromLocalFile("/a b"), QUrl::fromLocalFile("/c")});
+    QDropEvent event({}, Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
+    drop.eventFilter(&window, &event); // the application passes it on only after a drag
+    EXPECT_TRUE(event.isAccepted());
+    EXPECT_EQ(files, (std::vector<std::string>{"/a b", "/c"}));
+    data.setUrls({QUrl("https://example.org/a")});
+    QDragEnterEvent enter({}, Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
+    enter.ignore();
+    drop.eventFilter(&window, &enter);
+    EXPECT_FALSE(enter.isAccepted());
 }
 
 TEST_F(PaneWindowTest, ANoticeReplacesTheLast)
