@@ -13,27 +13,14 @@
 namespace orvex::test {
 namespace {
 
-struct LargeFont : testing::Test {
-    LargeFont()
-    {
-        QFont twice = usual;
-        twice.setPixelSize(30);
-        QApplication::setFont(twice);
-    }
-    ~LargeFont() override { QApplication::setFont(usual); }
-
-    const QFont usual = QApplication::font();
-};
-
-TEST_F(LargeFont, RowsGrowAsFarAsNameAndValueStayInView)
+TEST(LargeFont, RowsGrowAsFarAsNameAndValueStayInView)
 {
-    ASSERT_EQ(Theme::fontScale(), 2);
-    const struct {
-        const char* name;
-        const char* value;
-        int largest;
-        int smallest;
-    } cases[] = {
+    const QFont usual = QApplication::font();
+    QFont twice = usual;
+    twice.setPixelSize(30);
+    QApplication::setFont(twice);
+    EXPECT_EQ(Theme::fontScale(), 2);
+    const std::tuple<const char*, const char*, int, int> cases[] = {
         {"Band", "20", 30, 30},
         {"Measured RSRP", "-75.50 dBm", 29, 16},
         {"Connected mode LTE Intra-frequency Measurement", "-75.50 dBm", 15, 15},
@@ -50,6 +37,7 @@ TEST_F(LargeFont, RowsGrowAsFarAsNameAndValueStayInView)
         EXPECT_EQ(cell.value()->font().pixelSize(), size) << name;
         EXPECT_EQ(cell.view()->maximumOffset() == 0, size > 15) << name;
     }
+    QApplication::setFont(usual);
 }
 
 TEST(LongTitle, ShrinksBeforeItIsCut)
@@ -58,16 +46,10 @@ TEST(LongTitle, ShrinksBeforeItIsCut)
     NavigationBar bar(&window);
     bar.resize(375, 44);
     const auto* const label = bar.findChild<QLabel*>();
-    const struct {
-        QString title;
-        int smallest;
-        int largest;
-        bool isCut;
-    } cases[] = {
+    const std::tuple<QString, int, int, bool> cases[] = {
         {"Serving Cell", 17, 17, false},
         {QString(36, 'x'), 14, 16, false},
         {QString(60, 'x'), 13, 13, true},
-        {"Serving Cell", 17, 17, false},
     };
     for (const auto& [title, smallest, largest, isCut] : cases) {
         bar.setTitles(title, {}, false);

@@ -16,18 +16,12 @@ class TerminalProgram {
 public:
     explicit TerminalProgram(const ProgramFolder& folder)
     {
-        const QStringList variables = folder.environment().toStringList();
-        std::vector<QByteArray> bytes;
-        for (const QString& variable : variables)
-            bytes.push_back(variable.toLocal8Bit());
-        std::vector<char*> environment;
-        for (QByteArray& variable : bytes)
-            environment.push_back(variable.data());
-        environment.push_back(nullptr);
         const winsize size{.ws_row = 24, .ws_col = 80, .ws_xpixel = 0, .ws_ypixel = 0};
         _process = ::forkpty(&_terminal, nullptr, nullptr, &size);
         if (_process == 0) {
-            ::execle(ORVEX_PATH, "orvex", "--console", nullptr, environment.data());
+            ::setenv("ORVEX_PORT_DIR", folder.ports().c_str(), 1);
+            ::setenv("XDG_CONFIG_HOME", folder.ports().c_str(), 1);
+            ::execl(ORVEX_PATH, "orvex", "--console", nullptr);
             ::_exit(127);
         }
     }
