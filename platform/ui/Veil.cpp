@@ -8,7 +8,7 @@
 namespace orvex {
 
 namespace {
-constexpr float kStrength = 0.45F; // values stay readable
+constexpr float kStrength = 0.35F; // values stay readable
 }
 
 Veil::Veil(QWidget* parent)
