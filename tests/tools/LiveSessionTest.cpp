@@ -91,7 +91,7 @@ TEST_F(LiveSession, MonitorAndDecoderShowTheSameOfIt)
 
 TEST_F(LiveSession, AServiceThatHasGoneIsHeardToItsLastMessage)
 {
-    KoratProgram korat(folder, {"--rate", "100", "--count", "350"});
+    KoratProgram korat(folder, {"--rate", "100", "--count", "300"});
     const Program monitor(folder, ORVEX_PATH, {"--print-status"});
     EXPECT_TRUE(monitor.waitFor(" Updated "));
     // The monitor stands still until its next refresh is due, which finds the service gone.
@@ -100,7 +100,7 @@ TEST_F(LiveSession, AServiceThatHasGoneIsHeardToItsLastMessage)
     korat.kill();
     std::this_thread::sleep_for(500ms);
     ::kill(monitor.id(), SIGCONT);
-    EXPECT_TRUE(monitor.waitFor("\n350 ")) << monitor.output();
+    EXPECT_TRUE(monitor.waitFor("\n300 ")) << monitor.output();
 }
 
 TEST_F(LiveSession, FullDiskEndsTheRecordingOnly)

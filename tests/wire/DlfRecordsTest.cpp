@@ -94,24 +94,6 @@ TEST(DlfRecords, AreFoundInEachForm)
     }
 }
 
-TEST(DlfRecords, CutFileGivesWhatIsWhole)
-{
-    const Bytes whole = joined({{{}, versionReport()}, {{}, dlfRecord(20, 0)}, {{1}, dlfRecord(21, 1)},
-        {{0x81, 0x22, 1}, dlfRecord(22, 2)}, {{1}, dlfRecord(23, 3)}, {{}, dlfRecord(24, 4)},
-        {{0x81, 0x22, 1}, dlfRecord(25, 5)}});
-    std::size_t skipped = 0;
-    auto expected = recordsOf(whole, skipped);
-    ASSERT_EQ(expected.size(), 7U);
-    expected.pop_back();
-    for (std::size_t length = whole.size(); --length > 0;) {
-        const auto some =
-            recordsOf(Bytes(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(length)), skipped);
-        ASSERT_LE(some.size(), expected.size()) << length;
-        expected.resize(some.size());
-        EXPECT_TRUE(some == expected) << length;
-    }
-}
-
 TEST(DlfRecords, AreFoundAgainBehindALengthThatLies)
 {
     for (const unsigned lie : {0U, 1U, 11U, 65535U}) { // the last one leads beyond the end
