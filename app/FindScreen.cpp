@@ -20,6 +20,7 @@ namespace {
 constexpr const char* kCellIdentifier = "FoundRow";
 constexpr int kMargin = 8;
 constexpr int kFieldHeight = 34;
+constexpr int kFontSize = 15;
 
 bool movesInList(int key)
 {
@@ -44,12 +45,15 @@ FindScreen::FindScreen(OrvexModelNodeRef root, Actions actions)
     , _field(new TextField(this))
     , _cancel(new BarButton(BarButton::Style::plain, QStringLiteral("Cancel"), this))
     , _results(new TableList(*this, this))
+    , _nothing(new TextLabel(Theme::systemFont(kFontSize), _results))
 {
     setTitle(QStringLiteral("Find"));
     _field->setPlaceholderText(QStringLiteral("Name or value"));
     _field->setAccessibleName(QStringLiteral("Find"));
     _field->installEventFilter(this);
     _results->setAccessibleName(QStringLiteral("Rows found"));
+    _nothing->setLine(QStringLiteral("No row has this text."));
+    _nothing->hide();
     connect(_field, &QLineEdit::textChanged, this, [this](const QString& text) { search(text); });
     connect(_field, &QLineEdit::returnPressed, this,
         [this] { didSelectRow(*_results, _results->selectedRow().value_or(0)); });
@@ -67,6 +71,7 @@ void FindScreen::search(const QString& text)
     _results->deselectRow();
     _results->setContentOffset(0);
     _results->reloadData();
+    _nothing->setVisible(_found.empty() && !text.isEmpty());
 }
 
 int FindScreen::numberOfRows(const TableList&) const
@@ -109,6 +114,7 @@ void FindScreen::resizeEvent(QResizeEvent*)
         width() - cancel.width(), middle - cancel.height() / 2, cancel.width(), cancel.height());
     _field->setGeometry(kMargin, middle - kFieldHeight / 2, width() - cancel.width() - kMargin, kFieldHeight);
     _results->setGeometry(0, Bar::kHeight, width(), height() - Bar::kHeight);
+    _nothing->setGeometry(kMargin, 0, width() - 2 * kMargin, TableList::kDefaultRowHeight);
 }
 
 void FindScreen::paintEvent(QPaintEvent*)

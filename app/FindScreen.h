@@ -12,6 +12,7 @@ namespace orvex {
 
 class BarButton;
 class TextField;
+class TextLabel;
 
 // Searches the display tree as it was when the screen opened: a field above a list of the rows found, each
 // with its place. Return or a tap chooses one; arrow keys move in the list while the field has the
@@ -51,6 +52,7 @@ private:
     TextField* _field; // children
     BarButton* _cancel;
     TableList* _results;
+    TextLabel* _nothing; // says that nothing was found
 };
 
 } // namespace orvex

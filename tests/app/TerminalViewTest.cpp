@@ -61,6 +61,7 @@ TEST_F(TerminalViewTest, ScrollsAndSearches)
             "r2: even|\x1b[7mr3: odd\x1b[0m|r4: even|r5: odd|/dd"},
         {"\rn", "r2: even|r3: odd|r4: even|\x1b[7mr5: odd\x1b[0m|'dd" + kFound},
         {"nn", "r8: even|\x1b[7mr9: odd\x1b[0m"},
+        {"N", "r6: even|\x1b[7mr7: odd\x1b[0m|r8: even"},
         {"/zz\r", "No line has 'zz'."},
         {"\x1b", "Lines "},
     };
