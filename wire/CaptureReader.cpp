@@ -32,18 +32,27 @@ bool isPcapMagic(const std::array<unsigned char, 4>& bytes)
     return std::ranges::find(kMagics, bytes) != std::end(kMagics);
 }
 
+std::unique_ptr<CaptureReader> openFile(const std::string& path, std::unique_ptr<CaptureFile> file)
+{
+    std::array<unsigned char, 4> magic{};
+    file->peekAt(0, magic);
+    if (!file->isOpen())
+        return std::make_unique<NoCapture>(path, file->error());
+    if (isPcapMagic(magic))
+        return std::make_unique<PcapReader>(path, std::move(file));
+    return std::make_unique<DlfReader>(path, std::move(file));
+}
+
 } // namespace
 
 std::unique_ptr<CaptureReader> CaptureReader::open(const std::string& path)
 {
-    auto file = std::make_unique<RegularFile>(path);
-    std::array<unsigned char, 4> magic{};
-    file->readAt(0, magic);
-    if (!file->error().empty())
-        return std::make_unique<NoCapture>(path, file->error());
-    if (isPcapMagic(magic))
-        return std::make_unique<PcapReader>(path, *file);
-    return std::make_unique<DlfReader>(path, std::move(file));
+    return openFile(path, std::make_unique<CaptureFile>(path));
+}
+
+std::unique_ptr<CaptureReader> CaptureReader::openStandardInput()
+{
+    return openFile("standard input", CaptureFile::standardInput());
 }
 
 } // namespace orvex

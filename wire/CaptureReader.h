@@ -17,9 +17,11 @@ public:
         broken, // the file cannot be read further; error() says why. Earlier messages remain valid.
     };
 
-    // Opens a pcap or DLF file, told apart by the first bytes. Never null: if the file is neither, or cannot
-    // be opened, the first next() reports it.
+    // Opens a pcap or DLF file, told apart by the first bytes and possibly compressed with gzip or xz. Never
+    // null: if the file is neither, or cannot be opened, the first next() reports it.
     static std::unique_ptr<CaptureReader> open(const std::string& path);
+    // The same from standard input, which may be a pipe.
+    static std::unique_ptr<CaptureReader> openStandardInput();
 
     virtual ~CaptureReader() = default;
     CaptureReader(const CaptureReader&) = delete;

@@ -10,7 +10,7 @@ constexpr std::uint8_t kLogTypeBaseband = 1;
 constexpr std::uint64_t kLargestTime = INT64_MAX;
 } // namespace
 
-DlfReader::DlfReader(const std::string& path, std::unique_ptr<RegularFile> file)
+DlfReader::DlfReader(const std::string& path, std::unique_ptr<CaptureFile> file)
     : CaptureReader(path)
     , _file(std::move(file))
 {
@@ -27,10 +27,10 @@ bool DlfReader::isDlf()
     Bytes window(kWindow);
     std::uint64_t start = 0;
     std::size_t length = 0;
-    return DlfRecords::makeUp(_file->size(), [&](std::uint64_t place) {
+    return DlfRecords::makeUp(_file->peekableSize(), [&](std::uint64_t place) {
         if (place < start || place + DlfRecords::kHeaderLength > start + length) {
             start = place;
-            length = _file->readAt(place, window);
+            length = _file->peekAt(place, window);
         }
         return ByteView(window).first(length).subspan(static_cast<std::size_t>(place - start));
     });
@@ -42,8 +42,7 @@ void DlfReader::readOn()
     _window.erase(_window.begin(), _window.begin() + static_cast<std::ptrdiff_t>(done));
     const std::size_t kept = _window.size();
     _window.resize(kept + kWindow);
-    const std::size_t length = _file->readAt(_windowEnd, std::span(_window).subspan(kept));
-    _windowEnd += length;
+    const std::size_t length = _file->read(std::span(_window).subspan(kept));
     _window.resize(kept + length);
     _records->moveOn(_window, length < kWindow);
 }

@@ -1,8 +1,8 @@
 #pragma once
 
+#include "CaptureFile.h"
 #include "CaptureReader.h"
 #include "DlfRecords.h"
-#include "RegularFile.h"
 
 namespace orvex {
 
@@ -11,7 +11,7 @@ namespace orvex {
 // file is in memory.
 class DlfReader final : public CaptureReader {
 public:
-    DlfReader(const std::string& path, std::unique_ptr<RegularFile> file);
+    DlfReader(const std::string& path, std::unique_ptr<CaptureFile> file);
 
     Status next() override;
     std::string omissions() const override { return {}; }
@@ -20,8 +20,7 @@ private:
     bool isDlf();
     void readOn();
 
-    std::unique_ptr<RegularFile> _file;
-    std::uint64_t _windowEnd = 0; // offset in the file
+    std::unique_ptr<CaptureFile> _file;
     Bytes _window;
     std::optional<DlfRecords> _records; // none if the file cannot be read
     Bytes _message;

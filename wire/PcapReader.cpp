@@ -20,12 +20,13 @@ struct PcapReader::Pcap {
     pcap_t* handle;
 };
 
-PcapReader::PcapReader(const std::string& path, RegularFile& file)
+PcapReader::PcapReader(const std::string& path, std::unique_ptr<CaptureFile> file)
     : CaptureReader(path)
+    , _file(std::move(file))
 {
-    std::FILE* stream = file.openStream();
+    std::FILE* stream = _file->openStream();
     if (!stream) {
-        fail(file.error());
+        fail(_file->error());
         return;
     }
     std::array<char, PCAP_ERRBUF_SIZE> reason{};
@@ -33,7 +34,7 @@ PcapReader::PcapReader(const std::string& path, RegularFile& file)
         pcap_fopen_offline_with_tstamp_precision(stream, PCAP_TSTAMP_PRECISION_MICRO, reason.data());
     if (!opened) {
         std::fclose(stream);
-        fail(std::string("not a pcap file: ") + reason.data());
+        fail(_file->error().empty() ? std::string("not a pcap file: ") + reason.data() : _file->error());
         return;
     }
     _pcap = std::make_unique<Pcap>(opened);
@@ -53,6 +54,8 @@ CaptureReader::Status PcapReader::next()
         pcap_pkthdr* header = nullptr;
         const u_char* bytes = nullptr;
         const int result = pcap_next_ex(_pcap->handle, &header, &bytes);
+        if (result != 1 && !_file->error().empty())
+            return fail(_file->error());
         if (result == PCAP_ERROR_BREAK)
             return Status::end;
         if (result != 1)

@@ -1,7 +1,7 @@
 #pragma once
 
+#include "CaptureFile.h"
 #include "CaptureReader.h"
-#include "RegularFile.h"
 
 namespace orvex {
 
@@ -9,7 +9,7 @@ namespace orvex {
 // packet, exactly as on the log channel.
 class PcapReader final : public CaptureReader {
 public:
-    PcapReader(const std::string& path, RegularFile& file);
+    PcapReader(const std::string& path, std::unique_ptr<CaptureFile> file);
     ~PcapReader() override;
 
     Status next() override;
@@ -18,6 +18,7 @@ public:
 private:
     struct Pcap;
 
+    std::unique_ptr<CaptureFile> _file;
     std::unique_ptr<Pcap> _pcap;        // null if the file cannot be read
     std::size_t _incompletePackets = 0; // cut by the capture's snapshot length
 };
