@@ -1,7 +1,6 @@
 #include "CaptureReader.h"
 
-#include "DlfBytes.h"
-#include "PcapFile.h"
+#include "CaptureBytes.h"
 #include "TemporaryFile.h"
 
 #include <archive.h>
