@@ -24,6 +24,8 @@ public:
     const std::string& getSectionName() const { return _sectionName; }
     std::vector<LogCode> getLogCodeArray() const { return _logCodes; }
 
+    // Of a packet with this code; a shorter one changes nothing.
+    virtual std::size_t minimumLength(LogCode /*logCode*/) const { return 0; }
     // Decodes one packet into rows.
     virtual void updateWithData(Packet packet, LogCode logCode) = 0;
 

@@ -1,5 +1,7 @@
 #include "ClassIndex.h"
 
+#include "Base.h"
+
 #include "SystemLog.h"
 
 #include <algorithm>
@@ -28,6 +30,19 @@ std::vector<std::string> CodeDictionary::keys() const
     result.reserve(_codes.size());
     for (const LogCode code : _codes)
         result.push_back(std::to_string(code));
+    return result;
+}
+
+std::vector<PacketKind> CodeDictionary::packetKinds() const
+{
+    std::vector<PacketKind> result;
+    for (std::size_t i = 0; i < _codes.size(); ++i) {
+        std::string names;
+        for (const Base* section : _subscribers[i])
+            names += (names.empty() ? "" : ", ") + section->getSectionName();
+        // Sections read packets of one code through one reader.
+        result.push_back({_codes[i], names, _subscribers[i].front()->minimumLength(_codes[i])});
+    }
     return result;
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "PacketKinds.h"
 #include "PacketReader.h"
 
 #include <map>
@@ -25,6 +26,8 @@ public:
     const Subscribers* subscribers(LogCode code) const;
     // Every code as a decimal text, in the order of the first subscription.
     std::vector<std::string> keys() const;
+    // Every code with its sections' names and the length that the first of them asks for.
+    std::vector<PacketKind> packetKinds() const;
 
 private:
     // At most about thirty codes, looked up for every packet: a linear search is as fast as a hash table.
@@ -48,6 +51,8 @@ public:
     const CodeDictionary::Subscribers* getSubscribers(LogCode code) const;
     // Every wanted code as a decimal text.
     std::vector<std::string> getAllLogCodes() const;
+    // What the sections decode.
+    std::vector<PacketKind> packetKinds() const { return _codeDictionary.packetKinds(); }
     // Writes two diagnostic lines to the system log.
     void status() const;
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "PacketKinds.h"
 #include "RawPackets.h"
 
 #include "Dictionary.h"
@@ -11,6 +12,7 @@
 #include <optional>
 #include <span>
 #include <string>
+#include <vector>
 
 namespace orvex {
 
@@ -51,6 +53,8 @@ public:
     // absent.
     static void updateHistoryInState(Dictionary& state, const Clock& clock);
 
+    // The packets that it decodes.
+    virtual std::vector<PacketKind> packetKinds() const { return {}; }
     // What the session sends to start the stream.
     virtual DictionaryRef getStartCommand() const = 0;
     // Decodes one message, exactly as received, into the state.

@@ -185,6 +185,11 @@ void MRLLogGenerator2::printDict(const Value& object) const
     }
 }
 
+std::vector<PacketKind> MRLLogGenerator2::packetKinds() const
+{
+    return _cIndex ? _cIndex->packetKinds() : std::vector<PacketKind>();
+}
+
 DictionaryRef MRLLogGenerator2::getStartCommand() const
 {
     auto logCodes = Array::make();

@@ -27,6 +27,7 @@ public:
         std::unique_ptr<ClassIndex> cIndexObj);
     ~MRLLogGenerator2() override;
 
+    std::vector<PacketKind> packetKinds() const override;
     DictionaryRef getStartCommand() const override;
     void updateState(Dictionary& state, ByteView data) override;
     Value generateLogUsingState(Dictionary& state) override;

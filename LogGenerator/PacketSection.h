@@ -34,6 +34,11 @@ protected:
 template <typename... Readers>
 class PacketSection : public Base, protected PacketTaker<Readers>... {
 public:
+    std::size_t minimumLength([[maybe_unused]] LogCode logCode) const final
+    {
+        return (std::size_t{0} + ... + (Readers::kCode == logCode ? Readers::kMinimumLength : 0));
+    }
+
     void updateWithData([[maybe_unused]] Packet packet, LogCode logCode) final
     {
         systemLogText(_entryLine.priority, _entryLine.word);

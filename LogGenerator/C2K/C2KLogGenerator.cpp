@@ -20,19 +20,21 @@ namespace {
 
 struct Decoder {
     LogCode code;
+    const char* name;
+    std::size_t minimumLength;
     void (*decode)(Packet packet, Dictionary& state, const Publisher& publisher);
 };
 
 // In the order of the start command.
 constexpr Decoder kDecoders[] = {
-    {0x108A, &EVDOFingers::decode},
-    {0x1183, &EVDOStatus::decode},
-    {0x1192, &ForwardLinkRate::decode},
-    {0x12B6, &EVDOActiveSet::decode},
-    {0x119C, &OneXStatus::decode},
-    {0x119D, &OneXTrafficFrames::decode},
-    {0x127E, &ReverseLinkRate::decode},
-    {0x134F, &OneXSystemIdentity::decode},
+    {0x108A, "EV-DO Fingers", LogCode_0x108A::kMinimumLength, &EVDOFingers::decode},
+    {0x1183, "EV-DO Status", LogCode_0x1183::kLength, &EVDOStatus::decode},
+    {0x1192, "EV-DO Forward Link Rate", LogCode_0x1192::kMinimumLength, &ForwardLinkRate::decode},
+    {0x12B6, "EV-DO Active Set", LogCode_0x12B6::kMinimumLength, &EVDOActiveSet::decode},
+    {0x119C, "1x Status", LogCode_0x119C::kMinimumLength, &OneXStatus::decode},
+    {0x119D, "1x Traffic Frames", LogCode_0x119D::kMinimumLength, &OneXTrafficFrames::decode},
+    {0x127E, "EV-DO Reverse Link Rate", LogCode_0x127E::kMinimumLength, &ReverseLinkRate::decode},
+    {0x134F, "1x System Identity", LogCode_0x134F::kMinimumLength, &OneXSystemIdentity::decode},
 };
 
 const StateTemplate& ownTemplate()
@@ -46,6 +48,14 @@ const StateTemplate& ownTemplate()
 std::unique_ptr<LogGenerator> C2KLogGenerator::generator(const GeneratorEnvironment& environment)
 {
     return std::make_unique<C2KLogGenerator>(environment);
+}
+
+std::vector<PacketKind> C2KLogGenerator::packetKinds() const
+{
+    std::vector<PacketKind> result;
+    for (const Decoder& decoder : kDecoders)
+        result.push_back({decoder.code, decoder.name, decoder.minimumLength});
+    return result;
 }
 
 DictionaryRef C2KLogGenerator::getStartCommand() const

@@ -15,6 +15,7 @@ public:
     using MRLLogGenerator::MRLLogGenerator;
     static std::unique_ptr<LogGenerator> generator(const GeneratorEnvironment& environment);
 
+    std::vector<PacketKind> packetKinds() const override;
     DictionaryRef getStartCommand() const override;
     void updateState(Dictionary& state, ByteView data) override;
     Value generateLogUsingState(Dictionary& state) override;

@@ -34,6 +34,11 @@ std::unique_ptr<LogGenerator> GSMLogGenerator::generator(const GeneratorEnvironm
     return std::make_unique<GSMLogGenerator>(environment);
 }
 
+std::vector<PacketKind> GSMLogGenerator::packetKinds() const
+{
+    return {{kCodeOfPropertyList, "Display", 0}};
+}
+
 DictionaryRef GSMLogGenerator::getStartCommand() const
 {
     return Dictionary::make({{telephony::kSetState, telephony::kStreaming}});

@@ -39,6 +39,7 @@ public:
     using LogGenerator::LogGenerator;
     static std::unique_ptr<LogGenerator> generator(const GeneratorEnvironment& environment);
 
+    std::vector<PacketKind> packetKinds() const override;
     // Asks for no log codes: the baseband streams everything.
     DictionaryRef getStartCommand() const override;
     void updateState(Dictionary& state, ByteView data) override;
