@@ -73,7 +73,7 @@ std::string CommandLine::fault() const
 CommandLine::EarlyExit CommandLine::wrongUsage(const std::string& error) const
 {
     const std::string name = _program.name;
-    return {kWrongUsage, name + ": " + visibleText(error) + " Try '" + name + " --help'.\n"};
+    return {kWrongUsage, name + ": " + visibleText(error) + "\nTry '" + name + " --help'.\n"};
 }
 
 std::string CommandLine::help() const

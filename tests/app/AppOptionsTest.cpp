@@ -42,7 +42,7 @@ TEST(AppOptions, EndsForHelpVersionAndWrongUsage)
         {{"-h"}, 0, "Usage: "},
         {{"--light", "--dark", "--help"}, 0, "  --open <FILE> "},
         {{"--version", "--console"}, 0, "orvex "},
-        {{"--no-such"}, 2, "orvex: Unknown option 'no-such'. Try 'orvex --help'.\n"},
+        {{"--no-such"}, 2, "orvex: Unknown option 'no-such'.\nTry 'orvex --help'.\n"},
         {{"a", "file"}, 2, "orvex: Unexpected argument 'file'."},
         {{"--open", "a", "file"}, 2, "orvex: Unexpected argument 'file'."},
         {{"a", "--diagnose"}, 2, "--diagnose cannot be combined with a file."},

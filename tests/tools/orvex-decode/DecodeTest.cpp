@@ -195,7 +195,7 @@ TEST_F(DecodeTest, RefusesWrongUsageInOneLine)
         const Result result = decode(QString(arguments).split(' ', Qt::SkipEmptyParts));
         EXPECT_EQ(result.status, 2) << arguments;
         EXPECT_EQ(result.output, "");
-        EXPECT_EQ(result.errors, std::string("orvex-decode: ") + error + " Try 'orvex-decode --help'.\n");
+        EXPECT_EQ(result.errors, std::string("orvex-decode: ") + error + "\nTry 'orvex-decode --help'.\n");
     }
     const Result help = decode({"--help"});
     EXPECT_EQ(help.status, 0);
