@@ -22,7 +22,7 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
     if (!read.snapshot)
         return 0;
     DisplayTreePrinter::text(*snapshotTree(*read.snapshot));
-    const SnapshotDocument document(*read.snapshot);
+    const SnapshotDocument document(file.path(), read);
     document.tree();
     std::ostringstream text;
     JsonWriter json(text);

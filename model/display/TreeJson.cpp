@@ -1,6 +1,7 @@
 #include "TreeJson.h"
 
 #include "NodesByPath.h"
+#include "Quantity.h"
 
 #include <algorithm>
 #include <iterator>
@@ -43,6 +44,11 @@ void writeNode(JsonWriter& json, const OrvexModelNode& node, const std::string* 
         json.endArray();
     } else if (const std::string* value = node.value()) {
         json.member("value", *value);
+        if (const auto quantity = quantityOf(*value)) {
+            json.key("number");
+            json.number(quantity->number);
+            json.member("unit", quantity->unit);
+        }
     }
     json.endObject();
 }
@@ -61,6 +67,12 @@ void JsonWriter::string(std::string_view text)
     using Json = nlohmann::json;
     beginValue();
     _stream << Json(text).dump(-1, ' ', false, Json::error_handler_t::replace);
+}
+
+void JsonWriter::number(double number)
+{
+    beginValue();
+    _stream << nlohmann::json(number).dump();
 }
 
 void JsonWriter::number(std::size_t number)

@@ -26,6 +26,7 @@ public:
     // Before each value of an object.
     void key(std::string_view name);
     void string(std::string_view text);
+    void number(double number);
     void number(std::size_t number);
     void boolean(bool value);
     void null();
@@ -59,7 +60,8 @@ private:
 };
 
 // Writes the display tree, or a branch of it that has the path, as one JSON object: {"name", "path",
-// "children"} for a branch, {"name", "path", "value"} for a leaf.
+// "children"} for a branch, {"name", "path", "value"} for a leaf, with "number" and "unit" if the value is a
+// quantity.
 //
 // A tree of 32 levels or more below its root is written compact and without paths. Paths repeat every name
 // above them, and indentation grows too: a few KB of a hostile report would become gigabytes.

@@ -1,6 +1,6 @@
 // The monitor on a terminal of its own: whatever ends or stops it, the terminal's modes are as before.
 
-#include "Program.h"
+#include "Programs.h"
 
 #include <gtest/gtest.h>
 

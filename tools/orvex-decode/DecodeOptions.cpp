@@ -15,34 +15,50 @@ CommandLine::Program program()
 {
     return {
         .name = "orvex-decode",
-        .summary = "Decodes the log messages of captures, in order, in one session, and prints the display "
-                   "tree. Of snapshots it prints what they store and, with --technology, what their raw "
-                   "messages decode to now. No output may be one of the inputs or another output.",
+        .summary = "Decodes the log messages of captures and prints the display tree. Captures of one "
+                   "technology make one session, in order. Of snapshots it prints what they store and, with "
+                   "--technology, what their raw messages decode to now.\n\n"
+                   "'-' is standard input or standard output. No output may be one of the inputs or another "
+                   "output.",
         .options =
             {
                 {"technology",
-                    "Technology of the messages: IFX, MRL_GSM, MRL_CDMA, MRL_LTE or MRL_UTRAN2. Required for "
-                    "captures.",
+                    "Technology of the messages: IFX, MRL_GSM, MRL_CDMA, MRL_LTE or MRL_UTRAN2. Default: "
+                    "guessed from the log codes of each capture.",
                     "T"},
                 {"format",
-                    "How to print the tree. JSON gives the path of each node, except in trees of 32 levels "
-                    "or more, which go on one line without paths. Default: tree.",
+                    "Print the tree as text or as JSON. JSON gives the path of each node, except in trees of "
+                    "32 levels or more, which go on one line without paths. Default: tree.",
                     "tree|json"},
+                {"path", "Print only this branch or row of the display: '/Serving Cell Info'.", "PATH"},
+                {"summary",
+                    "Instead of decoding, print a table of the log codes in each capture: packets, bytes, "
+                    "how many are decoded, times."},
+                {"diff",
+                    "Print the rows in which the last displays of two snapshots differ. Exit status: 0 for "
+                    "none, 1 for some, 2 for trouble."},
                 {"refresh-every",
                     "Also ask for the display after every N messages, as a session does every two seconds. "
                     "Default: only at the end.",
                     "N"},
                 {"output", "Print to FILE.", "FILE"},
+                {"quiet",
+                    "On standard error, print errors only: no notes, no progress. With --diff, print no "
+                    "differences."},
                 {"log", "Write every line of the system log to FILE, as <PRIORITY>TEXT.", "FILE"},
-                {"snapshot", "Save the session to FILE at its end.", "FILE"},
+                {"snapshot", "Save the session to FILE at its end, dated by the capture.", "FILE"},
                 {"description", "Description to put in the snapshot.", "TEXT"},
                 {"dlf", "Write the binary log of the snapshot to FILE.", "FILE"},
                 {"resources", "Take the section templates from DIR.", "DIR"},
             },
+        .exclusions = {{"summary", "diff"}, {"summary", "path"}, {"summary", "refresh-every"},
+            {"summary", "snapshot"}, {"summary", "log"}, {"diff", "technology"}, {"diff", "snapshot"},
+            {"diff", "refresh-every"}, {"diff", "dlf"}, {"diff", "log"}},
         .dependencies = {{"description", "snapshot"}},
         .argumentsSyntax = "INPUT...",
-        .argumentsDescription = "Captures or snapshots (.orvex), not both. A capture is a DLF file or a pcap "
-                                "file with link type 147 (USER0), one log message per packet.",
+        .argumentsDescription =
+            "Captures or snapshots (.orvex), not both. A capture is a DLF file or a pcap file with link type "
+            "147 (USER0), one log message per packet; gzip and xz are undone.",
     };
 }
 
@@ -51,6 +67,8 @@ bool isSnapshotFile(const std::string& path)
 {
     if (path.ends_with(".orvex"))
         return true;
+    if (path == kStandardStream)
+        return false;
     std::array<std::uint8_t, 6> bytes{};
     RegularFile(path).readAt(0, bytes);
     const std::string beginning(bytes.begin(), bytes.end());
@@ -65,49 +83,78 @@ std::size_t numberIn(const std::string& text)
     return error == std::errc() && end == text.data() + text.size() ? number : 0;
 }
 
-// Sets the members from the command line. Returns what is wrong with it; empty for nothing.
-std::string read(const CommandLine& line, DecodeOptions& options)
+// Each of these sets members from the command line and returns what is wrong with it; empty for nothing.
+
+std::string readInputs(const CommandLine& line, DecodeOptions& options)
 {
     options.inputs = line.arguments();
     if (options.inputs.empty())
         return "No capture or snapshot is given.";
+    if (std::ranges::count(options.inputs, kStandardStream) > 1)
+        return "Standard input is given more than once.";
+    if (line.isSet("diff")) {
+        options.task = DecodeOptions::Task::compareSnapshots;
+        return options.inputs.size() == 2 ? "" : "--diff goes with two snapshots.";
+    }
     const auto snapshots = std::ranges::count_if(options.inputs, isSnapshotFile);
-    options.areSnapshots = snapshots > 0;
-    if (options.areSnapshots && snapshots < std::ssize(options.inputs))
+    const bool areSnapshots = snapshots > 0;
+    if (areSnapshots && snapshots < std::ssize(options.inputs))
         return "Captures and snapshots cannot be combined.";
+    if (areSnapshots)
+        options.task = DecodeOptions::Task::showSnapshots;
 
+    for (const char* option : {"snapshot", "refresh-every", "summary"}) {
+        if (areSnapshots && line.isSet(option))
+            return "--" + std::string(option) + " goes with captures.";
+    }
+    if (line.isSet("summary"))
+        options.task = DecodeOptions::Task::summarize;
+    if (line.isSet("dlf") && (!areSnapshots || options.inputs.size() != 1))
+        return "--dlf goes with one snapshot.";
+    return {};
+}
+
+std::string readDecoding(const CommandLine& line, DecodeOptions& options)
+{
     options.technology = line.value("technology").value_or("");
-    if (options.technology.empty() && !options.areSnapshots)
-        return "--technology is required for captures.";
-    if (!options.technology.empty()
+    if (line.isSet("technology")
         && std::ranges::find(telephony::kTechnologies, options.technology)
             == std::end(telephony::kTechnologies))
         return "Unknown technology '" + options.technology + "'.";
-
-    const std::string format = line.value("format").value_or("tree");
-    if (format != "tree" && format != "json")
-        return "Unknown format '" + format + "'.";
-    options.format = format == "json" ? DecodeOptions::Format::json : DecodeOptions::Format::tree;
-
     if (const auto number = line.value("refresh-every")) {
         options.refreshEvery = numberIn(*number);
         if (options.refreshEvery == 0)
             return "--refresh-every takes a number of messages, at least 1.";
     }
     options.resources = line.value("resources");
-    options.outputFile = line.value("output");
-    options.logFile = line.value("log");
-    options.snapshotFile = line.value("snapshot");
     options.description = line.value("description").value_or("");
-    options.dlfFile = line.value("dlf");
-
-    for (const char* option : {"snapshot", "refresh-every"}) {
-        if (options.areSnapshots && line.isSet(option))
-            return "--" + std::string(option) + " goes with captures.";
-    }
-    if (options.dlfFile && (!options.areSnapshots || options.inputs.size() > 1))
-        return "--dlf goes with one snapshot.";
     return {};
+}
+
+std::string readPrinting(const CommandLine& line, DecodeOptions& options)
+{
+    const std::string format = line.value("format").value_or("tree");
+    if (format != "tree" && format != "json")
+        return "Unknown format '" + format + "'.";
+    options.format = format == "json" ? DecodeOptions::Format::json : DecodeOptions::Format::tree;
+    options.path = line.value("path").value_or("/");
+    if (!options.path.starts_with('/'))
+        return "--path takes a path that begins with '/'.";
+    options.isQuiet = line.isSet("quiet");
+
+    if (line.value("output") != kStandardStream)
+        options.outputFile = line.value("output");
+    int printed = options.outputFile ? 0 : 1;
+    const std::pair<const char*, std::optional<std::string>*> files[] = {
+        {"log", &options.logFile}, {"snapshot", &options.snapshotFile}, {"dlf", &options.dlfFile}};
+    for (const auto& [option, file] : files) {
+        *file = line.value(option);
+        if (*file == kStandardStream) {
+            *file = "/dev/stdout";
+            ++printed;
+        }
+    }
+    return printed > 1 ? "Only one output can go to standard output; --output FILE moves the tree." : "";
 }
 
 } // namespace
@@ -117,10 +164,12 @@ DecodeOptions DecodeOptions::parse(int count, const char* const* arguments)
     DecodeOptions result;
     CommandLine line(program());
     result.earlyExit = line.parse(count, arguments);
-    if (result.earlyExit)
-        return result;
-    if (const std::string error = read(line, result); !error.empty())
-        result.earlyExit = line.wrongUsage(error);
+    for (const auto read : {&readInputs, &readDecoding, &readPrinting}) {
+        if (result.earlyExit)
+            break;
+        if (const std::string error = read(line, result); !error.empty())
+            result.earlyExit = line.wrongUsage(error);
+    }
     return result;
 }
 

@@ -9,8 +9,12 @@
 
 namespace orvex {
 
+// The name of standard input among the inputs.
+inline constexpr const char* kStandardStream = "-";
+
 // What the user asked of the decoder.
 struct DecodeOptions {
+    enum class Task { decode, summarize, showSnapshots, compareSnapshots };
     enum class Format { tree, json };
 
     // The arguments as the program got them, its own name first.
@@ -18,17 +22,21 @@ struct DecodeOptions {
 
     std::optional<CommandLine::EarlyExit> earlyExit; // instead of decoding; nothing else is valid then
 
-    std::string technology; // may be empty when all inputs are snapshots
+    Task task = Task::decode;
+    std::vector<std::string> inputs; // captures, or snapshots for the last two tasks
+    std::string technology;          // empty to guess that of captures, and not to decode snapshots
     Format format = Format::tree;
-    std::size_t refreshEvery = 0;          // messages; 0 asks for the display only at the end
-    std::optional<std::string> resources;  // absent: the default directory
+    std::string path = "/";               // of the part of each display to print
+    bool isQuiet = false;                 // no notes, no progress
+    std::size_t refreshEvery = 0;         // messages; 0 asks for the display only at the end
+    std::optional<std::string> resources; // absent: the default directory
+
+    // Where outputs go; "-" has become /dev/stdout.
     std::optional<std::string> outputFile; // absent: standard output
     std::optional<std::string> logFile;
     std::optional<std::string> snapshotFile; // where to save the session; captures only
     std::string description;                 // the user's words in the snapshot
     std::optional<std::string> dlfFile;      // where the binary log of a snapshot goes
-    std::vector<std::string> inputs;
-    bool areSnapshots = false; // the inputs; else they are captures
 };
 
 } // namespace orvex

@@ -29,6 +29,8 @@ public:
 
     // Asks for the display once more.
     Value display() { return _generator->generateLogUsingState(_state); }
+    // The display as it stands, without asking for it. Later messages change it.
+    const Value& shown() const { return _state["Display"]; }
     // What a snapshot of the session stores.
     ArrayRef saveContents() const { return _generator->getSaveContentsFromState(_state); }
     std::size_t droppedRawBytes() const { return _generator->droppedRawBytes(); }

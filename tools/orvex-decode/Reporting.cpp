@@ -46,6 +46,12 @@ bool printError(const std::string& message)
     return false;
 }
 
+void printNote(const std::string& message, const DecodeOptions& options)
+{
+    if (!options.isQuiet)
+        printError(message);
+}
+
 bool writeFile(const std::string& path, std::string_view content)
 {
     return writeFile(path, [content](std::ostream& stream) { stream << content; });
@@ -60,11 +66,16 @@ bool printDocument(const std::function<void(std::ostream&)>& write, const Decode
     return std::cout ? true : printError("standard output: could not be written");
 }
 
-Progress::Progress(const std::vector<std::string>& captures)
+std::size_t longestText(const DecodeOptions& options)
 {
-    for (const std::string& capture : captures)
+    return !options.outputFile && isatty(STDOUT_FILENO) == 1 ? kLongestVisibleText : std::string::npos;
+}
+
+Progress::Progress(const DecodeOptions& options)
+{
+    for (const std::string& capture : options.inputs)
         _totalBytes += sizeOf(capture);
-    _isShown = _totalBytes >= kLargeJob && isatty(STDERR_FILENO) == 1;
+    _isShown = _totalBytes >= kLargeJob && !options.isQuiet && isatty(STDERR_FILENO) == 1;
 }
 
 Progress::~Progress()
@@ -84,6 +95,10 @@ void Progress::advance(std::size_t messageLength)
 
 void Progress::show() const
 {
+    if (_bytes > _totalBytes) { // compressed
+        std::fprintf(stderr, "\rorvex-decode: %ju MiB        ", _bytes >> 20);
+        return;
+    }
     const double part = 100.0 * static_cast<double>(_bytes) / static_cast<double>(_totalBytes);
     std::fprintf(stderr, "\rorvex-decode: %.0f %% of %ju MiB", part, _totalBytes >> 20);
 }

@@ -1,5 +1,6 @@
 #include "SnapshotDocument.h"
 
+#include "Envelope.h"
 #include "OfflineSession.h"
 
 #include "DisplayTreePrinter.h"
@@ -37,19 +38,34 @@ std::size_t feed(OfflineSession& session, const Value& kept)
 OrvexModelNodeRef treeOf(const Value& display)
 {
     NodesByPath paths;
-    return OrvexModelNode::makeTreeFromObject(display, paths);
+    return display.isNull() ? nullptr : OrvexModelNode::makeTreeFromObject(display, paths);
+}
+
+// The same node under another name.
+OrvexModelNodeRef renamed(const OrvexModelNode& node, const char* name)
+{
+    if (const auto* children = node.childNodes())
+        return std::make_shared<OrvexModelTreeNode>(name, *children);
+    return std::make_shared<OrvexModelLeafNode>(name, node.value() ? *node.value() : "");
 }
 
 } // namespace
 
-SnapshotDocument::SnapshotDocument(const Snapshot& snapshot)
-    : _timestamp(snapshot.timestamp)
-    , _description(snapshot.description)
+SnapshotDocument::SnapshotDocument(std::string path, const SnapshotResult& result)
+    : _path(std::move(path))
 {
-    for (const Value& element : *snapshot.data) {
+    const auto& [snapshot, error] = result;
+    if (!snapshot) {
+        const std::string prefix = _path + ": ";
+        _failure = error.starts_with(prefix) ? error.substr(prefix.size()) : error;
+        return;
+    }
+    _timestamp = snapshot->timestamp;
+    _description = snapshot->description;
+    for (const Value& element : *snapshot->data) {
         const Dictionary& entry = *element.dictionary();
         _entries.push_back(
-            {snapshotEntryName(entry), entry["Date"], entry["Display"], entry["DisplayState"], {}});
+            {snapshotEntryName(entry), entry["Date"], entry["DisplayState"], treeOf(entry["Display"]), {}});
         if (const BytesRef dlf = entry["DLF"].data())
             _dlf = dlf;
     }
@@ -64,30 +80,58 @@ void SnapshotDocument::decodeAnew(std::unique_ptr<LogGenerator> generator)
         if (const std::size_t rest = feed(session, entry.messages))
             _omissions.push_back(
                 text("%s: %zu bytes that make no message were left out", entry.description.c_str(), rest));
-        entry.decoded = session.display().deepCopy(); // decoding the next entry changes it
+        entry.decoded = treeOf(session.display());
     }
+}
+
+bool SnapshotDocument::restrictTo(const std::string& path)
+{
+    _nodePath = path;
+    bool isFound = false;
+    for (Entry& entry : _entries) {
+        for (OrvexModelNodeRef* tree : {&entry.display, &entry.decoded}) {
+            *tree = NodesByPath(*tree)[path];
+            isFound = isFound || *tree;
+        }
+    }
+    return isFound;
 }
 
 std::string SnapshotDocument::tree(std::size_t longestText) const
 {
-    NumberedRows rows{{"Timestamp", _timestamp}, {"Description", _description}};
-    for (const Entry& entry : _entries) {
-        auto shown = Dictionary::make();
-        for (const auto& [name, value] : {std::pair<const char*, Value>{"Date", entry.date},
-                 {"Display", entry.display}, {"Decoded anew", entry.decoded}}) {
-            if (!value.isNull())
-                shown->set(name, value);
+    NumberedRows names{{"Timestamp", _timestamp}, {"Description", _description}};
+    for (const Entry& entry : _entries)
+        names.add(entry.description, "");
+    std::vector<OrvexModelNodeRef> rows;
+    std::size_t number = 0;
+    for (const auto& [name, value] : *names.dictionary()) {
+        if (rows.size() < 2) {
+            rows.push_back(std::make_shared<OrvexModelLeafNode>(name, *value.string()));
+            continue;
         }
-        rows.add(entry.description, shown);
+        const Entry& entry = _entries[number++];
+        std::vector<OrvexModelNodeRef> shown;
+        for (const auto& [title, node] : {std::pair("Date", treeOf(entry.date)),
+                 std::pair("Display", entry.display), std::pair("Decoded anew", entry.decoded)}) {
+            if (node)
+                shown.push_back(renamed(*node, title));
+        }
+        rows.push_back(std::make_shared<OrvexModelTreeNode>(name, std::move(shown)));
     }
-    return DisplayTreePrinter::text(*treeOf(rows.dictionary()), longestText);
+    return DisplayTreePrinter::text(OrvexModelTreeNode("Orvex", std::move(rows)), longestText);
 }
 
 void SnapshotDocument::writeJson(JsonWriter& json) const
 {
-    json.beginObject();
+    beginEnvelope(json, "snapshot", _path);
+    if (!_failure.empty()) {
+        json.member("error", _failure);
+        json.endObject();
+        return;
+    }
     json.member("timestamp", _timestamp);
     json.member("description", _description);
+    writeTexts(json, "errors", _omissions);
     json.key("entries");
     json.beginArray();
     for (const Entry& entry : _entries) {
@@ -95,12 +139,12 @@ void SnapshotDocument::writeJson(JsonWriter& json) const
         json.member("description", entry.description);
         if (const std::string* date = entry.date.string())
             json.member("date", *date);
-        for (const auto& [name, display] :
-            {std::pair<const char*, const Value&>{"display", entry.display}, {"decoded", entry.decoded}}) {
-            if (display.isNull())
+        for (const auto& [name, node] :
+            {std::pair("display", entry.display), std::pair("decoded", entry.decoded)}) {
+            if (!node)
                 continue;
             json.key(name);
-            writeTreeJson(json, *treeOf(display));
+            writeTreeJson(json, *node, _nodePath);
         }
         json.endObject();
     }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator.h"
+#include "OrvexModelNode.h"
 #include "Snapshot.h"
 #include "TreeJson.h"
 
@@ -14,16 +15,20 @@ namespace orvex {
 // stored display and, if wanted, the display decoded again from the entry's raw messages.
 class SnapshotDocument {
 public:
-    explicit SnapshotDocument(const Snapshot& snapshot);
+    SnapshotDocument(std::string path, const SnapshotResult& result);
+
+    // Why the file could not be read, without its path; empty when it could. Nothing else is valid then.
+    const std::string& failure() const { return _failure; }
 
     // Feeds the raw messages of all entries to the generator, oldest first.
     void decodeAnew(std::unique_ptr<LogGenerator> generator);
 
+    // Keeps of each display only what is at the path. Returns false when no display has anything there.
+    bool restrictTo(const std::string& path);
+
     // The snapshot as a tree in text, with names and values cut to the longest.
     std::string tree(std::size_t longestText = std::string::npos) const;
-    // {"timestamp": …, "description": …, "entries": [{"description": …, "date": …, "display": TREE,
-    // "decoded": TREE}, …]}, the trees like those of captures. "display" and "decoded" are left out where an
-    // entry has no display or no messages.
+    // As one JSON document.
     void writeJson(JsonWriter& json) const;
 
     // The binary log; null when the snapshot holds none.
@@ -34,16 +39,19 @@ public:
 private:
     struct Entry {
         std::string description;
-        Value date;    // usually text
-        Value display; // null when the entry has none, such as that of the binary log
+        Value date; // usually text
         Value messages;
-        Value decoded; // null until decodeAnew()
+        OrvexModelNodeRef display; // null when the entry has none, such as that of the binary log
+        OrvexModelNodeRef decoded; // null until decodeAnew()
     };
 
+    std::string _path;
+    std::string _failure;
     std::string _timestamp;
     std::string _description;
     std::vector<Entry> _entries;
     BytesRef _dlf;
+    std::string _nodePath = "/";
     std::vector<std::string> _omissions;
 };
 

@@ -1,87 +1,40 @@
-#include "CaptureReader.h"
+#include "CaptureDecoding.h"
+#include "CaptureDocument.h"
+#include "CaptureSummary.h"
 #include "DecodeOptions.h"
+#include "Envelope.h"
 #include "FileConflict.h"
-#include "OfflineSession.h"
-#include "ReadAhead.h"
+#include "Platform.h"
 #include "Reporting.h"
+#include "SnapshotDiff.h"
 #include "SnapshotDocument.h"
-#include "TreeJson.h"
 
-#include "DisplayTreePrinter.h"
-#include "FileStorage.h"
 #include "LinuxSystemLog.h"
-#include "NodesByPath.h"
 #include "Process.h"
-#include "QtRunLoop.h"
-
 #include "Snapshot.h"
 #include "SystemLog.h"
-#include "TextFormat.h"
 
+#include <algorithm>
 #include <filesystem>
-#include <iostream>
-#include <unistd.h>
+#include <memory>
 
 using namespace orvex;
 
 namespace {
 
 constexpr int kFailure = 1;
-
-// Feeds the messages of a capture. Returns false, after an error line, unless it could be read to its end.
-bool feed(OfflineSession& session, const std::string& path, Progress& progress)
-{
-    ReadAhead reader(CaptureReader::open(path));
-    const std::size_t before = session.messageCount();
-    CaptureReader::Status status = reader.next();
-    for (; status == CaptureReader::Status::message; status = reader.next()) {
-        session.take(reader.message());
-        progress.advance(reader.message().size());
-    }
-    if (const std::string omissions = reader.omissions(); !omissions.empty())
-        printError(path + ": " + omissions);
-    if (status == CaptureReader::Status::end)
-        return true;
-    const std::size_t whole = session.messageCount() - before;
-    return printError(
-        reader.error() + (whole > 0 ? " (after " + std::to_string(whole) + " whole messages)" : ""));
-}
-
-// Cuts long texts for a terminal, but not for a file or another program.
-std::size_t longestText(const DecodeOptions& options)
-{
-    return !options.outputFile && ::isatty(STDOUT_FILENO) ? kLongestVisibleText : std::string::npos;
-}
-
-bool print(const Value& display, const DecodeOptions& options)
-{
-    NodesByPath paths;
-    const auto tree = OrvexModelNode::makeTreeFromObject(display, paths);
-    return printDocument(
-        [&](std::ostream& stream) {
-            if (options.format == DecodeOptions::Format::tree) {
-                stream << DisplayTreePrinter::text(*tree, longestText(options));
-                return;
-            }
-            JsonWriter json(stream);
-            writeTreeJson(json, *tree);
-            json.endDocument();
-        },
-        options);
-}
-
-std::string resourcesOf(const DecodeOptions& options)
-{
-    return options.resources.value_or(FileResources::defaultDirectory());
-}
+constexpr int kTrouble = 2; // of a comparison, whose 1 says that there are differences
 
 // Returns why the files cannot be used together; empty when they can.
 std::string conflictOf(const DecodeOptions& options)
 {
     std::vector<FileInUse> inputs;
-    for (const std::string& capture : options.inputs)
-        inputs.push_back({"the input " + capture, capture});
-    const std::string resources = resourcesOf(options);
+    for (const std::string& input : options.inputs) {
+        const bool isStream = input == kStandardStream;
+        inputs.push_back(
+            {isStream ? "standard input" : "the input " + input, isStream ? "/dev/stdin" : input});
+    }
+    const std::string resources = options.resources.value_or(FileResources::defaultDirectory());
     for (const std::string& name : FileResources(resources).propertyListPaths())
         inputs.push_back({"the template " + name, std::filesystem::path(resources) / name});
 
@@ -101,61 +54,38 @@ std::string conflictOf(const DecodeOptions& options)
     return fileConflict(inputs, outputs);
 }
 
-// What decoding needs of the platform.
-struct Platform {
-    explicit Platform(const DecodeOptions& options)
-        : resources(resourcesOf(options))
-        , rawPacketLimit(options.snapshotFile ? RawPackets::kLimit : 0)
-    {
+int decodeCaptures(const DecodeOptions& options, Platform& platform, const TechnologyGuess& guess)
+{
+    CaptureDecoding decoding(options, platform, guess);
+    decoding.decodeAll();
+    bool isGood = decoding.isGood();
+    // Whatever could be read is shown. With no message at all there is no tree.
+    const CaptureDocument document(decoding.captures(), options);
+    if (document.lacksPath())
+        isGood = printError("no row or branch of the display is at " + options.path);
+    if (document.hasContent())
+        isGood = printDocument([&](std::ostream& stream) { document.write(stream); }, options) && isGood;
+    if (options.snapshotFile) {
+        decoding.save();
+        isGood = decoding.isGood() && isGood;
     }
+    return isGood ? 0 : kFailure;
+}
 
-    std::unique_ptr<LogGenerator> generatorFor(const std::string& technology) const
-    {
-        return LogGenerator::generatorFromTechnology(
-            technology, GeneratorEnvironment{resources, clock, ORVEX_VERSION, rawPacketLimit});
-    }
-
-    FileResources resources;
-    SystemClock clock;
-    std::size_t rawPacketLimit; // bytes; only a snapshot needs raw packets
-};
+int summarizeCaptures(const DecodeOptions& options, Platform& platform, const TechnologyGuess& guess)
+{
+    CaptureDecoding decoding(options, platform, guess);
+    decoding.decodeAll();
+    const bool isPrinted = printDocument(
+        [&](std::ostream& stream) { writeSummaries(decoding.captures(), options, stream); }, options);
+    return isPrinted && decoding.isGood() ? 0 : kFailure;
+}
 
 // Returns false, after an error line, when there is no template for the display.
 bool hasTemplate(const LogGenerator& generator)
 {
     const std::string error = generator.templateError({});
     return error.empty() || printError(error);
-}
-
-bool save(const OfflineSession& session, Date begun, const DecodeOptions& options)
-{
-    const Snapshot snapshot{dateText(begun), session.saveContents(), options.description};
-    const std::string fault = writeSnapshot(snapshot, *options.snapshotFile);
-    if (const std::size_t dropped = session.droppedRawBytes(); fault.empty() && dropped > 0)
-        printError(text("%s: lacks the oldest %zu bytes of raw messages; a snapshot holds up to %zu MiB",
-            options.snapshotFile->c_str(), dropped, RawPackets::kLimit >> 20));
-    return fault.empty() || printError(fault);
-}
-
-int decodeCaptures(const DecodeOptions& options)
-{
-    const Platform platform(options);
-    const Date begun = platform.clock.now();
-    auto generator = platform.generatorFor(options.technology);
-    bool isGood = hasTemplate(*generator);
-    OfflineSession session(std::move(generator), options.refreshEvery);
-    {
-        Progress progress(options.inputs);
-        for (const std::string& capture : options.inputs)
-            isGood = feed(session, capture, progress) && isGood;
-    }
-    // Whatever could be read is shown. With no message at all there is no document.
-    if (!isGood && session.messageCount() == 0)
-        return kFailure;
-    isGood = print(session.display(), options) && isGood;
-    if (options.snapshotFile)
-        isGood = save(session, begun, options) && isGood;
-    return isGood ? 0 : kFailure;
 }
 
 bool extractDlf(const SnapshotDocument& document, const DecodeOptions& options)
@@ -166,56 +96,98 @@ bool extractDlf(const SnapshotDocument& document, const DecodeOptions& options)
         *options.dlfFile, {reinterpret_cast<const char*>(document.dlf()->data()), document.dlf()->size()});
 }
 
-void write(const std::vector<SnapshotDocument>& documents, const DecodeOptions& options, std::ostream& stream)
+// Does with a snapshot what the options want. Returns false, after an error line, when any of it failed.
+bool prepare(SnapshotDocument& document, const std::string& path, const DecodeOptions& options,
+    const Platform& platform)
 {
-    if (options.format == DecodeOptions::Format::tree) {
-        for (const SnapshotDocument& document : documents)
-            stream << document.tree(longestText(options));
-        return;
+    if (!document.failure().empty())
+        return printError(path + ": " + document.failure());
+    bool isGood = true;
+    if (!options.technology.empty()) {
+        auto generator = platform.generatorFor(options.technology);
+        isGood = hasTemplate(*generator);
+        document.decodeAnew(std::move(generator));
     }
-    JsonWriter json(stream);
-    json.beginObject();
-    json.key("snapshots");
-    json.beginArray();
-    for (const SnapshotDocument& document : documents)
-        document.writeJson(json);
-    json.endArray();
-    json.endObject();
-    json.endDocument();
+    for (const std::string& omission : document.omissions())
+        printNote(path + ": " + omission, options);
+    if (options.dlfFile)
+        isGood = extractDlf(document, options) && isGood;
+    if (options.path != "/" && !document.restrictTo(options.path))
+        isGood = printError(path + ": no row or branch of a display is at " + options.path);
+    return isGood;
 }
 
-int showSnapshots(const DecodeOptions& options)
+void write(const std::vector<SnapshotDocument>& documents, const DecodeOptions& options, std::ostream& stream)
 {
-    const Platform platform(options);
+    if (options.format == DecodeOptions::Format::json) {
+        writeDocuments(stream, documents,
+            [](JsonWriter& json, const SnapshotDocument& document) { document.writeJson(json); });
+        return;
+    }
+    for (const SnapshotDocument& document : documents) {
+        if (document.failure().empty())
+            stream << document.tree(longestText(options));
+    }
+}
+
+int showSnapshots(const DecodeOptions& options, const Platform& platform)
+{
     std::vector<SnapshotDocument> documents;
     bool isGood = true;
-    for (const std::string& path : options.inputs) {
-        const auto [snapshot, error] = readSnapshot(path);
-        if (!snapshot) {
-            isGood = printError(error);
-            continue;
-        }
-        SnapshotDocument& document = documents.emplace_back(*snapshot);
-        if (!options.technology.empty()) {
-            auto generator = platform.generatorFor(options.technology);
-            isGood = hasTemplate(*generator) && isGood;
-            document.decodeAnew(std::move(generator));
-        }
-        for (const std::string& omission : document.omissions())
-            printError(text("%s: %s", path.c_str(), omission.c_str()));
-        if (options.dlfFile)
-            isGood = extractDlf(document, options) && isGood;
-    }
-    if (documents.empty())
-        return kFailure;
-    isGood =
-        printDocument([&](std::ostream& stream) { write(documents, options, stream); }, options) && isGood;
+    for (const std::string& path : options.inputs)
+        isGood = prepare(documents.emplace_back(path, readSnapshot(path)), path, options, platform) && isGood;
+    const bool isEmpty = std::ranges::all_of(
+        documents, [](const SnapshotDocument& document) { return !document.failure().empty(); });
+    if (options.format == DecodeOptions::Format::json || !isEmpty)
+        isGood = printDocument([&](std::ostream& stream) { write(documents, options, stream); }, options)
+            && isGood;
     return isGood ? 0 : kFailure;
+}
+
+int compareSnapshots(const DecodeOptions& options)
+{
+    OrvexModelNodeRef displays[2];
+    for (std::size_t i = 0; i < 2; ++i) {
+        const auto [snapshot, error] = readSnapshot(options.inputs[i]);
+        if (!snapshot) {
+            printError(error);
+            return kTrouble;
+        }
+        displays[i] = lastDisplay(*snapshot, options.path);
+    }
+    if (!displays[0] && !displays[1]) {
+        printError("no row or branch of either display is at " + options.path);
+        return kTrouble;
+    }
+    std::size_t count = 0;
+    const auto compare = [&](std::ostream& stream) {
+        count = writeDifferences(displays[0].get(), displays[1].get(), options, stream);
+    };
+    if (options.isQuiet) {
+        std::ostream nowhere(nullptr);
+        compare(nowhere);
+    } else if (!printDocument(compare, options)) {
+        return kTrouble;
+    }
+    return count == 0 ? 0 : 1;
+}
+
+int perform(const DecodeOptions& options, Platform& platform, const TechnologyGuess& guess)
+{
+    switch (options.task) {
+    case DecodeOptions::Task::decode: return decodeCaptures(options, platform, guess);
+    case DecodeOptions::Task::summarize: return summarizeCaptures(options, platform, guess);
+    case DecodeOptions::Task::showSnapshots: return showSnapshots(options, platform);
+    case DecodeOptions::Task::compareSnapshots: return compareSnapshots(options);
+    }
+    return kFailure;
 }
 
 // Decodes the inputs, with a log if there is to be one.
 int decode(const DecodeOptions& options)
 {
+    Platform platform(options);
+    const TechnologyGuess guess(platform.environment()); // before there is a log for its lines
     std::unique_ptr<FileSystemLog> log;
     if (options.logFile) {
         log = std::make_unique<FileSystemLog>(*options.logFile);
@@ -225,7 +197,7 @@ int decode(const DecodeOptions& options)
         }
         SystemLog::install(log.get());
     }
-    int status = options.areSnapshots ? showSnapshots(options) : decodeCaptures(options);
+    int status = perform(options, platform, guess);
     SystemLog::install(nullptr);
     if (log) {
         log->flush();
