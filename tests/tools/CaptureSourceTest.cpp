@@ -39,7 +39,7 @@ protected:
     static std::vector<Message> round(CaptureSource& source)
     {
         std::vector<Message> result;
-        while (auto message = source.next())
+        while (auto message = source.next({}))
             result.push_back(std::move(*message));
         return result;
     }
@@ -118,7 +118,7 @@ TEST_F(CaptureSourceTest, MessagesAreWantedByTheCodesInTheirHeaders)
     };
     for (const auto& [bytes, code] : cases) {
         writePcap({bytes}, {0s});
-        const auto message = CaptureSource(path, true).next();
+        const auto message = CaptureSource(path, true).next({});
         ASSERT_TRUE(message);
         EXPECT_EQ(message->code, code) << testing::PrintToString(bytes);
         EXPECT_EQ(message->bytes, bytes);

@@ -1,5 +1,6 @@
 // The parts of koratd, without a process or a socket.
 
+#include "CaptureSource.h"
 #include "Recorder.h"
 #include "Streamer.h"
 
@@ -84,7 +85,7 @@ struct SlowClient final : FakePort<RemotePort> {
 
 class StreamerTest : public testing::Test {
 protected:
-    void stream(const DictionaryRef& command, const Streamer::Pace& pace, CaptureSource source)
+    void stream(const DictionaryRef& command, const Streamer::Pace& pace, std::unique_ptr<Source> source)
     {
         streamer = std::make_unique<Streamer>(runLoop, client, std::move(source), Subscription(*command),
             GarbageSource(0), pace, Streamer::Listener());
@@ -110,7 +111,7 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
     constexpr std::size_t kLargestMessage = 1 << 16;
     const std::string capture = capturePath("MRL_LTE");
     client->refusals = 3;
-    stream(Dictionary::make(), {1e6, std::nullopt}, {capture, false});
+    stream(Dictionary::make(), {1e6, std::nullopt}, std::make_unique<CaptureSource>(capture, false));
     ASSERT_TRUE(tickUntil([&] { return client->pending > kBacklog; }));
     const std::size_t sent = client->received.size();
     tickUntil([] { return false; }, 5);
@@ -121,9 +122,9 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
     ASSERT_TRUE(tickUntil([&] { return client->received.size() > sent + 100; }));
     CaptureSource source(capture, false);
     for (const Bytes& message : client->received) {
-        auto expected = source.next();
+        auto expected = source.next({});
         if (!expected && source.restart())
-            expected = source.next();
+            expected = source.next({});
         ASSERT_EQ(message, expected->bytes);
     }
 }
@@ -156,7 +157,7 @@ TEST_F(StreamerTest, RestsAfterTheEndAndRepeatsOnlyWhatIsWanted)
                     {});
         }
         stream(Dictionary::make({{"SetMarlinLogCodes", Array::make({wantedCode})}}), {2000, count},
-            {file.path, once});
+            std::make_unique<CaptureSource>(file.path, once));
         tickUntil([] { return false; }, 30);
         EXPECT_EQ(runLoop.timerCount(), rests ? 0U : 1U) << name;
         EXPECT_GE(client->received.size(), atLeast) << name;

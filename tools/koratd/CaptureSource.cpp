@@ -4,6 +4,8 @@
 
 #include "MessageFrame.h"
 
+#include <utility>
+
 namespace orvex::korat {
 
 namespace {
@@ -35,7 +37,7 @@ CaptureSource::CaptureSource(const std::string& path, bool once)
 {
 }
 
-std::optional<Message> CaptureSource::next()
+std::optional<Message> CaptureSource::next(Microseconds /*now*/)
 {
     const CaptureReader::Status status = _reader->next();
     if (status != CaptureReader::Status::message) {
@@ -89,6 +91,18 @@ void CaptureSource::reportLosses(CaptureReader::Status status)
         report("%s: %s", _path.c_str(), omissions.c_str());
     if (status == CaptureReader::Status::broken)
         report("%s (after %zu messages)", _reader->error().c_str(), _count);
+}
+
+CaptureFeed::CaptureFeed(std::string technology, std::string path, bool once)
+    : _technology(std::move(technology))
+    , _path(std::move(path))
+    , _once(once)
+{
+}
+
+std::unique_ptr<Source> CaptureFeed::open(const std::string& /*technology*/)
+{
+    return std::make_unique<CaptureSource>(_path, _once);
 }
 
 } // namespace orvex::korat

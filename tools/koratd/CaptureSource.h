@@ -1,21 +1,13 @@
 #pragma once
 
+#include "Source.h"
+
 #include "CaptureReader.h"
-#include "LogCode.h"
 
 #include <cstdint>
 #include <optional>
 
 namespace orvex::korat {
-
-using Microseconds = std::chrono::microseconds;
-
-// One message of the log channel, as it goes over the wire.
-struct Message {
-    Microseconds due{};          // since the start of the stream
-    std::optional<LogCode> code; // none: it is no packet
-    Bytes bytes;
-};
 
 // The messages of a capture file, pcap or DLF, once or round after round.
 //
@@ -29,17 +21,16 @@ struct Message {
 // capture, later by the rounds before. The first round is the capture to the byte.
 //
 // What could not be read is reported after the first round.
-class CaptureSource {
+class CaptureSource final : public Source {
 public:
     // Why the file cannot be played, in one line; empty when its first message can be read, or it has none.
     static std::string faultOf(const std::string& path);
 
     CaptureSource(const std::string& path, bool once);
 
-    // The next message of this round; none at its end.
-    std::optional<Message> next();
-    // Begins the next round. False when the capture is played once only.
-    bool restart();
+    std::optional<Message> next(Microseconds now) override;
+    // False when the capture is played once only.
+    bool restart() override;
 
 private:
     void reportLosses(CaptureReader::Status status);
@@ -55,6 +46,21 @@ private:
     std::optional<std::uint64_t> _firstPacketTime; // in the capture
     std::uint64_t _lastPacketTime = 0;
     std::uint64_t _shift = 0; // how much later packets are than in the capture
+};
+
+// Plays a capture file to every monitor, from its beginning.
+class CaptureFeed final : public Feed {
+public:
+    CaptureFeed(std::string technology, std::string path, bool once);
+
+    std::string start() override { return CaptureSource::faultOf(_path); }
+    std::string technology() override { return _technology; }
+    std::unique_ptr<Source> open(const std::string& technology) override;
+
+private:
+    std::string _technology;
+    std::string _path;
+    bool _once;
 };
 
 } // namespace orvex::korat

@@ -37,10 +37,10 @@ Microseconds timeNow()
 }
 } // namespace
 
-std::unique_ptr<LogChannel> LogChannel::open(const Platform& platform, const Options& options,
+std::unique_ptr<LogChannel> LogChannel::open(const Platform& platform, const Options& options, Feed& feed,
     Recorder* recorder, const std::string& clientPortName, const std::string& channelPortName)
 {
-    std::unique_ptr<LogChannel> channel(new LogChannel(platform, options, recorder, clientPortName));
+    std::unique_ptr<LogChannel> channel(new LogChannel(platform, options, feed, recorder, clientPortName));
     channel->_client = platform.ports.createRemotePort(clientPortName);
     if (!channel->_client)
         return nullptr;
@@ -55,10 +55,12 @@ std::unique_ptr<LogChannel> LogChannel::open(const Platform& platform, const Opt
     return channel;
 }
 
-LogChannel::LogChannel(
-    const Platform& platform, const Options& options, Recorder* recorder, std::string clientPortName)
+LogChannel::LogChannel(const Platform& platform, const Options& options, Feed& feed, Recorder* recorder,
+    std::string clientPortName)
     : _platform(platform)
     , _options(options)
+    , _feed(feed)
+    , _technology(feed.technology())
     , _recorder(recorder)
     , _clientPortName(std::move(clientPortName))
 {
@@ -93,8 +95,7 @@ std::optional<Bytes> LogChannel::technologyReply() const
         return std::nullopt;
     if (_options.faults.badReply)
         return Bytes(kNoPropertyList.begin(), kNoPropertyList.end());
-    const std::string technology =
-        _options.faults.unknownTechnology ? kUnheardOfTechnology : _options.technology;
+    const std::string technology = _options.faults.unknownTechnology ? kUnheardOfTechnology : _technology;
     return propertyListXML(Dictionary::make({{telephony::kGetTechnology, technology}}));
 }
 
@@ -107,15 +108,16 @@ void LogChannel::startStream(const Dictionary& command)
         listener = [recorder = _recorder, start](
                        const Message& message) { recorder->write(message.bytes, start + message.due); };
     }
-    _streamer =
-        std::make_unique<Streamer>(_platform.runLoop, _client, CaptureSource(_options.capture, _options.once),
-            Subscription(command), GarbageSource(_options.faults.garbagePercent),
-            Streamer::Pace{_options.rate, _options.count}, std::move(listener));
+    _streamer = std::make_unique<Streamer>(_platform.runLoop, _client, _feed.open(_technology),
+        Subscription(command), GarbageSource(_options.faults.garbagePercent),
+        Streamer::Pace{_options.rate, _options.count}, std::move(listener));
 }
 
-KoratService::KoratService(const LogChannel::Platform& platform, const Options& options)
+KoratService::KoratService(
+    const LogChannel::Platform& platform, const Options& options, std::unique_ptr<Feed> feed)
     : _platform(platform)
     , _options(options)
+    , _feed(std::move(feed))
 {
 }
 
@@ -126,7 +128,7 @@ KoratService::~KoratService()
 
 bool KoratService::start()
 {
-    if (const std::string fault = CaptureSource::faultOf(_options.capture); !fault.empty()) {
+    if (const std::string fault = _feed->start(); !fault.empty()) {
         report("%s", fault.c_str());
         return false;
     }
@@ -143,13 +145,18 @@ bool KoratService::start()
         if (!_recorder->isRecording())
             return false;
     }
-    _watch = _platform.runLoop.startTimer(kWatchPeriod, [this] {
-        if (_channel && !_channel->isClientThere())
-            closeChannel();
-        if (_recorder)
-            _recorder->flush();
-    });
+    _watch = _platform.runLoop.startTimer(kWatchPeriod, [this] { watch(); });
     return true;
+}
+
+void KoratService::watch()
+{
+    if (_channel && !_channel->isClientThere())
+        closeChannel();
+    if (_channel && _channel->technology() != _feed->technology()) // the client asks for it again
+        closeChannel("has to ask for the technology again");
+    if (_recorder)
+        _recorder->flush();
 }
 
 void KoratService::stop()
@@ -202,21 +209,26 @@ Bytes KoratService::openChannel(const std::string& clientPortName)
         return channelReply(EBUSY);
     }
     const std::string channelPortName = kChannelPortPrefix + std::to_string(++_channelNumber);
-    _channel = LogChannel::open(_platform, _options, _recorder.get(), clientPortName, channelPortName);
-    if (!_channel)
+    _feed->setMonitored(true);
+    _channel =
+        LogChannel::open(_platform, _options, *_feed, _recorder.get(), clientPortName, channelPortName);
+    if (!_channel) {
+        _feed->setMonitored(false);
         return channelReply(ENOENT);
+    }
     report("serving %s", clientPortName.c_str());
     armDeath();
     return channelReply(0, channelPortName);
 }
 
-void KoratService::closeChannel()
+void KoratService::closeChannel(const char* why)
 {
     if (!_channel)
         return;
-    report("%s has left; sent %zu messages to it", _channel->clientPortName().c_str(), _channel->sent());
+    report("%s %s; sent %zu messages to it", _channel->clientPortName().c_str(), why, _channel->sent());
     _sentBefore += _channel->sent();
     _channel.reset();
+    _feed->setMonitored(false);
 }
 
 void KoratService::armDeath()

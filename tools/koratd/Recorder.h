@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CaptureSource.h"
+#include "Source.h"
 
 #include "PcapWriter.h"
 

@@ -15,6 +15,7 @@ constexpr std::int64_t kLargestCode = 0xFFFF;
 
 constexpr std::int32_t kLogMessageId = 0;
 constexpr auto kTick = 10ms;
+constexpr auto kLiveTick = 100ms; // a modem changes slowly, and every tick wakes a handset
 // The run loop has other work; what a tick does not manage is left to the next.
 constexpr auto kLongestTick = 20ms;
 constexpr std::size_t kLargestBacklog = std::size_t{4} << 20; // bytes
@@ -49,7 +50,7 @@ bool Subscription::isStartCommand(const Dictionary& command)
     return command[telephony::kSetState] == Value(telephony::kStreaming);
 }
 
-Streamer::Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client, CaptureSource source,
+Streamer::Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client, std::unique_ptr<Source> source,
     Subscription subscription, GarbageSource garbage, Pace pace, Listener listener)
     : _client(std::move(client))
     , _source(std::move(source))
@@ -59,7 +60,7 @@ Streamer::Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client, Capture
     , _listener(std::move(listener))
     , _lastTick(SteadyClock::now())
 {
-    _timer = runLoop.startTimer(kTick, [this] { tick(); });
+    _timer = runLoop.startTimer(_source->isLive() ? kLiveTick : kTick, [this] { tick(); });
 }
 
 void Streamer::tick()
@@ -94,8 +95,10 @@ bool Streamer::isDue() const
 void Streamer::findNext(SteadyClock::time_point deadline)
 {
     while (SteadyClock::now() < deadline) {
-        auto message = _source.next();
+        auto message = _source->next(_elapsed);
         if (!message) {
+            if (_source->isLive())
+                return;
             if (goOnAfterTheEnd())
                 continue;
             _timer.reset();
@@ -113,7 +116,7 @@ void Streamer::findNext(SteadyClock::time_point deadline)
 bool Streamer::goOnAfterTheEnd()
 {
     // Where nothing was wanted once, nothing ever will be, however often it comes by.
-    return std::exchange(_foundSomething, false) && _source.restart();
+    return std::exchange(_foundSomething, false) && _source->restart();
 }
 
 bool Streamer::sendNext()

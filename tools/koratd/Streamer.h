@@ -32,7 +32,8 @@ private:
 };
 
 // Sends a source's messages to a client: those it wants, when they are due, or at a given rate. While the
-// client is slow, the source stands still; nothing is dropped. After the end of the source the stream rests.
+// client is slow, the source stands still; nothing is dropped. After the end of the source the stream rests;
+// a live source is asked again.
 class Streamer {
 public:
     struct Pace {
@@ -43,7 +44,7 @@ public:
     // Is told of every message that was sent.
     using Listener = std::function<void(const Message& message)>;
 
-    Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client, CaptureSource source,
+    Streamer(RunLoop& runLoop, std::shared_ptr<RemotePort> client, std::unique_ptr<Source> source,
         Subscription subscription, GarbageSource garbage, Pace pace, Listener listener = {});
 
     // Messages sent so far.
@@ -59,7 +60,7 @@ private:
     bool goOnAfterTheEnd();
 
     std::shared_ptr<RemotePort> _client;
-    CaptureSource _source;
+    std::unique_ptr<Source> _source;
     Subscription _subscription;
     GarbageSource _garbage;
     Pace _pace;

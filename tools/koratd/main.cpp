@@ -1,3 +1,4 @@
+#include "CaptureSource.h"
 #include "KoratService.h"
 #include "Options.h"
 
@@ -17,7 +18,8 @@ int serve(const orvex::korat::Options& options)
     using namespace orvex;
     QtRunLoop runLoop;
     SocketMessagePorts ports;
-    korat::KoratService service({runLoop, ports}, options);
+    korat::KoratService service({runLoop, ports}, options,
+        std::make_unique<korat::CaptureFeed>(options.technology, options.capture, options.once));
     const TerminationSignals stopSignals([&service] {
         service.reportSent();
         service.stop();

@@ -36,8 +36,7 @@ protected:
         return {std::istreambuf_iterator<char>(stream), {}};
     }
 
-    static constexpr std::chrono::system_clock::time_point kTime{
-        std::chrono::microseconds(1'700'000'000'654'321)};
+    static constexpr std::chrono::microseconds kTime{1'700'000'000'654'321};
 
     const ProgramFolder folder{};
 };
