@@ -19,11 +19,25 @@ CommandLine::Program program()
         .name = "koratd",
         .summary =
             "Stands in for a handset's telephony service: opens a log channel for a monitor and streams "
-            "the messages of a capture to it.",
+            "to it the messages of a capture, or what a modem says.",
         .options =
             {
                 {"technology",
-                    "Log technology: IFX, MRL_GSM, MRL_CDMA, MRL_LTE or MRL_UTRAN2. Default: MRL_LTE.", "T"},
+                    "Log technology: IFX, MRL_GSM, MRL_CDMA, MRL_LTE or MRL_UTRAN2. Default: MRL_LTE. A "
+                    "modem "
+                    "has no MRL_CDMA; its default is IFX, which shows everything, and auto follows its "
+                    "serving "
+                    "cell.",
+                    "T"},
+                {"source",
+                    "What to stream from: capture, or modemmanager for the modem that ModemManager controls. "
+                    "Default: capture.",
+                    "S"},
+                {"identities", "Show the IMEI and IMSI, which are left out otherwise. For a modem only."},
+                {"measurements",
+                    "Send RSRP and RSRQ of a modem's LTE cells, in the packet of connected mode, whatever "
+                    "mode "
+                    "the modem is in. For a modem only."},
                 {"capture",
                     "Play this pcap or DLF file, again and again. Default: the technology's own, T.pcap.",
                     "FILE"},
@@ -55,13 +69,53 @@ std::string defaultCapture(const std::string& technology)
     return std::filesystem::path(FileResources::dataDirectory(".")) / "captures" / (technology + ".pcap");
 }
 
-// Returns what is wrong; empty if nothing is.
+// Each of these returns what is wrong; empty if nothing is.
+
+std::string readTechnology(const CommandLine& line, Options& options)
+{
+    const bool isModem = options.from == Options::From::modemManager;
+    const std::string name =
+        line.value("technology")
+            .value_or(isModem ? telephony::kTechnologyIFX : telephony::kTechnologyMRL_LTE);
+    if (isModem && name == "auto")
+        return {};
+    if (std::ranges::find(telephony::kTechnologies, name) == std::end(telephony::kTechnologies))
+        return "Unknown technology '" + name + "'.";
+    if (isModem && name == telephony::kTechnologyMRL_CDMA)
+        return "A modem has no MRL_CDMA; IFX shows its CDMA cells.";
+    options.technology = name;
+    return {};
+}
+
+std::string readSource(const CommandLine& line, Options& options)
+{
+    const std::string source = line.value("source").value_or("capture");
+    if (source != "capture" && source != "modemmanager")
+        return "Unknown source '" + source + "'.";
+    const bool isModem = source == "modemmanager";
+    options.from = isModem ? Options::From::modemManager : Options::From::capture;
+    options.identities = line.isSet("identities");
+    options.measurements = line.isSet("measurements");
+    for (const char* option : {"capture", "once", "rate"}) {
+        if (isModem && line.isSet(option))
+            return std::string("--") + option + " needs a capture, not a modem.";
+    }
+    for (const char* option : {"identities", "measurements"}) {
+        if (!isModem && line.isSet(option))
+            return std::string("--") + option + " needs --source modemmanager.";
+    }
+    return {};
+}
+
 std::string read(const CommandLine& line, Options& options)
 {
-    options.technology = line.value("technology").value_or(telephony::kTechnologyMRL_LTE);
-    if (std::ranges::find(telephony::kTechnologies, options.technology) == std::end(telephony::kTechnologies))
-        return "Unknown technology '" + options.technology + "'.";
-    options.capture = line.value("capture").value_or(defaultCapture(options.technology));
+    std::string wrong = readSource(line, options);
+    if (wrong.empty())
+        wrong = readTechnology(line, options);
+    if (!wrong.empty())
+        return wrong;
+    if (options.from == Options::From::capture)
+        options.capture = line.value("capture").value_or(defaultCapture(*options.technology));
     options.once = line.isSet("once");
     options.record = line.value("record");
     if (const auto rate = line.value("rate")) {
@@ -84,7 +138,7 @@ std::string read(const CommandLine& line, Options& options)
 // A conflict of files needs no usage: its line names both.
 std::string conflictIn(const Options& options)
 {
-    if (!options.record)
+    if (!options.record || options.capture.empty())
         return {};
     return fileConflict({{"--capture " + options.capture, options.capture}},
         {{"--record " + *options.record, *options.record}});

@@ -1,6 +1,8 @@
 #include "CaptureSource.h"
 #include "KoratService.h"
 #include "Options.h"
+#include "modem/ModemFeed.h"
+#include "modem/ModemManagerReader.h"
 
 #include "LinuxSystemLog.h"
 #include "Process.h"
@@ -13,13 +15,22 @@
 #include <cstdlib>
 
 namespace {
+std::unique_ptr<orvex::korat::Feed> makeFeed(orvex::RunLoop& runLoop, const orvex::korat::Options& options)
+{
+    using namespace orvex::korat;
+    if (options.from == Options::From::capture)
+        return std::make_unique<CaptureFeed>(*options.technology, options.capture, options.once);
+    return std::make_unique<ModemFeed>(runLoop,
+        std::make_unique<ModemManagerReader>(runLoop, QDBusConnection::systemBus(), options.identities),
+        options.technology, options.measurements);
+}
+
 int serve(const orvex::korat::Options& options)
 {
     using namespace orvex;
     QtRunLoop runLoop;
     SocketMessagePorts ports;
-    korat::KoratService service({runLoop, ports}, options,
-        std::make_unique<korat::CaptureFeed>(options.technology, options.capture, options.once));
+    korat::KoratService service({runLoop, ports}, options, makeFeed(runLoop, options));
     const TerminationSignals stopSignals([&service] {
         service.reportSent();
         service.stop();

@@ -1,0 +1,30 @@
+#pragma once
+
+#include <QDBusMessage>
+#include <QObject>
+
+#include <functional>
+#include <utility>
+
+namespace orvex::korat {
+
+// Passes a signal of D-Bus on to a function: Qt delivers it to slots only. In a header without any of ours,
+// because moc does not understand concepts.
+class BusSignal final : public QObject {
+    Q_OBJECT
+
+public:
+    BusSignal(std::function<void(const QDBusMessage&)> onSignal, QObject* parent)
+        : QObject(parent)
+        , _onSignal(std::move(onSignal))
+    {
+    }
+
+public slots:
+    void receive(const QDBusMessage& signal) { _onSignal(signal); }
+
+private:
+    std::function<void(const QDBusMessage&)> _onSignal;
+};
+
+} // namespace orvex::korat
