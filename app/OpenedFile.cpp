@@ -1,11 +1,11 @@
 #include "OpenedFile.h"
 
 #include "CaptureReader.h"
-#include "CaptureTechnology.h"
 #include "NodesByPath.h"
 #include "Snapshot.h"
 #include "SnapshotTree.h"
 #include "SnapshotViewer.h"
+#include "TechnologyGuess.h"
 #include "TextFormat.h"
 #include "VisibleText.h"
 
@@ -22,6 +22,17 @@ OpenedFile openSnapshot(const std::string& path)
 {
     const auto [snapshot, error] = readSnapshot(path);
     return snapshot ? OpenedFile{snapshotTree(*snapshot), snapshotMessage(*snapshot), {}} : failed(error);
+}
+
+// By the log codes at the beginning; empty if they tell nothing.
+std::string technologyOfCapture(const std::string& path, const GeneratorEnvironment& environment)
+{
+    constexpr int kMessagesRead = 10'000;
+    const auto reader = CaptureReader::open(path);
+    TechnologyGuess::Counts counts;
+    for (int i = 0; i < kMessagesRead && reader->next() == CaptureReader::Status::message; ++i)
+        ++counts[codeOfMessage(reader->message())];
+    return TechnologyGuess(environment).best(counts);
 }
 
 OpenedFile openCapture(const std::string& path, const GeneratorEnvironment& environment)

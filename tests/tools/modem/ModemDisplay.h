@@ -2,18 +2,26 @@
 
 #include "modem/ModemPackets.h"
 
-#include "Decoding.h"
+#include "FileStorage.h"
+#include "FixedClock.h"
+#include "LogGenerator.h"
 #include "Shown.h"
+#include "SystemLog.h"
 
 namespace orvex::korat {
 
 // What a monitor shows after all messages about the state.
 inline Value display(const char* technology, const ModemState& state, bool withMeasurements = false)
 {
-    test::Decoding decoding(technology);
+    installConsole([](std::string_view) {}); // some sections write a line for every packet
+    FileResources resources(ORVEX_RESOURCES);
+    test::FixedClock clock;
+    const auto generator =
+        LogGenerator::generatorFromTechnology(technology, {resources, clock, std::nullopt});
+    const DictionaryRef shown = Dictionary::make();
     for (const Content& content : contentsFor(technology, state, withMeasurements))
-        decoding.feed(messageOf(content, 1));
-    return decoding.display();
+        generator->updateState(*shown, messageOf(content, 1));
+    return (*shown)["Display"];
 }
 
 // The section of that name, in whatever group, without the rows that show nothing.

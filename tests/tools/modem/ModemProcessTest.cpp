@@ -4,7 +4,7 @@
 
 #include "Environment.h"
 #include "KoratClient.h"
-#include "KoratProgram.h"
+#include "Programs.h"
 #include "Shown.h"
 
 #include <gmock/gmock.h>
