@@ -195,7 +195,7 @@ TEST(ModemCells, AThousandFitIntoOneMessage)
     EXPECT_EQ(state.cells.size(), 256U);
     const Value report = display("IFX", state);
     EXPECT_EQ((*report.dictionary())["UMTS Neighbors"].array()->size(), 255U);
-    EXPECT_EQ(test::shown(section(report, "Cells")), "745 more than are shown");
+    EXPECT_EQ(test::shown(section(report, "Cells")), "745 more cells than are shown");
     for (const char* technology : {"IFX", "MRL_GSM"}) {
         for (const Content& content : contentsFor(technology, state, true))
             EXPECT_LT(messageOf(content, 1).size(), 262'144U)

@@ -104,7 +104,9 @@ TEST(ModemState, SaysWhatStandsInTheWay)
         {"Bearers", "/Bearer/0"}, {"OwnNumbers", Array::make({1})}, {"AccessTechnologies", -1}});
     const auto all =
         Dictionary::make({{"/a", Dictionary::make({{kModemInterface, wrong}, {kSignalInterface, 3}})}});
-    EXPECT_EQ(conditionLine(modemStateOf(*all, "/a", true)), "The modem is not enabled");
+    const ModemState state = modemStateOf(*all, "/a", true);
+    EXPECT_EQ(test::shown(section(display("IFX", state), "Modem")), "State: unknown");
+    EXPECT_EQ(conditionLine(state), "The modem is not enabled");
 }
 
 TEST(ModemState, OfSeveralModemsTheFirstThatIsEnabledIsWatched)

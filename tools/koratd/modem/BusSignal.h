@@ -20,8 +20,7 @@ public:
     {
     }
 
-public slots:
-    void receive(const QDBusMessage& signal) { _onSignal(signal); }
+    Q_SLOT void receive(const QDBusMessage& signal) { _onSignal(signal); }
 
 private:
     std::function<void(const QDBusMessage&)> _onSignal;

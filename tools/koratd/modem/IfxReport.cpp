@@ -136,7 +136,8 @@ std::string cellLine(const ModemState& state)
     switch (state.cellAnswer) {
     case CellAnswer::notAsked: break;
     case CellAnswer::told:
-        return state.cellsLeftOut == 0 ? std::string() : text("%zu more than are shown", state.cellsLeftOut);
+        return state.cellsLeftOut == 0 ? std::string()
+                                       : text("%zu more cells than are shown", state.cellsLeftOut);
     case CellAnswer::notSupported: return "This modem does not tell its cells";
     case CellAnswer::denied: return "Not allowed to ask for cells; orvex-modem.conf allows it";
     case CellAnswer::none: return "The modem does not answer";

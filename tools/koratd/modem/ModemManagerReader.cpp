@@ -182,7 +182,7 @@ void ModemManagerReader::setUpSignal(Time now)
 bool ModemManagerReader::isSignalRateOurs() const
 {
     const auto rate = numberOf(_objects.properties(_signalModem, kSignalInterface), "Rate");
-    return rate == kSignalRate || rate == 0;
+    return rate && (*rate == kSignalRate || *rate == 0);
 }
 
 void ModemManagerReader::putSignalBack()

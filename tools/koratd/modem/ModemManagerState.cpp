@@ -14,7 +14,9 @@ namespace orvex::korat {
 
 namespace {
 constexpr std::int64_t kMostOfAll = std::numeric_limits<std::int64_t>::max();
-constexpr int kStateFailed = -1; // MMModemState
+constexpr std::int64_t kAnyTechnology = 0xFFFFFFFF; // MM_MODEM_ACCESS_TECHNOLOGY_ANY, which names none
+constexpr int kUnknown = -2;                        // no value of any table
+constexpr int kStateFailed = -1;                    // MMModemState
 constexpr int kStateLocked = 2;
 constexpr int kStateEnabled = 6;
 
@@ -79,10 +81,10 @@ constexpr struct {
     {"error-rate", "Error Rate", "%"},
 };
 
-int intIn(const Value& value)
+int enumerated(const Value& value)
 {
     const std::int64_t* number = value.integer();
-    return number && std::in_range<int>(*number) ? static_cast<int>(*number) : 0;
+    return number && std::in_range<int>(*number) ? static_cast<int>(*number) : kUnknown;
 }
 
 std::vector<std::string> textsIn(const Value& value)
@@ -100,7 +102,7 @@ std::vector<std::string> textsIn(const Value& value)
 int stateOf(const Dictionary& objects, const std::string& path)
 {
     const DictionaryRef modem = propertiesIn(objects, path, kModemInterface);
-    return modem ? intIn((*modem)["State"]) : 0;
+    return modem ? enumerated((*modem)["State"]) : kUnknown;
 }
 
 Condition conditionOf(int state)
@@ -119,15 +121,15 @@ void takeModem(ModemState& state, const Dictionary& modem, bool withIdentities)
     state.revision = textIn(modem["Revision"]);
     if (withIdentities)
         state.imei = textIn(modem["EquipmentIdentifier"]);
-    const int number = intIn(modem["State"]);
+    const int number = enumerated(modem["State"]);
     state.stateName = textFor(number, kStates, "unknown");
     state.condition = conditionOf(number);
     if (state.condition == Condition::failed)
         state.conditionText =
-            textFor(intIn(modem["StateFailedReason"]), kFailures, "the reason is not known");
+            textFor(enumerated(modem["StateFailedReason"]), kFailures, "the reason is not known");
     if (state.condition == Condition::locked)
-        state.conditionText = textFor(intIn(modem["UnlockRequired"]), kLocks, "a code");
-    const int technologies = intIn(modem["AccessTechnologies"]);
+        state.conditionText = textFor(enumerated(modem["UnlockRequired"]), kLocks, "a code");
+    const std::int64_t technologies = numberIn(modem["AccessTechnologies"], kAnyTechnology - 1).value_or(0);
     for (const auto& [bit, name, radio] : kAccessTechnologies) {
         if ((technologies >> bit & 1) == 0)
             continue;
@@ -141,7 +143,7 @@ void takeModem(ModemState& state, const Dictionary& modem, bool withIdentities)
 
 Registration registrationFrom(const Dictionary& properties)
 {
-    return {textFor(intIn(properties["RegistrationState"]), kRegistrations, "unknown"),
+    return {textFor(enumerated(properties["RegistrationState"]), kRegistrations, "unknown"),
         textIn(properties["OperatorCode"]), textIn(properties["OperatorName"])};
 }
 
