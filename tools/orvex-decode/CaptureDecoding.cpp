@@ -3,6 +3,7 @@
 #include "ReadAhead.h"
 
 #include "Snapshot.h"
+#include "TelephonyConstants.h"
 #include "TextFormat.h"
 
 #include <algorithm>
@@ -85,12 +86,12 @@ void CaptureDecoding::decode(DecodedCapture& capture, Progress& progress)
         capture.technology = name;
     }
     if (_options.task == DecodeOptions::Task::summarize) {
-        feed(capture, reader, progress);
+        feed(capture, reader, nullptr, progress);
         return;
     }
     if (!beginSession(capture))
         return;
-    feed(capture, reader, progress);
+    feed(capture, reader, wouldEndSession(reader) ? nullptr : &*_session, progress);
     if (capture.hasFailed())
         return;
     _lastOfSession = _captures.size() - 1;
@@ -98,15 +99,26 @@ void CaptureDecoding::decode(DecodedCapture& capture, Progress& progress)
         capture.display = _session->shown().deepCopy(); // the next capture may change it
 }
 
-void CaptureDecoding::feed(DecodedCapture& capture, CaptureReader& reader, Progress& progress)
+// IFX ends the process at the first message that is no property list. When the user named it for a capture of
+// another technology, that helps nobody.
+bool CaptureDecoding::wouldEndSession(PeekedCapture& capture) const
+{
+    if (_options.technology != telephony::kTechnologyIFX)
+        return false;
+    const std::string likely = _guess.best(capture.peekCodes());
+    return !likely.empty() && likely != _options.technology;
+}
+
+void CaptureDecoding::feed(
+    DecodedCapture& capture, CaptureReader& reader, OfflineSession* session, Progress& progress)
 {
     capture.counts.emplace(_guess.kindsOf(capture.technology));
     CaptureReader::Status status = reader.next();
     for (; status == CaptureReader::Status::message; status = reader.next()) {
         _platform.clock.setTime(reader.time());
         capture.counts->add(reader.message(), reader.time());
-        if (_session)
-            _session->take(reader.message());
+        if (session)
+            session->take(reader.message());
         progress.advance(reader.message().size());
     }
     if (const std::string omissions = reader.omissions(); !omissions.empty())

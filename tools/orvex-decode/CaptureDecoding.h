@@ -43,7 +43,9 @@ public:
 
 private:
     void decode(DecodedCapture& capture, Progress& progress);
-    void feed(DecodedCapture& capture, CaptureReader& reader, Progress& progress);
+    bool wouldEndSession(PeekedCapture& capture) const;
+    // A null session gets nothing; the messages are counted.
+    void feed(DecodedCapture& capture, CaptureReader& reader, OfflineSession* session, Progress& progress);
     void noteWrongTechnology(DecodedCapture& capture);
     bool beginSession(DecodedCapture& capture);
     void endSession();

@@ -78,6 +78,10 @@ TEST_F(FilterTest, SaysWhatMessagesLookLikeWhenNoneIsForTheTechnology)
     EXPECT_THAT(result.output, HasSubstr("    GSM Serving Cell\n"));
     EXPECT_EQ(decode(withResources({"--quiet", "--technology", "MRL_GSM", capture("MRL_LTE")})).errors, "");
 
+    const Result unsent = decode({"--technology", "IFX", capture("MRL_CDMA")}); // IFX ends at any packet
+    EXPECT_EQ(unsent.output, "Orvex: (unknown)\n");
+    EXPECT_THAT(unsent.errors, HasSubstr("0 of 3,836 messages were for IFX; they look like MRL_CDMA\n"));
+
     const std::vector<Bytes> many(1'234, packetHeader(0x7777));
     EXPECT_EQ(json({"--technology", "MRL_GSM", capture("many.pcap", many)})["errors"],
         Json({"0 of 1,234 messages were for MRL_GSM"}));
