@@ -15,6 +15,7 @@ TEST(Installation, ProgramsFindTemplatesAndCapturesBesideThem)
         run(CMAKE_COMMAND, {"--install", ORVEX_BUILD_DIRECTORY, "--prefix", folder.name("first")}).status, 0);
     std::filesystem::rename(folder.path("first"), moved);
     EXPECT_NE(run(moved + "/bin/orvex", {"--version"}).output, "");
+    EXPECT_TRUE(std::filesystem::exists(moved + "/share/orvex/orvex-decode.schema.json"));
 
     const std::string played = moved + "/share/orvex/captures/MRL_LTE.pcap";
     const auto decoded = [&] {
