@@ -55,7 +55,7 @@ Bytes longPcap()
     PcapFile file;
     for (std::size_t i = 0; i < 3'000; ++i)
         file.add(Bytes(1 + i % 1'500, static_cast<std::uint8_t>(i * i)));
-    return file.bytes();
+    return file.bytes;
 }
 
 Bytes longDlf()
@@ -69,7 +69,7 @@ Bytes longDlf()
 TEST(CompressedCapture, HoldsWhatTheFileHeldBefore)
 {
     const TemporaryFile file;
-    for (const Bytes& plain : {longPcap(), longDlf(), PcapFile().bytes(), Bytes(100, 'x'), Bytes()}) {
+    for (const Bytes& plain : {longPcap(), longDlf(), PcapFile().bytes, Bytes(100, 'x'), Bytes()}) {
         const Content expected = contentOf(writeFile(file.path, plain));
         for (const Filter filter : {Filter::gzip, Filter::xz}) {
             const Content content = contentOf(writeFile(file.path, compressed(plain, filter)));

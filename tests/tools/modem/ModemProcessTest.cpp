@@ -10,6 +10,7 @@
 #include <gmock/gmock.h>
 
 #include <algorithm>
+#include <set>
 
 namespace orvex::test {
 namespace {
@@ -61,7 +62,7 @@ TEST_F(ModemProcess, ShowsTheModemWhileAMonitorWatchesAndLeavesItAsItWas)
         modem.cells[0]["ci"] = "2";
         waitForReport(client, "Cell ID=2}");
     }
-    ASSERT_TRUE(korat.waitForError("has left"));
+    ASSERT_TRUE(korat.waitFor("has left"));
     const auto before = modem.calls;
     turnFor(6s); // longer than the period of questions
     EXPECT_EQ(modem.calls, before);
@@ -92,7 +93,7 @@ TEST_F(ModemProcess, SaysWhatStandsInTheWayAndRecovers)
     modem.change(korat::kModemInterface, "State", 8);
     waitForReport(client, "Cells=Not allowed to ask for cells; orvex-modem.conf allows it");
     waitForReport(client, "SIM=");
-    EXPECT_TRUE(korat.waitForError("orvex-modem.conf"));
+    EXPECT_TRUE(korat.waitFor("orvex-modem.conf"));
     modem.unplug();
     waitForReport(client, "Status=There is no modem");
     modem.cellError.clear();
@@ -109,7 +110,7 @@ TEST_F(ModemProcess, AsksNoSecondTimeWhileTheModemHangs)
 {
     modem.isHanging = true;
     KoratProgram korat(folder, {"--source", "modemmanager", "--technology", "auto"});
-    ASSERT_TRUE(korat.waitForError("watching Example M1"));
+    ASSERT_TRUE(korat.waitFor("watching Example M1"));
     KoratClient client(folder.ports());
     ASSERT_EQ(client.open(), 0);
     client.send();
@@ -125,14 +126,19 @@ TEST_F(ModemProcess, AsksNoSecondTimeWhileTheModemHangs)
 TEST_F(ModemProcess, AsksTheMonitorToAskAgainWhenTheServingCellHasAnotherTechnology)
 {
     KoratProgram korat(folder, {"--source", "modemmanager", "--technology", "auto"});
-    ASSERT_TRUE(korat.waitForError("watching Example M1"));
+    ASSERT_TRUE(korat.waitFor("watching Example M1"));
     KoratClient client(folder.ports());
     ASSERT_EQ(client.open(), 0);
     EXPECT_EQ(client.technology(), Value("MRL_LTE"));
     client.send();
-    ASSERT_TRUE(waitUntil([&] { return client.codes().size() == 3; }));
+    ASSERT_TRUE(waitUntil([&] {
+        std::set<Bytes> codes;
+        for (const Bytes& message : client.messages)
+            codes.insert({message.at(0), message.at(3), message.at(4)});
+        return codes.size() == 3;
+    }));
     modem.cells[0]["cell-type"] = 4U;
-    ASSERT_TRUE(korat.waitForError("has to ask for the technology again"));
+    ASSERT_TRUE(korat.waitFor("has to ask for the technology again"));
     ASSERT_EQ(client.open(), 0);
     EXPECT_EQ(client.technology(), Value("MRL_UTRAN2"));
 }
