@@ -379,8 +379,10 @@ TEST_P(LogCodes, AreThoseOfTheDocumentAndSoAreTheirSections)
 
     const auto index = classIndexOf(GetParam());
     for (const DocumentedCode& code : index ? codes : std::vector<DocumentedCode>()) {
+        const auto* const subscribers = index->getSubscribers(code.code);
+        ASSERT_TRUE(subscribers) << nameOf(code.code);
         std::vector<std::string> sections;
-        for (const Base* section : *index->getSubscribers(code.code))
+        for (const Base* section : *subscribers)
             sections.push_back(section->getSectionName());
         EXPECT_EQ(code.sections, sections) << nameOf(code.code);
     }
