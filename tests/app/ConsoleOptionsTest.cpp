@@ -110,7 +110,7 @@ TEST_F(ConsoleOptionsTest, JsonHasALineForEveryState)
         R"({"name":"Neighbor Measurements","path":"/Neighbor Measurements","children":[)"
         R"({"name":"Version","path":"/Neighbor Measurements/Version","value":"3"},)"
         R"({"name":"E-ARFCN","path":"/Neighbor Measurements/E-ARFCN","value":"6300"},)"
-        R"({"name":"Qrxlevmin","path":"/Neighbor Measurements/Qrxlevmin","value":"-140 dBm"}]}})"
+        R"({"name":"Qrxlevmin","path":"/Neighbor Measurements/Qrxlevmin","value":"-140 dBm","number":-140.0,"unit":"dBm"}]}})"
         "\n");
 }
 

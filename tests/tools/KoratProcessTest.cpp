@@ -30,7 +30,7 @@ TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
         QStringList arguments;
         int status = 2;
     } cases[] = {
-        {"Unknown technology 'MRL_NOISE'. Try 'koratd --help'.", {"--technology", "MRL_NOISE"}},
+        {"Unknown technology 'MRL_NOISE'.\nTry 'koratd --help'.", {"--technology", "MRL_NOISE"}},
         {"--rate takes a number", {"--rate", "0"}},
         {"--count takes a number", {"--count", "-1"}},
         {"Unknown fault 'garbage=101'.", {"--fault", "garbage=101"}},

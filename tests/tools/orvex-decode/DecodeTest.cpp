@@ -140,8 +140,8 @@ TEST_F(DecodeTest, AsksForTheDisplayAfterEveryNMessagesAndNamesAMissingTemplate)
     const QString five = capture("five", std::vector<Bytes>(5, {1}));
     // Without a template, each request and each message logs a line.
     for (const auto& [messages, requests] : {std::pair("6", 1), {"2", 3}, {"1", 6}}) {
-        const Result result = decode({"--output", name("tree"), "--log", name("log"), "--technology",
-            "MRL_LTE", "--resources", name("none"), "--refresh-every", messages, five});
+        const Result result = decode({"--quiet", "--output", name("tree"), "--log", name("log"),
+            "--technology", "MRL_LTE", "--resources", name("none"), "--refresh-every", messages, five});
         EXPECT_EQ(result.status, 1);
         EXPECT_EQ(result.output, "");
         EXPECT_EQ(result.errors, "orvex-decode: " + path("none/LTE.plist") + ": No such file or directory\n");
