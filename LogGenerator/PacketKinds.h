@@ -12,21 +12,21 @@ namespace orvex {
 struct PacketKind {
     LogCode code;
     std::string name;          // what it reports, or the sections that want it
-    std::size_t minimumLength; // a shorter one changes nothing
+    std::size_t minimumLength; // shorter packets change nothing
 };
 
-// What the message of a capture is, besides a packet with its log code.
+// Codes of messages that are not packets.
 inline constexpr LogCode kCodeOfPropertyList = -1; // a whole display, as IFX sends them
 inline constexpr LogCode kCodeOfNoPacket = -2;     // shorter than a packet, or of no known log type
 LogCode codeOfMessage(ByteView message);
 
-// False for extra packets: the same ones come with every Marlin technology.
+// False for extra packets, which every Marlin technology shares.
 constexpr bool tellsTechnology(LogCode code)
 {
     return code < kExtraCodeBase;
 }
 
-// All that a technology decodes.
+// All packets that a technology decodes.
 class PacketKinds {
 public:
     explicit PacketKinds(std::vector<PacketKind> kinds)
@@ -34,7 +34,7 @@ public:
     {
     }
 
-    // Null when nobody wants the code.
+    // Null if the technology does not decode the code.
     const PacketKind* find(LogCode code) const;
 
 private:

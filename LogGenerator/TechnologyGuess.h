@@ -9,19 +9,19 @@
 
 namespace orvex {
 
-// Tells by their log codes which technology messages are of.
+// Guesses the technology of messages by their log codes.
 class TechnologyGuess {
 public:
-    // How many messages have each code, by codeOfMessage().
+    // Number of messages per codeOfMessage().
     using Counts = std::map<LogCode, std::size_t>;
 
-    // Creates a generator of each technology and destroys it, so the system log gets their lines.
+    // Creates and destroys a generator of each technology, which writes lines to the system log.
     explicit TechnologyGuess(const GeneratorEnvironment& environment);
 
     // What the technology decodes.
     const PacketKinds& kindsOf(const std::string& technology) const;
-    // The technology that decodes most of the messages, extra packets aside, which tell nothing. Empty when
-    // none decodes any, or two as many.
+    // The technology that decodes most of the messages, not counting extra packets. Empty if none decodes
+    // any, or if two decode equally many.
     std::string best(const Counts& counts) const;
 
 private:

@@ -4,10 +4,10 @@
 
 namespace orvex {
 
-// Whether standard output takes colours: a terminal that is not dumb, and $NO_COLOR is not set.
+// True if standard output is a terminal that is not dumb and $NO_COLOR is not set.
 bool standardOutputTakesColours();
 
-// Green while the session is up, else yellow.
+// Green while the session is up, otherwise yellow.
 std::string colouredStatus(const std::string& status, bool isConnected);
 // A line of the tree, possibly cut or padded: branches bold, values in cyan. `nameEnd` is that of the uncut
 // line; a line without a value ends with its name.
@@ -15,7 +15,7 @@ std::string colouredLine(const std::string& line, std::size_t nameEnd);
 // The line that a search has found.
 std::string highlightedLine(const std::string& line);
 
-// Stands for the tree where it lacks the branch asked for.
+// Shown in place of a branch that the tree does not have.
 std::string nothingAt(const std::string& path);
 
 } // namespace orvex

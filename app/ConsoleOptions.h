@@ -6,13 +6,13 @@
 
 namespace orvex {
 
-// What the user asked of the console.
+// The console's options.
 struct ConsoleOptions {
-    std::string path = "/"; // of the branch to show
+    std::string path = "/"; // branch to show
     bool once = false;      // end after the first tree
     bool json = false;
     std::optional<std::chrono::milliseconds> timeout = {};
-    std::optional<std::string> saveFile = {}; // for a snapshot at the end
+    std::optional<std::string> saveFile = {}; // snapshot written at the end
 };
 
 } // namespace orvex

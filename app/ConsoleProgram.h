@@ -11,7 +11,7 @@ int printFile(int argc, char** argv, const AppOptions& options);
 // Prints why a session does not come up. Returns the exit status.
 int printDiagnosis(int argc, char** argv, const AppOptions& options);
 
-// Qt sets the user's locale, which may have decimal commas. Values and property lists have points.
+// Qt sets the user's locale, which may have decimal commas; values and property lists have points.
 void keepDecimalPoints();
 
 } // namespace orvex

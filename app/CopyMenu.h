@@ -10,8 +10,7 @@ namespace orvex {
 // Copies a text to the clipboard.
 void copyText(const QString& text);
 
-// Opens the menu of a row, which copies the row or the whole screen, and returns at once. The texts are those
-// of the moment in which it opens.
+// Opens a menu that copies the row or the whole screen, as they are at this moment, and returns at once.
 void showCopyMenu(QWidget& parent, const QPoint& globalPlace, const QString& row, const QString& screen);
 
 } // namespace orvex

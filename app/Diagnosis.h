@@ -10,8 +10,7 @@
 
 namespace orvex {
 
-// Goes through what the start of a session needs, step by step up to the first fault, and says in one line
-// each what it finds.
+// Checks what a session needs to start, up to the first fault, with one line per step.
 class Diagnosis {
 public:
     struct Finding {
@@ -19,7 +18,7 @@ public:
         std::string text; // one line
     };
 
-    // The referents outlive the diagnosis.
+    // The arguments must outlive the diagnosis.
     Diagnosis(const OrvexModel::Platform& platform, const PortDirectory& directory)
         : _platform(platform)
         , _directory(directory)
@@ -29,9 +28,9 @@ public:
     Diagnosis(const Diagnosis&) = delete;
     Diagnosis& operator=(const Diagnosis&) = delete;
 
-    // Call it once. It waits for answers up to the session's own limits.
+    // Call once. Waits for answers as long as a session does.
     std::vector<Finding> run();
-    // Whether the last finding is a fault.
+    // True if the last finding is a fault.
     static bool failed(const std::vector<Finding>& findings) { return findings.back().isFault; }
 
 private:

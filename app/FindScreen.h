@@ -14,9 +14,8 @@ class BarButton;
 class TextField;
 class TextLabel;
 
-// Searches the display tree as it was when the screen opened: a field above a list of the rows found, each
-// with its place. Return or a tap chooses one; arrow keys move in the list while the field has the
-// focus.
+// Searches the display tree as it was when the screen opened: a field above a list of matching rows and their
+// paths. Return or a tap chooses one; arrow keys move in the list while the field keeps the focus.
 class FindScreen final : public Screen, public TableList::DataSource {
 public:
     struct Actions {
@@ -24,7 +23,7 @@ public:
         std::function<void()> cancel;
     };
 
-    // Null counts as an empty tree. The actions must not delete the screen at once.
+    // Null is an empty tree. The actions must not delete the screen immediately.
     FindScreen(OrvexModelNodeRef root, Actions actions);
 
     TextField& field() const { return *_field; }
@@ -52,7 +51,7 @@ private:
     TextField* _field; // children
     BarButton* _cancel;
     TableList* _results;
-    TextLabel* _nothing; // says that nothing was found
+    TextLabel* _nothing; // shown if nothing matches
 };
 
 } // namespace orvex

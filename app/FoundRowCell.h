@@ -6,8 +6,8 @@ namespace orvex {
 
 class TextLabel;
 
-// A row that a search has found: name and value as on its own screen, and below them, smaller, where it
-// stands. Texts too long for the row are cut, the value last.
+// A row found by a search: name and value as on its own screen, with its path in smaller type below. Texts
+// too long for the row are elided, the value last.
 class FoundRowCell final : public TableCell {
 public:
     explicit FoundRowCell(std::string reuseIdentifier);

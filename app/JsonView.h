@@ -6,16 +6,16 @@ namespace orvex {
 
 class ConsoleOutput;
 
-// One JSON object a line, for programs that follow a session:
+// One JSON object per line, for programs that follow a session:
 //
 //   "schema"     1
-//   "status"     text     as the window's status line says it
+//   "status"     text     as in the window's status line
 //   "connected"  boolean
 //   "messages"   number   decoded so far
-//   "tree"       object   as writeTreeJson() writes it; null while there is none
+//   "tree"       object   by writeTreeJson(); null if there is none
 class JsonView final : public ConsoleView {
 public:
-    // The output outlives the view.
+    // The output must outlive the view.
     explicit JsonView(ConsoleOutput& output)
         : _output(output)
     {

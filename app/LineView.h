@@ -10,7 +10,7 @@ class ConsoleOutput;
 // separates one state from the next.
 class LineView final : public ConsoleView {
 public:
-    // The output outlives the view.
+    // The output must outlive the view.
     LineView(ConsoleOutput& output, bool usesColour)
         : _output(output)
         , _usesColour(usesColour)

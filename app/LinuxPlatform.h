@@ -14,7 +14,7 @@ namespace orvex {
 // Prints "orvex: WHY" on standard error.
 void printError(const std::string& why);
 
-// The implementations of the platform on Linux, in the order of their dependencies.
+// The platform on Linux, in the order of dependency.
 struct LinuxPlatform {
     explicit LinuxPlatform(const std::string& resourceDirectory)
         : resources(resourceDirectory)
@@ -22,7 +22,7 @@ struct LinuxPlatform {
     }
 
     AppPlatform forApp();
-    // For captures, of which no snapshot is made.
+    // For captures, which are not saved.
     GeneratorEnvironment forFiles() const;
 
     QtRunLoop runLoop;

@@ -15,11 +15,11 @@ namespace orvex {
 class NavigationStack;
 class Window;
 
-// A window with a stack of list screens, and what one does with them whatever they show: keyboard shortcuts,
-// the search, going back by a swipe, dropping files.
+// A window with a stack of list screens, and what they all share: keyboard shortcuts, search, swiping back,
+// dropping files.
 class PaneWindow {
 public:
-    // Without a size the window fills the main screen. The host outlives the window. Not shown yet.
+    // Without a size the window fills the main screen. The host must outlive the window. Hidden at first.
     PaneWindow(const QString& title, const std::optional<QSize>& size, PaneHost& host,
         std::unique_ptr<OrvexPaneController> root);
     ~PaneWindow();
@@ -31,7 +31,7 @@ public:
 
     // Opens the search unless a modal screen is open.
     void showFind();
-    // Goes to the row as far as the tree still has it: opens a branch, selects a leaf.
+    // Goes to the row, or as far as the tree still has its path: opens a branch, selects a leaf.
     void goTo(const FoundRow& row);
 
 private:

@@ -6,10 +6,10 @@
 
 namespace orvex {
 
-// Rows as text for the clipboard: name and value with a tab between, a branch its name alone. Control
-// characters are escaped, so that a row stays a line and a cell a cell.
+// Rows as text for the clipboard: name, tab, value; a branch is its name. Control characters are escaped, so
+// that each row is one line.
 QString rowText(const OrvexModelNode& node);
-// A line for each row of the screen that shows the node; null has none.
+// A line for each row of the node's screen; none for null.
 QString screenText(const OrvexModelNode* node);
 
 } // namespace orvex

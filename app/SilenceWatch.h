@@ -7,10 +7,10 @@
 
 namespace orvex {
 
-// Tells when nothing has been heard for 10 seconds, and when something is heard again.
+// Calls back after 10 seconds of silence, and when it ends.
 class SilenceWatch {
 public:
-    // The run loop outlives the watch, which begins with the first heard().
+    // The run loop must outlive the watch, which starts with the first heard().
     SilenceWatch(RunLoop& runLoop, std::function<void(bool isSilent)> onChange);
 
     void heard();

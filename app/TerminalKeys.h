@@ -13,11 +13,11 @@ struct TerminalKey {
     bool operator==(const TerminalKey&) const = default;
 
     Code code = Code::other;
-    std::string text = {}; // one character in UTF-8 where the code is text
+    std::string text = {}; // one UTF-8 character if the code is text
 };
 
-// The keys in what was read from a terminal at once. An escape sequence comes whole; a lone escape character
-// is the key of that name.
+// The keys in one read from a terminal. Escape sequences arrive whole, so a lone escape character is the
+// Escape key.
 std::vector<TerminalKey> terminalKeysIn(std::string_view input);
 
 } // namespace orvex

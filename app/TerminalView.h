@@ -13,8 +13,8 @@ namespace orvex {
 
 class ConsoleOutput;
 
-// A terminal's screen, on which each state replaces the last. With a keyboard, a tree too tall for the screen
-// is scrolled by arrow and Page keys, "/" searches it, "n" and "N" go from match to match.
+// A terminal's screen, on which each state replaces the last. With a keyboard, arrow and Page keys scroll a
+// tree taller than the screen, "/" searches it, "n" and "N" move between matches.
 class TerminalView final : public ConsoleView {
 public:
     struct Look {
@@ -22,7 +22,7 @@ public:
         std::function<bool()> hasKeyboard = {}; // asked before every frame; empty for none
     };
 
-    // The output outlives the view.
+    // The output must outlive the view.
     TerminalView(ConsoleOutput& output, Look look)
         : _output(output)
         , _look(std::move(look))
@@ -32,7 +32,7 @@ public:
     void show(const ConsoleState& state) override;
     // Returns false for the key that ends the program.
     bool press(const TerminalKey& key);
-    // Draws again on a terminal in an unknown state.
+    // Redraws a terminal whose contents are unknown.
     void redraw();
     // Leaves the last frame on the screen and the cursor below it.
     void leave();
@@ -55,10 +55,10 @@ private:
     std::vector<std::string> _lines; // of the tree
     std::vector<std::size_t> _nameEnds;
     std::size_t _first = 0; // line at the top
-    bool _isClean = false;  // nothing but our frame is on the screen
+    bool _isClean = false;  // the screen holds our frame only
 
     std::string _sought;
-    bool _isTyping = false; // what is sought
+    bool _isTyping = false; // the text to search for
     std::size_t _searchStart = 0;
     std::optional<std::size_t> _match;
 };

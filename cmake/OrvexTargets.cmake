@@ -40,15 +40,23 @@ endfunction()
 
 # orvex_add_layer(TARGET LINKS ... PRIVATE_LINKS ...)
 # Makes a layer of all .h and .cpp files in and below the current folder, but main.cpp. The layer exports only this
-# folder and sees only what it links. The target all_verify_interface_header_sets compiles every header alone.
+# folder and sees only what it links. The target all_verify_interface_header_sets compiles every header alone that has
+# no source of its name: the others are the first thing that their source includes.
 function(orvex_add_layer target)
     cmake_parse_arguments(LAYER "" "" "LINKS;PRIVATE_LINKS" ${ARGN})
     file(GLOB_RECURSE headers CONFIGURE_DEPENDS *.h)
     file(GLOB_RECURSE sources CONFIGURE_DEPENDS *.cpp)
     list(FILTER sources EXCLUDE REGEX "/main\\.cpp$")
+    set(paired ${sources})
+    list(TRANSFORM paired REPLACE "\\.cpp$" ".h")
+    set(alone ${headers})
+    list(REMOVE_ITEM alone ${paired})
+    list(REMOVE_ITEM headers ${alone})
     add_library(${target} STATIC ${sources})
-    target_sources(${target} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${headers})
-    set_target_properties(${target} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
+    target_sources(${target} PUBLIC
+        FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${alone}
+        FILE_SET paired TYPE HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${headers})
+    set_target_properties(${target} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON INTERFACE_HEADER_SETS_TO_VERIFY HEADERS)
     target_link_libraries(${target} PUBLIC ${LAYER_LINKS} PRIVATE orvex_build_flags ${LAYER_PRIVATE_LINKS})
     set_property(GLOBAL APPEND PROPERTY ORVEX_LAYERS ${target})
 endfunction()

@@ -8,16 +8,16 @@ class QSocketNotifier;
 
 namespace orvex {
 
-// The terminal that a program draws on in place: keys as they are typed, without an echo, and word of a
-// changed size. Ctrl+C and Ctrl+Z keep their meaning.
+// A terminal in raw mode: keys as they are typed, without echo, and notice of a changed size. Ctrl+C and
+// Ctrl+Z keep their meaning.
 //
-// The terminal's modes are put back while the process is stopped or in the background and whenever it ends,
-// also by a crash. Only SIGKILL leaves them changed. Only one object may exist at a time.
+// The terminal's modes are restored while the process is stopped or in the background and when it ends, even
+// by a crash; only SIGKILL leaves them changed. Only one object may exist at a time.
 class RawTerminal {
 public:
     struct Events {
         std::function<void(std::string_view bytes)> onInput;
-        std::function<void()> onRedraw; // resized or back after a stop: draw everything again
+        std::function<void()> onRedraw; // resized, or continued after a stop
     };
 
     explicit RawTerminal(Events events);
@@ -25,8 +25,8 @@ public:
     RawTerminal(const RawTerminal&) = delete;
     RawTerminal& operator=(const RawTerminal&) = delete;
 
-    // Whether keys are read: standard input is a terminal and the process in its foreground. Takes the
-    // terminal when the process has come into the foreground.
+    // True if keys are read: standard input is a terminal and the process in its foreground. Enters raw mode
+    // if the process has just come into the foreground.
     bool readsKeys();
 
 private:

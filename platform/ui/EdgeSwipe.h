@@ -9,8 +9,8 @@ namespace orvex {
 
 class NavigationStack;
 
-// Pops the top screen when a finger or the mouse is drawn from the left edge into the stack. It only watches:
-// the list below gets the same gesture, which is no tap to it.
+// Pops the top screen when a finger or the mouse swipes from the left edge into the stack. It only watches;
+// the list below sees the same gesture and does not take it for a tap.
 class EdgeSwipe final : public QObject {
 public:
     // The stack owns the object.

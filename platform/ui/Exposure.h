@@ -7,11 +7,11 @@
 
 namespace orvex {
 
-// Whether anybody can see a window: it is neither minimized nor hidden by the window system, as on another
-// workspace. Covered by other windows it still counts as seen.
+// Whether a window is visible: neither minimized nor hidden by the window system, as on another workspace. A
+// window covered by others still counts as visible.
 class Exposure final : public QObject {
 public:
-    // Calls back whenever the window comes into sight again. The window owns the object.
+    // Calls back when the window becomes visible again. The window owns the object.
     Exposure(QWidget& window, std::function<void()> onSeen);
 
     // True until the window system says otherwise.

@@ -5,8 +5,8 @@
 
 namespace orvex {
 
-// A message on a card at the bottom of a window, above the toolbar, that goes by itself after a few seconds.
-// It takes no input. A new one replaces the old one.
+// A message on a card above the toolbar that disappears after a few seconds. It takes no input. A new notice
+// replaces the old one.
 class Notice final : public QWidget {
 public:
     // The notice deletes itself.

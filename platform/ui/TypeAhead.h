@@ -8,18 +8,18 @@
 
 namespace orvex {
 
-// Finds a row by the beginning of its name, typed letter by letter. The same letter again goes to the next
-// row that begins with it.
+// Finds a row by the beginning of its name as it is typed. Repeating a letter moves to the next row that
+// begins with it.
 class TypeAhead {
 public:
     using Clock = std::chrono::steady_clock;
 
-    // Adds a character. What was typed more than a second before is forgotten.
+    // Adds a character. After a pause of more than a second, typing starts over.
     void type(const QString& character, Clock::time_point now = Clock::now());
     bool isTyping(Clock::time_point now = Clock::now()) const;
 
-    // The row to go to from the current one, which is -1 for none, around the end; absent when no name begins
-    // with what was typed.
+    // The next matching row from the current one (-1 for none), wrapping around. Absent if no name begins
+    // with the typed text.
     std::optional<int> row(int count, int current, const std::function<QString(int row)>& nameOf) const;
 
 private:

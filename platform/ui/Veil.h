@@ -4,7 +4,7 @@
 
 namespace orvex {
 
-// Dims what lies below it, and takes no input. Hidden until it is shown.
+// Dims what lies below it. Takes no input. Hidden at first.
 class Veil final : public QWidget {
 public:
     explicit Veil(QWidget* parent);

@@ -8,7 +8,7 @@
 
 namespace orvex::korat {
 
-// Passes a signal of D-Bus on to a function: Qt delivers it to slots only. In a header without any of ours,
+// Passes a D-Bus signal to a function; Qt delivers signals to slots only. Includes none of our headers,
 // because moc does not understand concepts.
 class BusSignal final : public QObject {
     Q_OBJECT

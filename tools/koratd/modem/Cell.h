@@ -17,13 +17,13 @@ const char* nameOf(Radio radio);
 struct Network {
     int mcc = 0;
     int mnc = 0;
-    std::string text; // "001-01": the number of digits of the network code matters
+    std::string text; // "001-01"; the number of digits of the network code matters
 
-    // None for a text that is anything else.
+    // None for any other text.
     static std::optional<Network> of(const std::string& operatorId);
 };
 
-// A cell that the modem hears. What the modem does not tell is absent.
+// A cell that the modem hears. Fields that the modem does not report are absent.
 struct Cell {
     using Number = std::optional<std::int64_t>;
     using Level = std::optional<double>;
@@ -47,7 +47,7 @@ struct Cell {
     Level sinr;           // dB
     Level rscp;           // dBm
     Level ecio;           // dB
-    // What else it tells, under its own names.
+    // Everything else it reports, under its own names.
     std::vector<std::pair<std::string, std::string>> others;
 
     bool operator==(const Cell&) const = default;

@@ -6,11 +6,11 @@
 
 namespace orvex::korat {
 
-// The cell-monitor list of the modem's cells, with the keys of TelephonyConstants.h. Cells of 5G and CDMA
-// have no records. What the modem does not tell, or what does not fit into 32 bits with sign, has no entry.
+// The modem's cells as a cell-monitor list, with the keys of TelephonyConstants.h. 5G and CDMA cells have no
+// records. Values that the modem does not report, or that exceed a signed 32-bit integer, have no entry.
 ArrayRef cellRecords(const ModemState& state);
 
-// The SIM files that the modem tells, by the keys of TelephonyConstants.h.
+// The SIM files that the modem reports, by the keys of TelephonyConstants.h.
 DictionaryRef simFiles(const ModemState& state);
 
 // The packet data contexts: a dictionary of rows for each connection.

@@ -6,13 +6,13 @@
 
 namespace orvex::korat {
 
-// All that the modem says, as a report of IFX: a dictionary of sections whose values are texts, dictionaries
-// and arrays. The first element of an array is its heading, which IFX does not show.
+// Everything the modem reports, as an IFX report: a dictionary of sections whose values are texts,
+// dictionaries and arrays. The first element of an array is its heading, which IFX does not show.
 Value ifxReport(const ModemState& state);
 
-// What stands in the way, as the first row of the report: "The modem is disabled". Empty when nothing does.
+// The obstacle in the report's first row, such as "The modem is disabled". Empty if there is none.
 std::string conditionLine(const ModemState& state);
-// Why there are no cells, as a row of the report; empty when there are, or nobody has asked yet.
+// Why the report has no cells. Empty if it has, or if nobody has asked yet.
 std::string cellLine(const ModemState& state);
 
 } // namespace orvex::korat

@@ -8,11 +8,11 @@
 
 namespace orvex::korat {
 
-// Streams what a reader knows of a modem, and has it ask while a monitor is there. Reports in a line what
-// stands in the way: no service, no modem, no permission.
+// Streams what a reader knows of a modem, and has it query the modem while a monitor is connected. Reports
+// obstacles in one line: no service, no modem, no permission.
 class ModemFeed final : public Feed {
 public:
-    // Without a technology, the one of the serving cell.
+    // Without a technology, follows the serving cell's.
     ModemFeed(RunLoop& runLoop, std::unique_ptr<ModemReader> reader, std::optional<std::string> technology,
         bool withMeasurements);
 

@@ -13,17 +13,17 @@
 
 namespace orvex::korat {
 
-// ModemManager's methods and signals. No call starts the service where it is not running.
+// ModemManager's methods and signals. Calls never start the service.
 class ModemManagerBus {
 public:
     static constexpr const char* kService = "org.freedesktop.ModemManager1";
 
-    // The answer's first argument, or the name of an error: exactly one of the two.
+    // Either the reply's first argument or the name of an error.
     struct Answer {
         Value value;
         std::string error;
 
-        // Whether the bus, or the service itself, does not let this user ask.
+        // True if the bus or the service denies this user the call.
         bool isDenied() const;
         bool isNotSupported() const;
     };
@@ -39,15 +39,15 @@ public:
         std::string path;
         std::vector<Value> arguments;
     };
-    // Listens to a signal, of any path when the path is empty, as long as this object lives.
+    // Listens to a signal as long as this object lives; an empty path stands for any.
     void listen(const char* path, const char* interface, const char* name,
         std::function<void(const Signal&)> onSignal);
 
-    // The answer comes on the event loop, unless this object has gone by then.
+    // The reply arrives on the event loop, unless this object is gone by then.
     void call(const std::string& path, const char* interface, const char* method,
         const QVariantList& arguments, std::chrono::milliseconds timeout,
         std::function<void(const Answer&)> onAnswer);
-    // Waits for the answer.
+    // Waits for the reply.
     Answer callAndWait(const std::string& path, const char* interface, const char* method,
         const QVariantList& arguments, std::chrono::milliseconds timeout);
 

@@ -6,21 +6,21 @@
 
 namespace orvex::korat {
 
-// The answers of ModemManager's modem, as valueFromBus() gives them. Texts of numbers are hexadecimal. What
-// is not of the expected kind, no number or no possible one, is left out.
+// Reads the modem's replies, as converted by valueFromBus(). Numbers in texts are hexadecimal. Values of an
+// unexpected kind or out of range are left out.
 
-// Puts the cells of an answer to GetCellInfo into the state, each once: libmbim 1.28 repeats one neighbour in
-// the place of another.
+// Puts the cells of a GetCellInfo reply into the state, each once: libmbim 1.28 repeats one neighbour in
+// place of another.
 void takeCells(ModemState& state, const Value& answer);
 
-// The network's location in an answer to GetLocation. None when there is none.
+// The network location in a GetLocation reply, if any.
 std::optional<Location> locationIn(const Value& answer);
 
-// A text from outside, shortened and without control characters.
+// A foreign text, shortened and without control characters.
 std::string textIn(const Value& value);
-// A number, or a hexadecimal text, from 0 to the most.
+// A number or hexadecimal text from 0 to the maximum.
 std::optional<std::int64_t> numberIn(const Value& value, std::int64_t most);
-// A level in dB or dBm. None for what ModemManager writes where nothing was measured.
+// A level in dB or dBm. None for ModemManager's placeholder for "not measured".
 std::optional<double> levelIn(const Value& value);
 
 } // namespace orvex::korat

@@ -11,20 +11,20 @@
 
 namespace orvex::korat {
 
-// ModemManager's objects as it tells them by itself: modems with all their interfaces, and the SIM card and
-// bearers of the modem that is watched. Follows the service when it comes, goes and comes again.
+// ModemManager's objects: modems with all their interfaces, and the SIM card and bearers of the watched
+// modem. Follows the service as it starts, stops and restarts.
 //
-// Nothing here reaches a modem: ModemManager answers from what it knows.
+// Never queries the modem: ModemManager answers from its own properties.
 class ModemManagerObjects {
 public:
-    // Is told after each change.
+    // Calls back after each change.
     ModemManagerObjects(ModemManagerBus& bus, std::function<void()> onChange);
-    // Begins to listen. Returns why it cannot, in one line; empty when it can.
+    // Starts listening. Returns an error in one line, or an empty text.
     std::string start();
 
     enum class Service { unknown, isMissing, isThere };
     Service service() const { return _service; }
-    // Paths, of each its interfaces, of each its properties.
+    // Properties by path and interface.
     const Dictionary& objects() const { return *_objects; }
     DictionaryRef properties(const std::string& path, const char* interface) const;
 

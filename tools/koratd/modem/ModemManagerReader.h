@@ -8,9 +8,9 @@
 
 namespace orvex::korat {
 
-// Reads the modem that ModemManager tells first, through D-Bus. It never enables or connects a modem and
-// never changes its settings, with one exception: while it asks, a signal refresh rate of 0 becomes 5
-// seconds. It is put back 10 seconds after the end, so that a monitor may come again, or by the destructor.
+// Reads ModemManager's first modem through D-Bus. It never enables or connects a modem and never changes its
+// settings, with one exception: while querying, a signal refresh rate of 0 becomes 5 seconds. The rate is
+// restored 10 seconds after the last query, as a monitor may come back, or by the destructor.
 class ModemManagerReader final : public ModemReader {
 public:
     ModemManagerReader(RunLoop& runLoop, const QDBusConnection& connection, bool withIdentities);
@@ -44,17 +44,17 @@ private:
     ModemState _state;
     std::uint64_t _version = 0;
 
-    std::string _modem; // that is watched; empty when there is none
-    // What it has answered.
+    std::string _modem; // the watched one; empty if there is none
+                        // Its replies.
     ModemState _cells;
     std::optional<Location> _location;
 
     ModemQuestion _cellQuestion;
     ModemQuestion _locationQuestion;
     ModemQuestion _signalQuestion;
-    std::string _signalModem;               // the one whose rate is to be put back
-    std::unique_ptr<RunLoop::Timer> _timer; // while asking
-    std::unique_ptr<RunLoop::Timer> _end;   // a while after it
+    std::string _signalModem;               // the one whose rate must be restored
+    std::unique_ptr<RunLoop::Timer> _timer; // while querying
+    std::unique_ptr<RunLoop::Timer> _end;   // then restores the rate
     ModemManagerObjects _objects;
 };
 
