@@ -49,7 +49,7 @@ protected:
         // Ten steps, then a rest before the release, so that nothing is flung.
         for (int step = 1; step <= 20; ++step)
             QTest::mouseMove(&list, from + by * std::min(step, 10) / 10, 25);
-        QTest::qWait(50); // the scroller moves at the rate of frames
+        QTest::qWait(200); // the scroller moves at the rate of frames, which a busy machine drops
         QTest::mouseRelease(&list, Qt::LeftButton, {}, from + by, 30);
     }
     int sidewaysAt(int row) const { return list.cellAtRow(row)->sidewaysScrollView()->offset(); }

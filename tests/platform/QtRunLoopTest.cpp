@@ -71,10 +71,10 @@ TEST(QtRunLoop, TasksThatHaveNotRunDieWithTheLoop)
     const auto witness = std::make_shared<int>();
     int runs = 0;
     auto loop = std::make_unique<QtRunLoop>();
-    loop->postAfter(1ms, [&runs, witness] { ++runs; });
+    loop->postAfter(100ms, [&runs, witness] { ++runs; });
     loop->post([&loop] { loop.reset(); });
     loop->post([&runs, witness] { ++runs; });
-    turnFor(50ms);
+    turnFor(150ms);
     EXPECT_FALSE(loop);
     EXPECT_EQ(runs, 0);
     EXPECT_EQ(witness.use_count(), 1) << "a dropped task is destroyed";
