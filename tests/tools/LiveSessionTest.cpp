@@ -93,7 +93,7 @@ TEST_F(LiveSession, AServiceThatHasGoneIsHeardToItsLastMessage)
 {
     KoratProgram korat(folder, {"--rate", "100", "--count", "300"});
     const Program monitor(folder, ORVEX_PATH, {"--print-status"});
-    EXPECT_TRUE(monitor.waitFor(" Updated "));
+    ASSERT_TRUE(monitor.waitFor(" Updated "));
     // The monitor stands still until its next refresh is due, which finds the service gone.
     ::kill(monitor.id(), SIGSTOP);
     std::this_thread::sleep_for(1800ms);
