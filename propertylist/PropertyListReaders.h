@@ -49,7 +49,8 @@ public:
 
     static PropertyListFault tooManyNodes(const PropertyListLimits& limits)
     {
-        return PropertyListFault("more than " + std::to_string(limits.maximumNodes) + " values");
+        PropertyListFault fault("more than " + std::to_string(limits.maximumNodes) + " values");
+        return fault;
     }
 
 private:
