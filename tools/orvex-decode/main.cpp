@@ -13,6 +13,7 @@
 #include "Process.h"
 #include "Snapshot.h"
 #include "SystemLog.h"
+#include "TextFormat.h"
 
 #include <algorithm>
 #include <filesystem>
@@ -109,7 +110,7 @@ bool prepare(SnapshotDocument& document, const std::string& path, const DecodeOp
         document.decodeAnew(std::move(generator));
     }
     for (const std::string& omission : document.omissions())
-        printNote(path + ": " + omission, options);
+        printNote(text("%s: %s", path.c_str(), omission.c_str()), options);
     if (options.dlfFile)
         isGood = extractDlf(document, options) && isGood;
     if (options.path != "/" && !document.restrictTo(options.path))
