@@ -14,7 +14,6 @@ using namespace std::chrono_literals;
 using Finding = Diagnosis::Finding;
 
 constexpr auto kAnswerTimeout = 1s;
-constexpr std::int32_t kLogChannelMessageId = 0;
 
 Finding fine(std::string text)
 {
@@ -110,7 +109,8 @@ Finding Diagnosis::checkTechnology()
 {
     const auto query =
         propertyListXML(Dictionary::make({{telephony::kGetTechnology, telephony::kGetTechnology}}));
-    const auto sent = _remotePort->request(kLogChannelMessageId, *query, kAnswerTimeout, kAnswerTimeout);
+    const auto sent =
+        _remotePort->request(telephony::kLogChannelMessageId, *query, kAnswerTimeout, kAnswerTimeout);
     if (sent.status != RemotePort::Status::success)
         return fault("The telephony service does not take the question for its technology.");
     if (!sent.reply)

@@ -11,7 +11,6 @@ namespace orvex {
 namespace {
 using namespace std::chrono_literals;
 
-constexpr std::int32_t kLogChannelMessageId = 0;
 constexpr auto kSendTimeout = 1s;
 constexpr auto kReceiveTimeout = 1s;
 constexpr auto kRefreshPeriod = 2s;
@@ -42,7 +41,7 @@ bool OrvexModel::createPorts()
 
     auto local = _platform.ports.createLocalPort(
         portName, [weakModel](std::int32_t messageId, ByteView data) -> std::optional<Bytes> {
-            if (const auto model = weakModel.lock(); model && messageId == kLogChannelMessageId)
+            if (const auto model = weakModel.lock(); model && messageId == telephony::kLogChannelMessageId)
                 model->updateWithData(data);
             return std::nullopt;
         });
@@ -112,7 +111,8 @@ void OrvexModel::configureGenerator()
         systemLog(Priority::error, " Could not generate GetTechnology command; cannot configure");
         return;
     }
-    const auto sent = _sendPort->request(kLogChannelMessageId, *query, kSendTimeout, kReceiveTimeout);
+    const auto sent =
+        _sendPort->request(telephony::kLogChannelMessageId, *query, kSendTimeout, kReceiveTimeout);
     if (sent.status != RemotePort::Status::success) {
         systemLog(Priority::error, " ***** Could not send the GetTechnology command (got error=%d)",
             static_cast<int>(sent.status));
@@ -172,7 +172,7 @@ bool OrvexModel::sendStartCommand()
         systemLog(Priority::error, " Could not generate PLIST");
         return false;
     }
-    const auto status = _sendPort->send(kLogChannelMessageId, *command, kSendTimeout);
+    const auto status = _sendPort->send(telephony::kLogChannelMessageId, *command, kSendTimeout);
     if (status != RemotePort::Status::success) {
         systemLog(Priority::error, " ***** Could not send the START command (got error=%d)",
             static_cast<int>(status));

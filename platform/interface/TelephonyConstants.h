@@ -1,11 +1,12 @@
 #pragma once
 
-// Texts that belong to the telephony service. Whoever speaks with it takes them from here.
+// Texts and numbers of the telephony service, shared by the monitor and the service.
 namespace orvex::telephony {
 
-// Message ports. Every message on the log channel has the id 0.
+// Message ports.
 inline constexpr const char* kServicePortName = "org.orvex.Korat";
 inline constexpr const char* kLogChannelPortName = "org.orvex.BasebandStateReport.LogChannel";
+inline constexpr int kLogChannelMessageId = 0; // of every message on the log channel
 
 // Log technologies of a baseband, as the answer to "GetTechnology" names them.
 inline constexpr const char* kTechnologyIFX = "IFX";

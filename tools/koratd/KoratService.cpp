@@ -16,7 +16,6 @@ namespace orvex::korat {
 namespace {
 constexpr std::chrono::milliseconds kWatchPeriod{100};
 constexpr const char* kChannelPortPrefix = "org.orvex.Korat.LogChannel.";
-constexpr std::int32_t kChannelMessageId = 0;
 constexpr const char* kUnheardOfTechnology = "MRL_UNHEARD_OF";
 constexpr std::string_view kNoPropertyList = "\x01\x02 this is no property list";
 
@@ -76,7 +75,7 @@ LogChannel::~LogChannel()
 
 std::optional<Bytes> LogChannel::receive(std::int32_t messageId, ByteView data)
 {
-    if (messageId != kChannelMessageId)
+    if (messageId != telephony::kLogChannelMessageId)
         return std::nullopt;
     const auto parsed = propertyListFromData(data);
     const DictionaryRef command = parsed.value ? parsed.value->dictionary() : nullptr;

@@ -13,7 +13,6 @@ using namespace std::chrono_literals;
 
 constexpr std::int64_t kLargestCode = 0xFFFF;
 
-constexpr std::int32_t kLogMessageId = 0;
 constexpr auto kTick = 10ms;
 constexpr auto kLiveTick = 100ms; // a modem changes slowly, and every tick wakes a handset
 // The run loop has other work; what a tick does not manage is left to the next.
@@ -122,7 +121,7 @@ bool Streamer::goOnAfterTheEnd()
 bool Streamer::sendNext()
 {
     // A message that the port does not take now stays the next one.
-    if (_client->send(kLogMessageId, _next->bytes, 0ms) != RemotePort::Status::success)
+    if (_client->send(telephony::kLogChannelMessageId, _next->bytes, 0ms) != RemotePort::Status::success)
         return false;
     if (_listener)
         _listener(*_next);
