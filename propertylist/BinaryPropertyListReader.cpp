@@ -41,9 +41,9 @@ enum Kind : std::uint8_t {
     kDictionary = 0xD,
 };
 
-class Reader {
+class BinaryReader {
 public:
-    Reader(ByteView list, const PropertyListLimits& limits)
+    BinaryReader(ByteView list, const PropertyListLimits& limits)
         : _list(list)
         , _count(limits)
     {
@@ -297,7 +297,7 @@ private:
 
 Value readBinaryPropertyList(ByteView list, const PropertyListLimits& limits)
 {
-    return Reader(list, limits).run();
+    return BinaryReader(list, limits).run();
 }
 
 } // namespace orvex

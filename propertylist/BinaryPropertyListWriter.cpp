@@ -41,7 +41,7 @@ void appendMarker(Bytes& bytes, unsigned kind, std::size_t size)
 }
 
 // Recursive: what Orvex writes is no deeper than what it reads.
-class Writer {
+class BinaryWriter {
 public:
     // The number of the value's object. None if the value has no binary form.
     std::optional<std::size_t> add(const Value& value)
@@ -192,7 +192,7 @@ private:
 
 std::optional<Bytes> propertyListBinary(const Value& value)
 {
-    Writer writer;
+    BinaryWriter writer;
     return writer.add(value) ? std::optional(writer.list()) : std::nullopt;
 }
 

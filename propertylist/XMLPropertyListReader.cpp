@@ -9,7 +9,6 @@
 #include <pugixml.hpp>
 
 #include <algorithm>
-#include <cstdint>
 #include <string_view>
 #include <utility>
 
@@ -27,21 +26,15 @@ bool isBlank(std::string_view text)
 // number is limited too.
 void requireFewTags(std::string_view text, const PropertyListLimits& limits)
 {
-    constexpr std::size_t kOthers = 1000; // beyond values: <plist>, comments, the version
-    constexpr std::size_t kBlock = 255;   // as many as a byte can count, so that the loop vectorizes
+    const std::size_t most = limits.maximumNodes + 1000; // <plist>, comments and the version are no values
+    if (text.size() <= most)
+        return;
     std::size_t count = 0;
-    for (std::size_t start = 1; start < text.size(); start += kBlock) {
-        std::uint8_t inBlock = 0;
-        const std::size_t end = std::min(start + kBlock, text.size());
-        for (std::size_t i = start; i < end; ++i) {
-            // No short circuits, so that the loop vectorizes.
-            const unsigned opens =
-                static_cast<unsigned>(text[i - 1] == '<') & static_cast<unsigned>(text[i] != '/');
-            inBlock = static_cast<std::uint8_t>(inBlock + (opens | static_cast<unsigned>(text[i] == '=')));
-        }
-        count += inBlock;
+    for (std::size_t i = 1; i < text.size(); ++i) {
+        if ((text[i - 1] == '<' && text[i] != '/') || text[i] == '=')
+            ++count;
     }
-    if (count > limits.maximumNodes + kOthers)
+    if (count > most)
         throw PropertyListCount::tooManyNodes(limits);
 }
 
@@ -59,9 +52,9 @@ unsigned parserOptions(std::string_view text)
 // Checks what the parser does not: which elements there are, what they may hold, and document types, whose
 // declarations the parser skips. The parser leaves character references alone so that malformed ones can be
 // refused.
-class Reader {
+class XMLReader {
 public:
-    explicit Reader(const PropertyListLimits& limits)
+    explicit XMLReader(const PropertyListLimits& limits)
         : _count(limits)
     {
     }
@@ -229,7 +222,7 @@ Value readXMLPropertyList(Bytes&& paddedList, const PropertyListLimits& limits)
         paddedList.data(), paddedList.size(), parserOptions(text), pugi::encoding_utf8);
     if (!parsed)
         throw Fault("malformed XML at byte " + std::to_string(parsed.offset) + ", " + parsed.description());
-    return Reader(limits).valueOf(document);
+    return XMLReader(limits).valueOf(document);
 }
 
 } // namespace orvex

@@ -42,9 +42,9 @@ std::string dateOf(Date date)
 }
 
 // Not recursive: a value may be nested to any depth.
-class Writer {
+class XMLWriter {
 public:
-    explicit Writer(const TextSink& sink)
+    explicit XMLWriter(const TextSink& sink)
         : _sink(sink)
     {
     }
@@ -245,7 +245,7 @@ private:
 
 std::string writePropertyListXML(const Value& value, const TextSink& sink)
 {
-    return Writer(sink).run(value);
+    return XMLWriter(sink).run(value);
 }
 
 std::optional<Bytes> propertyListXML(const Value& value)
