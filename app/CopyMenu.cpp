@@ -9,7 +9,7 @@
 namespace orvex {
 
 namespace {
-constexpr int kFontSize = 15;
+constexpr int kMenuFontSize = 15;
 }
 
 void copyText(const QString& text)
@@ -21,7 +21,7 @@ void showCopyMenu(QWidget& parent, const QPoint& globalPlace, const QString& row
 {
     auto* const menu = new QMenu(&parent);
     menu->setAttribute(Qt::WA_DeleteOnClose);
-    menu->setFont(Theme::systemFont(kFontSize));
+    menu->setFont(Theme::systemFont(kMenuFontSize));
     if (!row.isEmpty())
         menu->addAction(
             QStringLiteral("Copy"), QKeySequence(QKeySequence::Copy), menu, [row] { copyText(row); });

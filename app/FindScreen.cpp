@@ -17,10 +17,10 @@ namespace orvex {
 
 namespace {
 
-constexpr const char* kCellIdentifier = "FoundRow";
-constexpr int kMargin = 8;
+constexpr const char* kFoundCellIdentifier = "FoundRow";
+constexpr int kFieldMargin = 8;
 constexpr int kFieldHeight = 34;
-constexpr int kFontSize = 15;
+constexpr int kFieldFontSize = 15;
 
 bool movesInList(int key)
 {
@@ -45,7 +45,7 @@ FindScreen::FindScreen(OrvexModelNodeRef root, Actions actions)
     , _field(new TextField(this))
     , _cancel(new BarButton(BarButton::Style::plain, QStringLiteral("Cancel"), this))
     , _results(new TableList(*this, this))
-    , _nothing(new TextLabel(Theme::systemFont(kFontSize), _results))
+    , _nothing(new TextLabel(Theme::systemFont(kFieldFontSize), _results))
 {
     setTitle(QStringLiteral("Find"));
     _field->setPlaceholderText(QStringLiteral("Name or value"));
@@ -81,9 +81,9 @@ int FindScreen::numberOfRows(const TableList&) const
 
 std::unique_ptr<TableCell> FindScreen::cellForRow(TableList& list, int row)
 {
-    std::unique_ptr<TableCell> reused = list.dequeueReusableCell(kCellIdentifier);
+    std::unique_ptr<TableCell> reused = list.dequeueReusableCell(kFoundCellIdentifier);
     if (!reused)
-        reused = std::make_unique<FoundRowCell>(kCellIdentifier);
+        reused = std::make_unique<FoundRowCell>(kFoundCellIdentifier);
     const FoundRow& found = _found[static_cast<std::size_t>(row)];
     const std::string* const value = found.node->value();
     reused->setAccessory(value ? TableCell::Accessory::none : TableCell::Accessory::disclosureIndicator);
@@ -112,9 +112,10 @@ void FindScreen::resizeEvent(QResizeEvent*)
     const int middle = Bar::kHeight / 2;
     _cancel->setGeometry(
         width() - cancel.width(), middle - cancel.height() / 2, cancel.width(), cancel.height());
-    _field->setGeometry(kMargin, middle - kFieldHeight / 2, width() - cancel.width() - kMargin, kFieldHeight);
+    _field->setGeometry(
+        kFieldMargin, middle - kFieldHeight / 2, width() - cancel.width() - kFieldMargin, kFieldHeight);
     _results->setGeometry(0, Bar::kHeight, width(), height() - Bar::kHeight);
-    _nothing->setGeometry(kMargin, 0, width() - 2 * kMargin, TableList::kDefaultRowHeight);
+    _nothing->setGeometry(kFieldMargin, 0, width() - 2 * kFieldMargin, TableList::kDefaultRowHeight);
 }
 
 void FindScreen::paintEvent(QPaintEvent*)

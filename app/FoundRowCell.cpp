@@ -9,10 +9,10 @@ namespace orvex {
 
 namespace {
 
-constexpr int kFontSize = 15;
+constexpr int kFoundRowFontSize = 15;
 constexpr int kPlaceFontSize = 12;
 constexpr double kMostGrowth = 1.2; // more would not leave room for two lines
-constexpr int kMargin = 10;
+constexpr int kFoundRowMargin = 10;
 constexpr int kGap = 10;
 constexpr double kPlaceTop = 0.55; // of the height
 
@@ -35,8 +35,9 @@ TextLabel* greyLabel(int fontSize, QWidget* parent)
 
 FoundRowCell::FoundRowCell(std::string reuseIdentifier)
     : TableCell(std::move(reuseIdentifier))
-    , _name(new TextLabel(limited(Theme::boldSystemFont(kFontSize), kFontSize), contentView()))
-    , _value(greyLabel(kFontSize, contentView()))
+    , _name(
+          new TextLabel(limited(Theme::boldSystemFont(kFoundRowFontSize), kFoundRowFontSize), contentView()))
+    , _value(greyLabel(kFoundRowFontSize, contentView()))
     , _place(greyLabel(kPlaceFontSize, contentView()))
 {
 }
@@ -53,12 +54,13 @@ void FoundRowCell::setTexts(const QString& name, const QString& value, const QSt
 void FoundRowCell::layoutSubviews()
 {
     TableCell::layoutSubviews();
-    const int width = contentView()->width() - kMargin;
+    const int width = contentView()->width() - kFoundRowMargin;
     const int placeTop = static_cast<int>(height() * kPlaceTop);
     const int valueWidth = std::min(sizeOfLine(_value->text(), _value->font()).width(), width);
-    _value->setGeometry(kMargin + width - valueWidth, 0, valueWidth, placeTop + kMargin / 2);
-    _name->setGeometry(kMargin, 0, std::max(0, width - valueWidth - kGap), placeTop + kMargin / 2);
-    _place->setGeometry(kMargin, placeTop, width, height() - placeTop);
+    _value->setGeometry(kFoundRowMargin + width - valueWidth, 0, valueWidth, placeTop + kFoundRowMargin / 2);
+    _name->setGeometry(
+        kFoundRowMargin, 0, std::max(0, width - valueWidth - kGap), placeTop + kFoundRowMargin / 2);
+    _place->setGeometry(kFoundRowMargin, placeTop, width, height() - placeTop);
 }
 
 } // namespace orvex

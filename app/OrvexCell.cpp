@@ -7,8 +7,8 @@ namespace orvex {
 
 namespace {
 
-constexpr int kFontSize = 15;
-constexpr double kMargin = 10;
+constexpr int kCellFontSize = 15;
+constexpr double kCellMargin = 10;
 constexpr double kKeyValueGap = 50;
 constexpr double kViewHeight = 50; // taller than a row, which clips it
 
@@ -21,13 +21,13 @@ double centredTop(const QRectF& bounds, const QSizeF& size)
 
 QRectF branchCellKeyFrame(const QRectF& bounds, const QSizeF& keySize)
 {
-    return {QPointF(bounds.x() + kMargin, centredTop(bounds, keySize)), keySize};
+    return {QPointF(bounds.x() + kCellMargin, centredTop(bounds, keySize)), keySize};
 }
 
 LeafCellLayout leafCellLayout(const QRectF& bounds, const QSizeF& keySize, const QSizeF& valueSize)
 {
     const double width = bounds.width();
-    const double needed = keySize.width() + kMargin + kKeyValueGap + valueSize.width();
+    const double needed = keySize.width() + kCellMargin + kKeyValueGap + valueSize.width();
     const QRectF key = branchCellKeyFrame(bounds, keySize);
     const double valueLeft =
         needed < width ? width - valueSize.width() : key.x() + keySize.width() + kKeyValueGap;
@@ -49,9 +49,9 @@ OrvexCell::OrvexCell(Kind kind, std::string reuseIdentifier)
         _view = new SidewaysScrollView(contentView());
         parent = _view->content();
     }
-    _key = new TextLabel(Theme::boldSystemFont(kFontSize), parent);
+    _key = new TextLabel(Theme::boldSystemFont(kCellFontSize), parent);
     if (kind == Kind::leaf) {
-        _value = new TextLabel(Theme::systemFont(kFontSize), parent);
+        _value = new TextLabel(Theme::systemFont(kCellFontSize), parent);
         QPalette palette = _value->palette();
         palette.setColor(QPalette::WindowText, Theme::current().secondaryText);
         _value->setPalette(palette);
@@ -102,13 +102,13 @@ void OrvexCell::layoutSubviews()
 
 void OrvexCell::fitFonts()
 {
-    QFont bold = Theme::boldSystemFont(kFontSize);
-    const double room = contentView()->width() - kMargin;
+    QFont bold = Theme::boldSystemFont(kCellFontSize);
+    const double room = contentView()->width() - kCellMargin;
     const auto needed = [&] {
         const int value = _value ? sizeOfLine(_value->text(), bold).width() : 0;
         return sizeOfLine(_key->text(), bold).width() + (value > 0 ? kKeyValueGap + value : 0);
     };
-    while (bold.pixelSize() > kFontSize && needed() >= room)
+    while (bold.pixelSize() > kCellFontSize && needed() >= room)
         bold.setPixelSize(bold.pixelSize() - 1);
     if (bold.pixelSize() == _key->font().pixelSize())
         return;

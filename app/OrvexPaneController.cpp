@@ -21,7 +21,7 @@ namespace {
 
 // Shared by branches and leaves, although a cell keeps its kind: in a list of both, a reused cell may be of
 // the other kind than its row.
-constexpr const char* kCellIdentifier = "OrvexPaneControllerCell";
+constexpr const char* kRowCellIdentifier = "OrvexPaneControllerCell";
 constexpr int kStatusFontSize = 14;
 constexpr double kBesidesStatus =
     70; // of the toolbar's width: margins and Save button, which grows with the font
@@ -114,10 +114,10 @@ std::unique_ptr<TableCell> OrvexPaneController::cellForRow(TableList& list, int 
 {
     const OrvexModelNode& child = childAtRow(row);
     const bool isBranch = child.childNodes() != nullptr;
-    std::unique_ptr<TableCell> reused = list.dequeueReusableCell(kCellIdentifier);
+    std::unique_ptr<TableCell> reused = list.dequeueReusableCell(kRowCellIdentifier);
     if (!reused)
         reused = std::make_unique<OrvexCell>(
-            isBranch ? OrvexCell::Kind::branch : OrvexCell::Kind::leaf, kCellIdentifier);
+            isBranch ? OrvexCell::Kind::branch : OrvexCell::Kind::leaf, kRowCellIdentifier);
 
     auto& cell = static_cast<OrvexCell&>(*reused); // the only kind this screen makes
     cell.setKey(QString::fromStdString(child.displayName()));

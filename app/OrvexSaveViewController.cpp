@@ -15,7 +15,7 @@
 namespace orvex {
 
 namespace {
-constexpr const char* kCellIdentifier = "SaveHistoryContentCell";
+constexpr const char* kSaveCellIdentifier = "SaveHistoryContentCell";
 constexpr int kTitleFontSize = 17;
 constexpr int kTitleRoom = 150;
 constexpr int kCaptionFontSize = 13;
@@ -91,9 +91,9 @@ int OrvexSaveViewController::numberOfRows(const TableList&) const
 
 std::unique_ptr<TableCell> OrvexSaveViewController::cellForRow(TableList& list, int row)
 {
-    std::unique_ptr<TableCell> reused = list.dequeueReusableCell(kCellIdentifier);
+    std::unique_ptr<TableCell> reused = list.dequeueReusableCell(kSaveCellIdentifier);
     if (!reused)
-        reused = std::make_unique<SaveHistoryContentCell>(kCellIdentifier);
+        reused = std::make_unique<SaveHistoryContentCell>(kSaveCellIdentifier);
     static_cast<SaveHistoryContentCell&>(*reused).setText(QString::fromStdString(descriptionAt(row)));
     reused->setAccessory(TableCell::Accessory::checkmark);
     return reused;

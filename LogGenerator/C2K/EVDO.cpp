@@ -10,7 +10,7 @@ namespace {
 
 constexpr int kAccess = 4;
 
-constexpr EnumText kDeviceStates[] = {{0, "Inactive [0]"}, {1, "Acquisition [1]"}, {2, "Sync [2]"},
+constexpr EnumText kEVDOStates[] = {{0, "Inactive [0]"}, {1, "Acquisition [1]"}, {2, "Sync [2]"},
     {3, "Idle [3]"}, {kAccess, "Access [4]"}, {5, "Connected [5]"}};
 
 constexpr EnumText kSessionStates[] = {{0, "Closed [0]"}, {1, "AMP setup [1]"}, {2, "AT-initiated neg [2]"},
@@ -45,7 +45,7 @@ void EVDOStatus::decode(Packet packet, Dictionary&, const Publisher& publisher)
     const LogCode_0x1183 status(packet);
     const bool transmits = status.deviceState() >= kAccess;
     publisher.setText("kChannel", "%d", status.channel());
-    publisher.publish("k1xEVDODeviceState", stateText(status.deviceState(), kDeviceStates));
+    publisher.publish("k1xEVDODeviceState", stateText(status.deviceState(), kEVDOStates));
     publisher.publish("kBandClass", bandClassText(status.bandClass()));
     publisher.publish("kRxAGC0", powerText(status.rxAGC0(), true));
     publisher.publish("kRxAGC1", powerText(status.rxAGC1(), transmits));

@@ -35,7 +35,7 @@ namespace {
 
 constexpr int kTraffic = 8;
 
-constexpr EnumText kDeviceStates[] = {
+constexpr EnumText kOneXStates[] = {
     {0, "Inactive [0]"},
     {1, "Deep sleep in start state [1]"},
     {2, "Initial state for CDMA operation [2]"},
@@ -55,7 +55,7 @@ constexpr const char* kTrafficRows[] = {"k1xRx1BandClass", "k1xRx1ChanNum", "k1x
 
 DeferredText deviceStateText(int state)
 {
-    return textOrNumberFor(state, kDeviceStates, "[Bad Value %d]");
+    return textOrNumberFor(state, kOneXStates, "[Bad Value %d]");
 }
 
 DeferredText channelText(int channel)

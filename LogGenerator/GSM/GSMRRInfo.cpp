@@ -7,7 +7,7 @@ namespace orvex {
 namespace {
 
 // The blanks inside three of the names are the modem's own.
-constexpr EnumText kStates[] = {
+constexpr EnumText kRRStates[] = {
     {0, "RR_INACTIVE"},
     {1, "RR_GOING_ACTIVE"},
     {2, "RR_GOING_INACTIVE"},
@@ -42,7 +42,7 @@ GSMRRInfo::GSMRRInfo(ClassDictionary& dict, CodeDictionary& codeDict)
 void GSMRRInfo::update(const LogCode_0x512C& report)
 {
     RowWriter row = rows();
-    row.setText("RR State", textFor(report.state(), kStates, "Unknown"));
+    row.setText("RR State", textFor(report.state(), kRRStates, "Unknown"));
     row.setText("RR Sub State", "%d", report.subState());
     row.setText("RR Status", "%d", report.status());
     row.setText("RR Mode", report.isData() ? "Data" : "Voice");

@@ -11,7 +11,7 @@ MRL_GSMClassIndex::~MRL_GSMClassIndex()
 
 namespace {
 // Runs, and logs, before the base classes are constructed.
-std::unique_ptr<ClassIndex> makeClassIndex()
+std::unique_ptr<ClassIndex> makeGSMClassIndex()
 {
     systemLog(Priority::error, "Creating MRL_GSMLogGenerator object");
     return std::make_unique<MRL_GSMClassIndex>();
@@ -24,7 +24,7 @@ std::unique_ptr<LogGenerator> MRL_GSMLogGenerator::generator(const GeneratorEnvi
 }
 
 MRL_GSMLogGenerator::MRL_GSMLogGenerator(const GeneratorEnvironment& environment)
-    : MRLLogGenerator2(environment, "MRL_GSM", makeClassIndex())
+    : MRLLogGenerator2(environment, "MRL_GSM", makeGSMClassIndex())
 {
 }
 

@@ -6,7 +6,7 @@ namespace orvex {
 
 namespace {
 
-constexpr CellEntry kCellEntries[] = {
+constexpr CellEntry kRankedCellEntries[] = {
     {telephony::kCellUARFCN, "UARFCN", "UARFCN", CellNumber::low16Bits},
     {telephony::kCellScramblingCode, "Scrambling Code", "Scrambling Code", CellNumber::low16Bits},
     {telephony::kCellRSCP, "RSCP", "RSCP", CellNumber::level, " dBm"},
@@ -39,7 +39,7 @@ void UMTSSet::update(const CellMonitorList& list)
     list.reportIfAbsent();
     RowList rows(array());
     for (const CellRecord& cell : list.findAll(telephony::kRadioUMTS, telephony::kCellTypeNeighbor))
-        printCell(rows.next(), cell, kCellEntries, "UMTSSet");
+        printCell(rows.next(), cell, kRankedCellEntries, "UMTSSet");
 }
 
 GSMSet::GSMSet(ClassDictionary& dict, CodeDictionary& codeDict)

@@ -15,7 +15,7 @@ constexpr EnumText kServiceTypes[] = {
 constexpr EnumText kSelectionModes[] = {
     {0, "Automatic"}, {1, "Manual"}, {2, "Limited"}, {3, "LIMITED_ROUTINE_ACQ"}, {4, "LIMITED_MANUAL_ACQ"}};
 
-constexpr CellEntry kCellEntries[] = {
+constexpr CellEntry kNetworkEntries[] = {
     {telephony::kCellMCC, "Mobile Country Code", "MCC"},
     {telephony::kCellMNC, "Mobile Network Code", "MNC"},
     {telephony::kCellLAC, "Location Area Code", "LAC"},
@@ -54,7 +54,7 @@ void ServingPLMN::update(const CellMonitorList& list)
     RowWriter row = rows();
     if (const CellRecord* cell =
             list.find({telephony::kRadioUMTS, telephony::kRadioGSM}, telephony::kCellTypeServing))
-        printCell(row, *cell, kCellEntries, "ServingPLMN");
+        printCell(row, *cell, kNetworkEntries, "ServingPLMN");
 }
 
 EquivalentPLMNList::EquivalentPLMNList(ClassDictionary& dict, CodeDictionary& codeDict)

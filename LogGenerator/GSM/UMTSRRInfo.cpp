@@ -10,10 +10,10 @@ namespace orvex {
 
 namespace {
 
-constexpr EnumText kStates[] = {{0, "Disconnected"}, {1, "Connecting"}, {2, "CELL_FACH"}, {3, "CELL_DCH"},
+constexpr EnumText kRRCStates[] = {{0, "Disconnected"}, {1, "Connecting"}, {2, "CELL_FACH"}, {3, "CELL_DCH"},
     {4, "CELL_PCH"}, {5, "URA_PCH"}};
 
-constexpr CellEntry kCellEntries[] = {
+constexpr CellEntry kRRInfoEntries[] = {
     {telephony::kCellID, "Cell ID", "Cell ID"},
     {telephony::kCellUARFCN, "UARFCN", "UARFCN"},
     {telephony::kCellScramblingCode, "Scrambling Code", "Scrambling Code"},
@@ -43,7 +43,7 @@ UMTSRRInfo::UMTSRRInfo(ClassDictionary& dict, CodeDictionary& codeDict)
 
 void UMTSRRInfo::update(const LogCode_0x4125& report)
 {
-    rows().setText("RRC State", textFor(report.state(), kStates, "Unknown"));
+    rows().setText("RRC State", textFor(report.state(), kRRCStates, "Unknown"));
 }
 
 void UMTSRRInfo::update(const LogCode_0x4031& report)
@@ -71,7 +71,7 @@ void UMTSRRInfo::update(const CellMonitorList& list)
     list.reportIfAbsent();
     RowWriter row = rows();
     if (const CellRecord* cell = list.find({telephony::kRadioUMTS}, telephony::kCellTypeServing))
-        printCell(row, *cell, kCellEntries, "UMTSRRInfo");
+        printCell(row, *cell, kRRInfoEntries, "UMTSRRInfo");
 }
 
 } // namespace orvex

@@ -11,7 +11,7 @@ LTEClassIndex::~LTEClassIndex()
 
 namespace {
 // Runs, and logs, before the base classes are constructed.
-std::unique_ptr<ClassIndex> makeClassIndex()
+std::unique_ptr<ClassIndex> makeLTEClassIndex()
 {
     systemLog(Priority::error, "Creating LTELogGenerator object");
     return std::make_unique<LTEClassIndex>();
@@ -24,7 +24,7 @@ std::unique_ptr<LogGenerator> LTELogGenerator::generator(const GeneratorEnvironm
 }
 
 LTELogGenerator::LTELogGenerator(const GeneratorEnvironment& environment)
-    : MRLLogGenerator2(environment, "LTE", makeClassIndex())
+    : MRLLogGenerator2(environment, "LTE", makeLTEClassIndex())
 {
 }
 

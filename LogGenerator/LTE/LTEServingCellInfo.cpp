@@ -17,7 +17,7 @@ const char* bandwidthText(int resourceBlocks)
     return textFor(resourceBlocks, kBandwidths, "Unknown");
 }
 
-constexpr CellEntry kCellEntries[] = {
+constexpr CellEntry kLTECellEntries[] = {
     {telephony::kCellTAC, "Tracking Area Code", "TAC"},
     {telephony::kCellID, "Cell Identity", "Cell ID"},
     {telephony::kCellPhysicalCellID, "Physical Cell ID", "Physical Cell ID"},
@@ -59,7 +59,7 @@ void LTEServingCellInfo::update(const CellMonitorList& list)
     list.reportIfAbsent();
     RowWriter row = rows();
     if (const CellRecord* cell = list.find({telephony::kRadioLTE}, telephony::kCellTypeServing))
-        printCell(row, *cell, kCellEntries, "Serving Cell Info");
+        printCell(row, *cell, kLTECellEntries, "Serving Cell Info");
 }
 
 } // namespace orvex

@@ -10,7 +10,7 @@ namespace orvex {
 
 namespace {
 
-constexpr EnumText kStates[] = {{0, "Disconnected"}, {1, "Connecting"}, {2, "Cell Fach"}, {3, "Cell DCH"},
+constexpr EnumText kRRCModes[] = {{0, "Disconnected"}, {1, "Connecting"}, {2, "Cell Fach"}, {3, "Cell DCH"},
     {4, "Cell PCH"}, {5, "Cell URA PCH"}};
 
 // {Name = text; ...}, for the console.
@@ -42,7 +42,7 @@ void RRC_State::updateWithData(Packet packet, LogCode logCode)
             static_cast<long>(packet.size()), static_cast<long>(LogCode_0xD0E0::kExpectedLength));
     }
     const int state = LogCode_0xD0E0(packet).state();
-    const char* name = textFor(state, kStates, "Unknown RRC Mode");
+    const char* name = textFor(state, kRRCModes, "Unknown RRC Mode");
     RowWriter row = rows();
     row.setText("State", name);
     writeConsoleLine(
@@ -52,7 +52,7 @@ void RRC_State::updateWithData(Packet packet, LogCode logCode)
 namespace {
 
 // The list has a single UARFCN. It goes into both rows and replaces the baseband's two.
-constexpr CellEntry kCellEntries[] = {
+constexpr CellEntry kUTRANCellEntries[] = {
     {telephony::kCellLAC, "Local Area Code", "LAC"},
     {telephony::kCellID, "Cell ID", "Cell ID"},
     {telephony::kCellBandInfo, "Freq Band Indicator", "Freq Band Indicator"},
@@ -86,7 +86,7 @@ void UTRANServingCellInfo::update(const CellMonitorList& list)
 {
     RowWriter row = rows();
     for (const CellRecord& cell : list.findAll(telephony::kRadioUTRAN, telephony::kCellTypeServing))
-        printCell(row, cell, kCellEntries, "Serving Cell Info"); // of several, the last one wins
+        printCell(row, cell, kUTRANCellEntries, "Serving Cell Info"); // of several, the last one wins
 }
 
 } // namespace orvex

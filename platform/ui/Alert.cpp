@@ -12,11 +12,11 @@ namespace orvex {
 
 namespace {
 constexpr QSize kCardSize(280, 132);
-constexpr int kCornerRadius = 12;
+constexpr int kAlertCornerRadius = 12;
 constexpr int kTitleTop = 18;
 constexpr int kMessageTop = 46;
 constexpr int kLineHeight = 22;
-constexpr int kButtonHeight = 44;
+constexpr int kAlertButtonHeight = 44;
 const QColor kShade(0, 0, 0, 110);
 
 void centre(TextLabel& label, const QRect& card, int top)
@@ -88,7 +88,7 @@ void Alert::resizeEvent(QResizeEvent*)
     centre(*_title, card(), kTitleTop);
     centre(*_message, card(), kMessageTop);
     _button->setGeometry(
-        card().left(), card().bottom() + 1 - kButtonHeight, kCardSize.width(), kButtonHeight);
+        card().left(), card().bottom() + 1 - kAlertButtonHeight, kCardSize.width(), kAlertButtonHeight);
 }
 
 void Alert::paintEvent(QPaintEvent*)
@@ -99,7 +99,7 @@ void Alert::paintEvent(QPaintEvent*)
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(Qt::NoPen);
     painter.setBrush(theme.bar);
-    painter.drawRoundedRect(card(), kCornerRadius, kCornerRadius);
+    painter.drawRoundedRect(card(), kAlertCornerRadius, kAlertCornerRadius);
     painter.setRenderHint(QPainter::Antialiasing, false);
     painter.fillRect(QRect(card().left(), _button->y() - 1, card().width(), 1), theme.barSeparator);
 }

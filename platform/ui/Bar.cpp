@@ -11,10 +11,10 @@ namespace orvex {
 
 namespace {
 
-constexpr int kButtonHeight = 36;
-constexpr int kPadding = 8;
-constexpr int kChevronWidth = 8;
-constexpr int kChevronHeight = 15;
+constexpr int kBarButtonHeight = 36;
+constexpr int kBarPadding = 8;
+constexpr int kBackChevronWidth = 8;
+constexpr int kBackChevronHeight = 15;
 constexpr int kChevronGap = 7;
 
 constexpr int kSideMargin = 4;
@@ -52,17 +52,17 @@ BarButton::BarButton(Style style, const QString& title, QWidget* parent)
 
 int BarButton::textLeft() const
 {
-    return _style == Style::back ? kPadding + kChevronWidth + kChevronGap : kPadding;
+    return _style == Style::back ? kBarPadding + kBackChevronWidth + kChevronGap : kBarPadding;
 }
 
 QSize BarButton::sizeHint() const
 {
-    return {textLeft() + fontMetrics().horizontalAdvance(text()) + kPadding, kButtonHeight};
+    return {textLeft() + fontMetrics().horizontalAdvance(text()) + kBarPadding, kBarButtonHeight};
 }
 
 QSize BarButton::minimumSizeHint() const
 {
-    return {textLeft() + kPadding, kButtonHeight};
+    return {textLeft() + kBarPadding, kBarButtonHeight};
 }
 
 void BarButton::paintEvent(QPaintEvent*)
@@ -77,11 +77,12 @@ void BarButton::paintEvent(QPaintEvent*)
         painter.drawRoundedRect(QRectF(rect()).adjusted(1, 2, -1, -2), 6, 6);
     }
     if (_style == Style::back) {
-        const QRectF chevron(kPadding, (height() - kChevronHeight) / 2.0, kChevronWidth, kChevronHeight);
+        const QRectF chevron(
+            kBarPadding, (height() - kBackChevronHeight) / 2.0, kBackChevronWidth, kBackChevronHeight);
         drawChevron(painter, chevron, ChevronDirection::left, color, 2.4);
     }
     painter.setPen(color);
-    const QRect place(textLeft(), 0, width() - textLeft() - kPadding, height());
+    const QRect place(textLeft(), 0, width() - textLeft() - kBarPadding, height());
     const auto side = _style == Style::back ? Qt::AlignLeft : Qt::AlignHCenter;
     // Eliding counts fractions of a pixel, which the size hint rounds off.
     const bool fits = fontMetrics().horizontalAdvance(text()) <= place.width();

@@ -24,9 +24,9 @@ int leadingSpoke()
     return static_cast<int>(now.count() / kMillisecondsPerSpoke % kSpokes);
 }
 
-constexpr int kMillisecondsShown = 900;
+constexpr int kScrollBarMilliseconds = 900;
 constexpr int kWidth = 3;
-constexpr int kMargin = 2;
+constexpr int kScrollBarMargin = 2;
 constexpr int kMinimumLength = 36;
 
 } // namespace
@@ -117,14 +117,14 @@ void ScrollIndicator::flash(int offset, int contentHeight, const QRect& view)
 {
     if (contentHeight <= view.height())
         return hide();
-    const double track = view.height() - 2.0 * kMargin;
+    const double track = view.height() - 2.0 * kScrollBarMargin;
     const double length = std::max<double>(kMinimumLength, track * view.height() / contentHeight);
     const double share = std::clamp(static_cast<double>(offset) / (contentHeight - view.height()), 0.0, 1.0);
-    setGeometry(view.right() - kWidth - kMargin, view.top() + kMargin + qRound(share * (track - length)),
-        kWidth, qRound(length));
+    setGeometry(view.right() - kWidth - kScrollBarMargin,
+        view.top() + kScrollBarMargin + qRound(share * (track - length)), kWidth, qRound(length));
     raise();
     show();
-    _rest.start(kMillisecondsShown, this);
+    _rest.start(kScrollBarMilliseconds, this);
 }
 
 void ScrollIndicator::timerEvent(QTimerEvent* event)

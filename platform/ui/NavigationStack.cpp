@@ -9,7 +9,7 @@
 namespace orvex {
 
 namespace {
-constexpr int kSlideMilliseconds = 250;
+constexpr int kPushMilliseconds = 250;
 constexpr double kParallax = 0.3; // how far the lower screen moves, in widths
 } // namespace
 
@@ -108,7 +108,7 @@ void NavigationStack::slide(Screen& leaving, Direction direction, bool animated)
         if (!isPush)
             leaving.deleteLater();
     };
-    _slide.start(animated && isVisible() ? kSlideMilliseconds : 0, step, end);
+    _slide.start(animated && isVisible() ? kPushMilliseconds : 0, step, end);
     if (!animated || !isVisible())
         _slide.finish();
 }

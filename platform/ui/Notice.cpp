@@ -9,11 +9,11 @@
 namespace orvex {
 
 namespace {
-constexpr int kMillisecondsShown = 5000;
-constexpr int kFontSize = 14;
-constexpr int kMargin = 10;
-constexpr int kPadding = 12;
-constexpr int kCornerRadius = 10;
+constexpr int kNoticeMilliseconds = 5000;
+constexpr int kNoticeFontSize = 14;
+constexpr int kNoticeMargin = 10;
+constexpr int kNoticePadding = 12;
+constexpr int kNoticeCornerRadius = 10;
 constexpr int kAboveBottom = 54; // clears the toolbar
 // Paths have no blanks to break them at.
 constexpr int kLayout = Qt::AlignLeft | Qt::AlignVCenter | Qt::TextWrapAnywhere;
@@ -40,19 +40,19 @@ Notice::Notice(QWidget& window, const QString& text)
     , _text(text)
 {
     setAttribute(Qt::WA_TransparentForMouseEvents);
-    setFont(Theme::systemFont(kFontSize));
+    setFont(Theme::systemFont(kNoticeFontSize));
     setAccessibleName(text);
     window.installEventFilter(this);
-    _shown.start(kMillisecondsShown, this);
+    _shown.start(kNoticeMilliseconds, this);
 }
 
 void Notice::place()
 {
     const QSize window = parentWidget()->size();
-    const int width = window.width() - 2 * kMargin;
-    const QRect room(0, 0, width - 2 * kPadding, window.height());
-    const int height = fontMetrics().boundingRect(room, kLayout, _text).height() + 2 * kPadding;
-    setGeometry(kMargin, window.height() - kAboveBottom - height, width, height);
+    const int width = window.width() - 2 * kNoticeMargin;
+    const QRect room(0, 0, width - 2 * kNoticePadding, window.height());
+    const int height = fontMetrics().boundingRect(room, kLayout, _text).height() + 2 * kNoticePadding;
+    setGeometry(kNoticeMargin, window.height() - kAboveBottom - height, width, height);
 }
 
 bool Notice::eventFilter(QObject* watched, QEvent* event)
@@ -78,9 +78,10 @@ void Notice::paintEvent(QPaintEvent*)
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(Qt::NoPen);
     painter.setBrush(theme.text);
-    painter.drawRoundedRect(rect(), kCornerRadius, kCornerRadius);
+    painter.drawRoundedRect(rect(), kNoticeCornerRadius, kNoticeCornerRadius);
     painter.setPen(theme.background);
-    painter.drawText(rect().adjusted(kPadding, kPadding, -kPadding, -kPadding), kLayout, _text);
+    painter.drawText(
+        rect().adjusted(kNoticePadding, kNoticePadding, -kNoticePadding, -kNoticePadding), kLayout, _text);
 }
 
 } // namespace orvex

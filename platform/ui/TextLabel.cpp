@@ -23,10 +23,10 @@ QString inOneLine(QString text)
     return text;
 }
 
-constexpr int kFontSize = 15;
+constexpr int kLabelFontSize = 15;
 constexpr int kLargestField = 22; // pixels, in a field of 34
 constexpr int kTextMargin = 8;
-constexpr int kCornerRadius = 6;
+constexpr int kFieldCornerRadius = 6;
 
 } // namespace
 
@@ -81,7 +81,7 @@ QFont fittedFont(QFont font, const QString& text, int room, int smallest)
 TextField::TextField(QWidget* parent)
     : QLineEdit(parent)
 {
-    QFont font = Theme::systemFont(kFontSize);
+    QFont font = Theme::systemFont(kLabelFontSize);
     font.setPixelSize(std::min(font.pixelSize(), kLargestField));
     setFont(font);
     QPalette colours = palette();
@@ -99,7 +99,7 @@ void TextField::paintEvent(QPaintEvent* event)
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setBrush(theme.bar);
     painter.setPen(hasFocus() ? QPen(theme.tint, 1.5) : QPen(theme.barSeparator, 1));
-    painter.drawRoundedRect(QRectF(rect()).adjusted(1, 1, -1, -1), kCornerRadius, kCornerRadius);
+    painter.drawRoundedRect(QRectF(rect()).adjusted(1, 1, -1, -1), kFieldCornerRadius, kFieldCornerRadius);
     painter.end();
     QLineEdit::paintEvent(event);
 }

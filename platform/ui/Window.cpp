@@ -17,7 +17,7 @@ namespace orvex {
 
 namespace {
 
-constexpr int kSlideMilliseconds = 300;
+constexpr int kModalSlideMilliseconds = 300;
 
 QAccessibleInterface* interfaceFor(const QString&, QObject* object)
 {
@@ -67,7 +67,8 @@ void Window::presentModally(std::unique_ptr<Screen> screen, bool animated)
     _modal->raise();
     _modal->firstResponder().setFocus();
     _slide.start(
-        kSlideMilliseconds, [this](double progress) { _modal->move(0, qRound((1 - progress) * height())); },
+        kModalSlideMilliseconds,
+        [this](double progress) { _modal->move(0, qRound((1 - progress) * height())); },
         // Hidden, the root view is out of reach of the Tab key.
         [this] { _root->hide(); });
     if (!animated)
@@ -86,7 +87,7 @@ void Window::dismissModal(bool animated)
     _root->setFocus();
     _root->lower(); // below an alert
     _slide.start(
-        kSlideMilliseconds,
+        kModalSlideMilliseconds,
         [this, leaving](double progress) { leaving->move(0, qRound(progress * height())); },
         [leaving] {
             leaving->hide();

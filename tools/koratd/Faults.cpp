@@ -17,7 +17,7 @@ constexpr LogCode kPropertyListCodes = 3; // extra packets of other codes are dr
 
 // The number that a text is, from the least to the most.
 template <typename Number>
-std::optional<Number> numberIn(std::string_view text, Number least, Number most)
+std::optional<Number> numberBetween(std::string_view text, Number least, Number most)
 {
     Number value{};
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
@@ -40,17 +40,17 @@ bool Faults::add(std::string_view option)
     const std::string_view name = option.substr(0, equals);
     const std::string_view value = equals == option.npos ? std::string_view() : option.substr(equals + 1);
     if (name == "refuse-channel") {
-        refuseChannel = numberIn(value, -kLargestError, kLargestError);
+        refuseChannel = numberBetween(value, -kLargestError, kLargestError);
         return refuseChannel.value_or(0) != 0; // 0 would be success
     }
     if (name == "die-after") {
-        const auto seconds = numberIn(value, 0.0, kLongestLife);
+        const auto seconds = numberBetween(value, 0.0, kLongestLife);
         if (seconds)
             dieAfter = std::chrono::milliseconds(std::llround(*seconds * 1000));
         return seconds.has_value();
     }
     if (name == "garbage") {
-        const auto percent = numberIn(value, 0, 100);
+        const auto percent = numberBetween(value, 0, 100);
         garbagePercent = percent.value_or(0);
         return percent.has_value();
     }

@@ -13,7 +13,7 @@ using namespace std::chrono_literals;
 constexpr auto kAskingPeriod = 5s;
 constexpr auto kLongestWait = 15s;      // for cells: those of before are old by then
 constexpr auto kLongestCellTime = 310s; // ModemManager gives a modem 300
-constexpr auto kAnswerTime = 30s;
+constexpr auto kQueryTime = 30s;
 constexpr auto kDenialTime = 60s; // a permission may have been given by then
 constexpr auto kEndTime = 10s;
 constexpr auto kLastAnswerTime = 500ms;
@@ -21,7 +21,7 @@ constexpr auto kLastAnswerTime = 500ms;
 constexpr unsigned kSignalRate = 5;        // s
 constexpr std::int64_t kNetworkSource = 1; // MM_MODEM_LOCATION_SOURCE_3GPP_LAC_CI
 
-ModemQuestion::Time timeNow()
+ModemQuestion::Time steadyTime()
 {
     return ModemQuestion::Time::clock::now();
 }
@@ -106,7 +106,7 @@ void ModemManagerReader::ask()
 {
     if (_state.condition != Condition::enabled)
         return;
-    const Time now = timeNow();
+    const Time now = steadyTime();
     askForCells(now);
     askForLocation(now);
     setUpSignal(now);
@@ -152,7 +152,7 @@ void ModemManagerReader::askForLocation(Time now)
         return;
     const auto number = _locationQuestion.ask(now);
     _bus.call(
-        _modem, kLocationInterface, "GetLocation", {}, kAnswerTime, [this, number](const Answer& answer) {
+        _modem, kLocationInterface, "GetLocation", {}, kQueryTime, [this, number](const Answer& answer) {
             if (!_locationQuestion.answer(number))
                 return;
             retryAfter(answer, _locationQuestion);
@@ -169,7 +169,7 @@ void ModemManagerReader::setUpSignal(Time now)
     _signalModem = _modem;
     const auto number = _signalQuestion.ask(now);
     _bus.call(
-        _modem, kSignalInterface, "Setup", {kSignalRate}, kAnswerTime, [this, number](const Answer& answer) {
+        _modem, kSignalInterface, "Setup", {kSignalRate}, kQueryTime, [this, number](const Answer& answer) {
             if (!_signalQuestion.answer(number))
                 return;
             retryAfter(answer, _signalQuestion);
@@ -188,7 +188,7 @@ bool ModemManagerReader::isSignalRateOurs() const
 void ModemManagerReader::putSignalBack()
 {
     if (isSignalRateOurs())
-        _bus.call(_signalModem, kSignalInterface, "Setup", {0U}, kAnswerTime, [](const Answer&) {});
+        _bus.call(_signalModem, kSignalInterface, "Setup", {0U}, kQueryTime, [](const Answer&) {});
     _signalModem.clear();
 }
 
@@ -197,7 +197,7 @@ void ModemManagerReader::retryAfter(const Answer& answer, ModemQuestion& questio
     if (answer.isNotSupported())
         question.giveUp();
     else if (answer.isDenied())
-        question.waitUntil(timeNow() + kDenialTime);
+        question.waitUntil(steadyTime() + kDenialTime);
 }
 
 } // namespace orvex::korat

@@ -69,7 +69,7 @@ constexpr struct {
     const char* key;
     const char* name;
     const char* unit;
-} kLevels[] = {
+} kSignalLevels[] = {
     {"rssi", "RSSI", "dBm"},
     {"rscp", "RSCP", "dBm"},
     {"ecio", "Ec/Io", "dB"},
@@ -200,7 +200,7 @@ std::vector<SignalLevel> signalFrom(const Dictionary& properties)
         const DictionaryRef levels = properties[property].dictionary();
         if (!levels)
             continue;
-        for (const auto& [key, name, unit] : kLevels) {
+        for (const auto& [key, name, unit] : kSignalLevels) {
             if (const auto level = levelIn((*levels)[key]))
                 result.push_back({std::string(technology) + ' ' + name, *level, unit});
         }

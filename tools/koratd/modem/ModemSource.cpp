@@ -6,7 +6,7 @@
 namespace orvex::korat {
 
 namespace {
-std::uint64_t timeNow()
+std::uint64_t wallClockTime()
 {
     const auto time = std::chrono::system_clock::now().time_since_epoch();
     return static_cast<std::uint64_t>(std::chrono::duration_cast<Microseconds>(time).count());
@@ -39,7 +39,7 @@ void ModemSource::look(Microseconds now)
         const auto [sent, isFirst] = _sent.try_emplace(content.code);
         if (isFirst || sent->second.payload != content.payload
             || now >= sent->second.time + kLongestSilence) {
-            _waiting.push_back({now, content.code, messageOf(content, timeNow())});
+            _waiting.push_back({now, content.code, messageOf(content, wallClockTime())});
             sent->second = {content.payload, now};
         }
         _repeat = std::min(_repeat, sent->second.time + kLongestSilence);

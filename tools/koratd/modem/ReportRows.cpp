@@ -7,13 +7,13 @@
 namespace orvex::korat {
 
 namespace {
-constexpr int kReceiveLevelZero = -111; // dBm
+constexpr int kLowestReceiveLevel = -111; // dBm
 
 constexpr struct {
     Radio radio;
     const char* name;
     Cell::Number Cell::*field;
-} kNumbers[] = {
+} kNumberRows[] = {
     {Radio::gsm, "LAC", &Cell::areaCode},
     {Radio::gsm, "Cell ID", &Cell::identity},
     {Radio::gsm, "ARFCN", &Cell::channel},
@@ -48,7 +48,7 @@ constexpr struct {
     const char* name;
     Cell::Level Cell::*field;
     const char* unit;
-} kLevels[] = {
+} kLevelRows[] = {
     {"RSRP", &Cell::rsrp, "dBm"},
     {"RSRQ", &Cell::rsrq, "dB"},
     {"SINR", &Cell::sinr, "dB"},
@@ -67,7 +67,7 @@ void addGsmRows(ReportRows& rows, const Cell& cell)
     if (const auto bsic = cell.physicalIdentity) // network and base station colour code, as engineers say it
         rows.add("BSIC", text("%d-%d", static_cast<int>(*bsic >> 3), static_cast<int>(*bsic & 7)));
     if (const auto level = cell.receiveLevel)
-        rows.add("RxLev", text("%d dBm", static_cast<int>(*level) + kReceiveLevelZero));
+        rows.add("RxLev", text("%d dBm", static_cast<int>(*level) + kLowestReceiveLevel));
 }
 
 void addAddresses(
@@ -116,7 +116,7 @@ ReportRows rowsOf(const Cell& cell)
 {
     ReportRows rows;
     rows.add("Network", networkText(cell.operatorId));
-    for (const auto& [radio, name, field] : kNumbers) {
+    for (const auto& [radio, name, field] : kNumberRows) {
         if (radio == cell.radio)
             rows.add(name, cell.*field);
     }
@@ -124,7 +124,7 @@ ReportRows rowsOf(const Cell& cell)
         addGsmRows(rows, cell);
     if (const auto band = cell.radio == Radio::lte && cell.channel ? lteBandOf(*cell.channel) : std::nullopt)
         rows.add("Band", std::to_string(*band));
-    for (const auto& [name, field, unit] : kLevels)
+    for (const auto& [name, field, unit] : kLevelRows)
         rows.add(name, cell.*field, unit);
     rows.add("Path Loss", cell.pathLoss, " dB");
     for (const auto& [name, text] : cell.others)
