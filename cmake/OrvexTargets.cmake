@@ -58,6 +58,8 @@ function(orvex_add_layer target)
         FILE_SET paired TYPE HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${headers})
     set_target_properties(${target} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON INTERFACE_HEADER_SETS_TO_VERIFY HEADERS)
     target_link_libraries(${target} PUBLIC ${LAYER_LINKS} PRIVATE orvex_build_flags ${LAYER_PRIVATE_LINKS})
+    # A whole layer at once, so its sources must not have local names in common.
+    set_target_properties(${target} PROPERTIES UNITY_BUILD ${ORVEX_UNITY} UNITY_BUILD_BATCH_SIZE 0)
     set_property(GLOBAL APPEND PROPERTY ORVEX_LAYERS ${target})
 endfunction()
 
