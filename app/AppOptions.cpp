@@ -39,6 +39,7 @@ CommandLine::Program program()
                     "Say why a session does not come up, step by step. The status is 0 if nothing is wrong, "
                     "else 1."},
                 {"open", "The same as FILE.", "FILE"},
+                {"alert", "If FILE cannot be shown, say why in a window too."},
                 {"print-status",
                     "Print the number of messages decoded so far and the status line whenever the line "
                     "changes."},
@@ -56,6 +57,7 @@ CommandLine::Program program()
                 {"light", "dark"},
                 {"console", "light"},
                 {"console", "dark"},
+                {"console", "alert"},
                 {"console", "print-status"},
                 {"console", "until-painted"},
                 {"console", "size"},
@@ -68,6 +70,7 @@ CommandLine::Program program()
                 {"diagnose", "open"},
                 {"diagnose", "light"},
                 {"diagnose", "dark"},
+                {"diagnose", "alert"},
                 {"diagnose", "print-status"},
                 {"diagnose", "size"},
                 {"diagnose", "until-painted"},
@@ -162,6 +165,7 @@ AppOptions AppOptions::parse(int count, const char* const* arguments)
         result.earlyExit = line.wrongUsage(error);
     result.diagnoses = line.isSet("diagnose");
     result.usesConsole = line.isSet("console");
+    result.alerts = line.isSet("alert");
     result.printsStatus = line.isSet("print-status");
     result.endsWhenPainted = line.isSet("until-painted");
     if (line.isSet("light"))

@@ -29,6 +29,7 @@ struct AppOptions {
     Theme::Mode theme = Theme::Mode::system;
     std::optional<std::string> resources; // absent: the default directory
     std::optional<std::string> file;      // to show instead of a session
+    bool alerts = false;                  // report in a window, too, why the file cannot be shown
     bool printsStatus = false;            // print the window's status line
     bool endsWhenPainted = false;         // to measure how long the start takes
     std::optional<QSize> size;            // of the window, in points; absent: the screen's

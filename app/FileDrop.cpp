@@ -1,5 +1,7 @@
 #include "FileDrop.h"
 
+#include "Theme.h"
+
 #include <QCoreApplication>
 #include <QDropEvent>
 #include <QFile>
@@ -54,8 +56,10 @@ bool FileDrop::eventFilter(QObject* watched, QEvent* event)
 bool openInAnotherProcess(const std::string& path, const QWidget& window)
 {
     const QString size = QStringLiteral("%1x%2").arg(window.width()).arg(window.height());
+    const QString theme = Theme::isDark() ? QStringLiteral("--dark") : QStringLiteral("--light");
     return QProcess::startDetached(QCoreApplication::applicationFilePath(),
-        {QStringLiteral("--size"), size, QStringLiteral("--"), QFile::decodeName(path.c_str())});
+        {QStringLiteral("--alert"), theme, QStringLiteral("--size"), size, QStringLiteral("--"),
+            QFile::decodeName(path.c_str())});
 }
 
 } // namespace orvex

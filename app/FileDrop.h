@@ -21,8 +21,8 @@ private:
     std::function<void(const std::string& path)> _onFile;
 };
 
-// Opens the file in a process of its own, so that a hostile file cannot end this session. False if the
-// process cannot be started.
+// Opens the file in a process of its own, so that a hostile file cannot end this session. It looks like this
+// window and reports a file that it cannot show. False if the process cannot be started.
 bool openInAnotherProcess(const std::string& path, const QWidget& window);
 
 } // namespace orvex

@@ -8,7 +8,16 @@
 #include "VisibleText.h"
 #include "Window.h"
 
+#include <QMessageBox>
+
 namespace orvex {
+
+namespace {
+QString titleFor(const std::string& fileName)
+{
+    return QStringLiteral("%1 – Orvex").arg(QString::fromStdString(visibleText(fileName)));
+}
+} // namespace
 
 SnapshotViewer::SnapshotViewer(
     const Snapshot& snapshot, const std::string& name, const std::optional<QSize>& windowSize)
@@ -21,8 +30,7 @@ SnapshotViewer::SnapshotViewer(OrvexModelNodeRef tree, const std::string& status
 {
     auto root = std::make_unique<OrvexPaneController>(*this, std::move(tree), "/");
     root->setStatus(status, false); // the screens above take it over
-    const QString title = QStringLiteral("%1 – Orvex").arg(QString::fromStdString(visibleText(name)));
-    _window = std::make_unique<PaneWindow>(title, windowSize, *this, std::move(root));
+    _window = std::make_unique<PaneWindow>(titleFor(name), windowSize, *this, std::move(root));
     _window->window().show();
 }
 
@@ -37,6 +45,13 @@ NavigationStack& SnapshotViewer::navigationStack() const
 }
 
 SnapshotViewer::~SnapshotViewer() = default;
+
+void alertOfFileError(const std::string& name, const std::string& error)
+{
+    QMessageBox alert(QMessageBox::Critical, titleFor(name), QString::fromStdString(visibleText(error)));
+    alert.setTextFormat(Qt::PlainText); // a file's name is no markup
+    alert.exec();
+}
 
 std::string snapshotMessage(const Snapshot& snapshot)
 {

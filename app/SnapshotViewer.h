@@ -38,6 +38,9 @@ private:
     std::unique_ptr<PaneWindow> _window;
 };
 
+// Says in a window why the file of that name cannot be shown, and returns when the user has closed it.
+void alertOfFileError(const std::string& name, const std::string& error);
+
 // The status line of a snapshot.
 std::string snapshotMessage(const Snapshot& snapshot);
 

@@ -14,6 +14,7 @@
 #include "SystemLog.h"
 
 #include <QApplication>
+#include <QByteArray>
 #include <QScreen>
 
 #include <algorithm>
@@ -66,7 +67,7 @@ std::optional<QSize> windowSize(const AppOptions& options)
 }
 
 // Runs the body with an application object that can open windows.
-int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<int()>& body)
+int runInWindow(int argc, char** argv, const AppOptions& options, const std::function<int()>& body)
 {
     if (!displayIsNamed()) {
         printNoDisplay();
@@ -77,14 +78,16 @@ int runInWindow(int argc, char** argv, Theme::Mode theme, const std::function<in
     keepDecimalPoints();
     qInstallMessageHandler(usualHandler);
     QApplication::setApplicationName(QStringLiteral("orvex"));
-    Theme::use(theme);
+    Theme::use(options.theme);
     installAccessibility();
+    if (options.resources) // the windows of dropped files take the same
+        qputenv("ORVEX_RESOURCES", QByteArray::fromStdString(*options.resources));
     return body();
 }
 
 int runWindow(int argc, char** argv, const AppOptions& options)
 {
-    return runInWindow(argc, argv, options.theme, [&options] {
+    return runInWindow(argc, argv, options, [&options] {
         LinuxPlatform platform(options.resourceDirectory());
         const auto app = OrvexApp::create(platform.forApp(), windowSize(options));
         std::optional<StandardOutput> output;
@@ -113,14 +116,16 @@ int runWindow(int argc, char** argv, const AppOptions& options)
 // Shows the tree of the file that the options name.
 int showFile(int argc, char** argv, const AppOptions& options)
 {
-    return runInWindow(argc, argv, options.theme, [&options] {
+    return runInWindow(argc, argv, options, [&options] {
         LinuxPlatform platform(options.resourceDirectory());
         const OpenedFile opened = openFile(*options.file, platform.forFiles());
+        const std::string name = std::filesystem::path(*options.file).filename().string();
         if (!opened.tree) {
             printError(opened.error);
+            if (options.alerts)
+                alertOfFileError(name, opened.error);
             return kExitFailure;
         }
-        const std::string name = std::filesystem::path(*options.file).filename().string();
         const SnapshotViewer viewer(opened.tree, opened.status, name, windowSize(options));
         const TerminationSignals terminationSignals([] { QCoreApplication::quit(); });
         return QApplication::exec();

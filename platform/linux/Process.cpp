@@ -2,8 +2,6 @@
 
 #include "SystemLog.h"
 
-#include <QSocketNotifier>
-
 #include <array>
 #include <atomic>
 #include <cerrno>
@@ -12,7 +10,7 @@
 #include <cstdio>
 #include <cstdlib>
 #include <exception>
-#include <stdexcept>
+#include <memory>
 #include <thread>
 #include <typeinfo>
 #include <utility>
@@ -27,21 +25,15 @@ namespace {
 constexpr std::array kSignals = {SIGINT, SIGTERM, SIGHUP};
 constexpr unsigned kSecondsToEnd = 1;
 
-std::atomic<int> theWriteEnd = -1;
 std::atomic<int> theSignal = 0;
 std::atomic<void (*)()> theLastAct = nullptr;
 static_assert(std::atomic<int>::is_always_lock_free);
 
-// Writing to a pipe is all a handler may do here; the event loop reads the other end.
-extern "C" void passToEventLoop(int signal)
+// Runs in the signal handler.
+void startTheClock(int signal)
 {
-    const int savedError = errno;
     if (theSignal.exchange(signal) == 0)
         ::alarm(kSecondsToEnd); // further signals do not put it off
-    const char byte = 1;
-    // A full pipe will wake the event loop anyway.
-    [[maybe_unused]] const ssize_t written = ::write(theWriteEnd.load(), &byte, 1);
-    errno = savedError;
 }
 
 // Interrupts whatever the process is stuck in.
@@ -51,15 +43,6 @@ extern "C" void die(int)
         act();
     std::signal(theSignal, SIG_DFL);
     std::raise(theSignal);
-}
-
-void setHandler(void (*handler)(int))
-{
-    struct sigaction action { };
-    action.sa_handler = handler;
-    action.sa_flags = SA_RESTART;
-    for (const int signal : kSignals)
-        ::sigaction(signal, &action, nullptr);
 }
 
 struct Free {
@@ -144,31 +127,15 @@ void setLastAct(void (*act)())
 }
 
 TerminationSignals::TerminationSignals(std::function<void()> onSignal)
+    : _pipe(
+        kSignals,
+        [handler = std::move(onSignal)](int) mutable {
+            if (const auto once = std::exchange(handler, {}))
+                once();
+        },
+        startTheClock)
 {
-    std::array<int, 2> ends{};
-    if (::pipe2(ends.data(), O_CLOEXEC | O_NONBLOCK) != 0)
-        throw std::runtime_error("No pipe for signals");
-    _readEnd = ends[0];
-    _writeEnd = ends[1];
-    theWriteEnd = _writeEnd;
-    _notifier = std::make_unique<QSocketNotifier>(_readEnd, QSocketNotifier::Read);
-    QObject::connect(
-        _notifier.get(), &QSocketNotifier::activated, _notifier.get(), [this, handler = std::move(onSignal)] {
-            char byte = 0;
-            while (::read(_readEnd, &byte, 1) > 0) { }
-            handler();
-        });
     std::signal(SIGALRM, die); // outlives the object: the process may get stuck later
-    setHandler(passToEventLoop);
-}
-
-TerminationSignals::~TerminationSignals()
-{
-    setHandler(SIG_DFL);
-    theWriteEnd = -1;
-    _notifier.reset();
-    ::close(_readEnd);
-    ::close(_writeEnd);
 }
 
 } // namespace orvex

@@ -1,12 +1,11 @@
 #pragma once
 
+#include "SignalPipe.h"
+
 #include <QStringList>
 
 #include <functional>
-#include <memory>
 #include <string>
-
-class QSocketNotifier;
 
 // What a program does once, around its main function.
 namespace orvex {
@@ -26,22 +25,17 @@ void occupyStandardStreams();
 // goes to standard error.
 void installFatalErrorHandler();
 
-// Turns SIGINT, SIGTERM and SIGHUP into a call on the event loop. Only one object may exist at a time; its
-// destructor restores the signals' default effect.
+// Turns the first SIGINT, SIGTERM or SIGHUP into a call on the event loop. Only one object may exist at a
+// time; its destructor restores the signals' default effect.
 //
 // A process that has not ended one second after a signal, because it waits for a reader, a bus or a service,
 // dies of that signal, after the act of setLastAct().
 class TerminationSignals {
 public:
     explicit TerminationSignals(std::function<void()> onSignal);
-    ~TerminationSignals();
-    TerminationSignals(const TerminationSignals&) = delete;
-    TerminationSignals& operator=(const TerminationSignals&) = delete;
 
 private:
-    int _readEnd = -1;
-    int _writeEnd = -1;
-    std::unique_ptr<QSocketNotifier> _notifier;
+    SignalPipe _pipe;
 };
 
 // Called before a process that is stuck dies of a signal; null for nothing. It runs in a signal handler.

@@ -8,12 +8,8 @@
 #include <atomic>
 #include <cerrno>
 #include <csignal>
-#include <cstdint>
-#include <span>
-#include <stdexcept>
 #include <utility>
 
-#include <fcntl.h>
 #include <termios.h>
 #include <unistd.h>
 
@@ -26,7 +22,6 @@ constexpr std::array kCrashes = {SIGABRT, SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGQU
 
 termios theModes{}; // as they were before ours
 std::atomic<bool> theModesAreOurs = false;
-std::atomic<int> theWriteEnd = -1;
 static_assert(std::atomic<bool>::is_always_lock_free);
 
 // A process in the background that sets the modes is stopped, unless it blocks the signal that says so.
@@ -68,58 +63,27 @@ extern "C" void putBackAndCrash(int signal)
     ::raise(signal); // its handler was reset
 }
 
-extern "C" void reportToEventLoop(int signal)
-{
-    const int savedError = errno;
-    const auto byte = static_cast<std::uint8_t>(signal);
-    [[maybe_unused]] const ssize_t written = ::write(theWriteEnd.load(), &byte, 1);
-    errno = savedError;
-}
-
-// For each of the numbers; "signals" is a macro of Qt's.
-void setHandler(std::span<const int> numbers, void (*handler)(int), unsigned flags)
-{
-    struct sigaction action { };
-    action.sa_handler = handler;
-    action.sa_flags = static_cast<int>(flags);
-    for (const int number : numbers)
-        ::sigaction(number, &action, nullptr);
-}
-
 } // namespace
 
 RawTerminal::RawTerminal(Events events)
     : _events(std::move(events))
 {
-    std::array<int, 2> ends{};
-    if (::pipe2(ends.data(), O_CLOEXEC | O_NONBLOCK) != 0)
-        throw std::runtime_error("No pipe for signals");
-    _readEnd = ends[0];
-    _writeEnd = ends[1];
-    theWriteEnd = _writeEnd;
-    _signals = std::make_unique<QSocketNotifier>(_readEnd, QSocketNotifier::Read);
-    QObject::connect(
-        _signals.get(), &QSocketNotifier::activated, _signals.get(), [this] { handleSignals(); });
     _input = std::make_unique<QSocketNotifier>(STDIN_FILENO, QSocketNotifier::Read);
     QObject::connect(_input.get(), &QSocketNotifier::activated, _input.get(), [this] { readInput(); });
     _input->setEnabled(false);
 
     setLastAct(putBackTerminal);
-    setHandler(kCrashes, putBackAndCrash, SA_RESETHAND | SA_NODEFER);
-    setHandler(kReported, reportToEventLoop, SA_RESTART);
+    setSignalHandler(kCrashes, putBackAndCrash, SA_RESETHAND | SA_NODEFER);
+    _signals.emplace(kReported, [this](int signal) { handle(signal); });
     readsKeys();
 }
 
 RawTerminal::~RawTerminal()
 {
-    setHandler(kReported, SIG_DFL, 0);
-    setHandler(kCrashes, SIG_DFL, 0);
+    _signals.reset();
+    setSignalHandler(kCrashes, SIG_DFL, 0);
     setLastAct(nullptr);
     putBackTerminal();
-    theWriteEnd = -1;
-    _signals.reset();
-    ::close(_readEnd);
-    ::close(_writeEnd);
 }
 
 bool RawTerminal::readsKeys()
@@ -139,19 +103,16 @@ void RawTerminal::readInput()
         _input->setEnabled(false); // the terminal has gone
 }
 
-void RawTerminal::handleSignals()
+void RawTerminal::handle(int signal)
 {
-    std::uint8_t signal = 0;
-    while (::read(_readEnd, &signal, 1) == 1) {
-        if (signal == SIGTSTP) {
-            _input->setEnabled(false);
-            putBackTerminal();
-            ::raise(SIGSTOP);
-            continue;
-        }
-        readsKeys();
-        _events.onRedraw();
+    if (signal == SIGTSTP) {
+        _input->setEnabled(false);
+        putBackTerminal();
+        ::raise(SIGSTOP);
+        return;
     }
+    readsKeys();
+    _events.onRedraw();
 }
 
 } // namespace orvex

@@ -1,7 +1,10 @@
 #pragma once
 
+#include "SignalPipe.h"
+
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string_view>
 
 class QSocketNotifier;
@@ -31,13 +34,11 @@ public:
 
 private:
     void readInput();
-    void handleSignals();
+    void handle(int signal);
 
     Events _events;
-    int _readEnd = -1;
-    int _writeEnd = -1;
-    std::unique_ptr<QSocketNotifier> _signals;
     std::unique_ptr<QSocketNotifier> _input;
+    std::optional<SignalPipe> _signals;
 };
 
 } // namespace orvex

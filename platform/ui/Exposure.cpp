@@ -11,20 +11,39 @@ Exposure::Exposure(QWidget& window, std::function<void()> onSeen)
     : QObject(&window)
     , _window(window)
     , _onSeen(std::move(onSeen))
+    , _cover(window.winId(), // makes the native window, which gets the events
+          [this](bool isCovered) { setCovered(isCovered); })
 {
-    window.winId(); // makes the native window, which gets the events
     window.windowHandle()->installEventFilter(this);
 }
 
 bool Exposure::eventFilter(QObject*, QEvent* event)
 {
-    if (event->type() != QEvent::Expose && event->type() != QEvent::WindowStateChange)
-        return false;
-    const bool isSeen = _window.windowHandle()->isExposed() && !_window.isMinimized();
-    if (!std::exchange(_isSeen, isSeen) && isSeen)
-        QMetaObject::invokeMethod(
-            this, [this] { _onSeen(); }, Qt::QueuedConnection);
+    if (event->type() == QEvent::Expose || event->type() == QEvent::WindowStateChange)
+        update();
     return false;
+}
+
+void Exposure::setCovered(bool isCovered)
+{
+    _isCovered = isCovered;
+    if (isCovered)
+        _window.setUpdatesEnabled(false); // Qt goes on painting what it could show
+    update();
+}
+
+void Exposure::update()
+{
+    const bool isSeen = _window.windowHandle()->isExposed() && !_window.isMinimized() && !_isCovered;
+    if (std::exchange(_isSeen, isSeen) || !isSeen)
+        return;
+    const auto show = [this] {
+        if (!_isSeen)
+            return;
+        _onSeen();
+        _window.setUpdatesEnabled(true);
+    };
+    QMetaObject::invokeMethod(this, show, Qt::QueuedConnection);
 }
 
 } // namespace orvex

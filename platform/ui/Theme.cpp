@@ -65,6 +65,11 @@ const Theme& Theme::current()
     return *theCurrent();
 }
 
+bool Theme::isDark()
+{
+    return theCurrent() == &darkTheme();
+}
+
 void Theme::use(Mode mode)
 {
     const bool systemIsDark = QGuiApplication::palette().color(QPalette::Window).lightness() < 128;

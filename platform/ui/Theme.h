@@ -23,6 +23,7 @@ struct Theme {
     QColor tint; // what can be tapped
 
     static const Theme& current();
+    static bool isDark();
     // Sets variant and palette of the whole application. Mode::system follows the window colour of the
     // desktop's palette.
     static void use(Mode mode);

@@ -3,6 +3,7 @@
 #include "OrvexApp.h"
 #include "OrvexSaveViewController.h"
 
+#include "PaintCounter.h"
 #include "PaneFixture.h"
 #include "SessionFixture.h"
 
@@ -20,18 +21,6 @@ namespace orvex::test {
 namespace {
 
 using namespace std::chrono_literals;
-
-// Counts the paint events of all widgets.
-class PaintCounter final : public QObject {
-public:
-    bool eventFilter(QObject*, QEvent* event) override
-    {
-        count += event->type() == QEvent::Paint ? 1 : 0;
-        return false;
-    }
-
-    int count = 0;
-};
 
 struct OrvexAppWindowTest : testing::Test, SessionFixture {
     OrvexAppWindowTest()
@@ -96,8 +85,7 @@ TEST_F(OrvexAppWindowTest, UpdatesItsScreensWhenSomebodyLooksAgain)
     ASSERT_EQ(neighbors().rowCount(), 1);
     app->window()->windowHandle()->setVisible(false);
     QCoreApplication::processEvents();
-    PaintCounter paints;
-    qApp->installEventFilter(&paints);
+    PaintCounter paints(*app->window());
     deliverNeighbors(2);
     refresh();
     QTest::qWait(100);

@@ -152,6 +152,22 @@ TEST_F(FilterTest, PutsEachCaptureIntoAnEnvelope)
         R"("value":"-91.50 dBm","number":-91.5,"unit":"dBm"})");
 }
 
+TEST_F(FilterTest, PrintsTheExamplesOfItsDocument)
+{
+    std::ifstream file(ORVEX_DOCUMENTS "/json.md");
+    std::string rest(std::istreambuf_iterator<char>(file), {});
+    const auto next = [&rest](const std::string& begin, const char* end) {
+        rest.erase(0, rest.find(begin) + begin.size());
+        return rest.substr(0, rest.find(end));
+    };
+    const std::string command = next("    orvex-decode ", "\n");
+    const Result result = shell("cd '" ORVEX_DOCUMENTS "/..' && \"$DECODE\" " + command);
+    EXPECT_EQ(Json::parse(next("```json\n", "```")), Json::parse(result.output)) << command;
+    next("## A summary", "\n");
+    EXPECT_THAT(json({"--summary", capture("MRL_LTE")})["summary"],
+        testing::Contains(Json::parse(next("```json\n", "```"))));
+}
+
 TEST_F(FilterTest, SummarizesTheLogCodesOfACapture)
 {
     const QString file = capture("x.pcap",
