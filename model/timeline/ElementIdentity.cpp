@@ -111,7 +111,7 @@ std::string ElementIdentity::text() const
 {
     std::string result;
     for (const Row& row : _rows)
-        result += (result.empty() ? "" : ", ") + row.key + ' ' + row.text;
+        result.append(result.empty() ? "" : ", ").append(row.key).append(" ").append(row.text);
     return result;
 }
 
