@@ -79,7 +79,7 @@ void ElementIdentity::readRows(const Dictionary& dictionary)
         if (known != std::end(kIdentifyingRows)) {
             if (const std::string* text = value.string(); text && !text->empty())
                 _rows.push_back(
-                    {place, key, *text, static_cast<std::size_t>(known - std::begin(kIdentifyingRows))});
+                    {place, *known, *text, static_cast<std::size_t>(known - std::begin(kIdentifyingRows))});
         }
         ++place;
     }

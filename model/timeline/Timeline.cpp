@@ -110,14 +110,14 @@ private:
 
     Claim claim(std::unordered_map<std::string, TimelineNode>& nodes, const std::string& name)
     {
-        std::size_t& count = _counts[name];
-        while (true) {
-            std::string id = numbered(name, ++count);
+        const auto [first, isNewName] = nodes.try_emplace(name);
+        if (std::exchange(first->second.layout, _number) != _number)
+            return {first->second, isNewName, name};
+        for (std::size_t& count = _counts[name];;) {
+            std::string id = numbered(name, ++count + 1);
             const auto [found, isNew] = nodes.try_emplace(id);
-            if (found->second.layout != _number) {
-                found->second.layout = _number;
+            if (std::exchange(found->second.layout, _number) != _number)
                 return {found->second, isNew, std::move(id)};
-            }
         }
     }
 
@@ -125,7 +125,7 @@ private:
     TimelineBranch& _branch;
     std::size_t _number;
     std::vector<TimelineBranch::Place> _before;
-    std::unordered_map<std::string, std::size_t> _counts;
+    std::unordered_map<std::string, std::size_t> _counts; // of names after their first
 };
 
 } // namespace
