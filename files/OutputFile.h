@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cerrno>
 #include <cstdio>
 #include <memory>
 #include <streambuf>
@@ -43,16 +44,38 @@ public:
     {
     }
 
+    // The errno of the first write that failed; 0 if none did.
+    int error() const { return _error; }
+
 protected:
     std::streamsize xsputn(const char* text, std::streamsize length) override
     {
-        return static_cast<std::streamsize>(std::fwrite(text, 1, static_cast<std::size_t>(length), &_file));
+        const std::size_t written = std::fwrite(text, 1, static_cast<std::size_t>(length), &_file);
+        noteError(written == static_cast<std::size_t>(length));
+        return static_cast<std::streamsize>(written);
     }
-    int overflow(int character) override { return std::fputc(character, &_file); }
-    int sync() override { return std::fflush(&_file); }
+    int overflow(int character) override
+    {
+        const int written = std::fputc(character, &_file);
+        noteError(written != EOF);
+        return written;
+    }
+    int sync() override
+    {
+        const int status = std::fflush(&_file);
+        noteError(status == 0);
+        return status;
+    }
 
 private:
+    void noteError(bool isGood)
+    {
+        if (!isGood && _error == 0)
+            _error = errno;
+    }
+
     std::FILE& _file;
+    int _error = 0;
 };
 
 } // namespace orvex

@@ -6,14 +6,6 @@ namespace {
 
 constexpr std::string_view kRootPath = "/";
 
-std::string_view withoutSlashesAround(std::string_view name)
-{
-    const auto first = name.find_first_not_of('/');
-    if (first == std::string_view::npos)
-        return {};
-    return name.substr(first, name.find_last_not_of('/') - first + 1);
-}
-
 // The last node, at or below this one, whose path is the node's own path plus `rest`.
 OrvexModelNodeRef lastAt(const OrvexModelNodeRef& node, std::string_view rest, bool isAtRoot)
 {
@@ -50,7 +42,15 @@ OrvexModelNodeRef NodesByPath::operator[](std::string_view path) const
     return lastAt(_root, path.substr(kRootPath.size()), true);
 }
 
-std::string pathByAppending(const std::string& path, const std::string& component)
+std::string_view withoutSlashesAround(std::string_view name)
+{
+    const auto first = name.find_first_not_of('/');
+    if (first == std::string_view::npos)
+        return {};
+    return name.substr(first, name.find_last_not_of('/') - first + 1);
+}
+
+std::string pathByAppending(const std::string& path, std::string_view component)
 {
     const std::string_view name = withoutSlashesAround(component);
     if (name.empty())

@@ -28,7 +28,9 @@ private:
     OrvexModelNodeRef _root;
 };
 
+// What a display name adds to a path: the name without the "/" at both ends.
+std::string_view withoutSlashesAround(std::string_view name);
 // The path of a child with that display name.
-std::string pathByAppending(const std::string& path, const std::string& component);
+std::string pathByAppending(const std::string& path, std::string_view component);
 
 } // namespace orvex

@@ -33,9 +33,7 @@ public:
 
     // Builds the tree of a display dictionary (or of any other value) and fills the path dictionary with it.
     // The root is named "Orvex" and has the path "/".
-    //
-    // A dictionary that holds the key "_sorted" shows its keys in string order, and a key of the form
-    // "prefix;name" under its name. Values that are neither texts nor containers show as "(unknown)".
+    // Dictionaries are shown in their DisplayOrder.
     static OrvexModelNodeRef makeTreeFromObject(const Value& object, NodesByPath& pathDictionary);
 
 private:

@@ -1,5 +1,6 @@
 #include "CaptureDecoding.h"
 
+#include "CaptureSampler.h"
 #include "ReadAhead.h"
 
 #include "Snapshot.h"
@@ -54,12 +55,15 @@ FoundTechnology technologyOf(
 } // namespace
 
 CaptureDecoding::CaptureDecoding(
-    const DecodeOptions& options, Platform& platform, const TechnologyGuess& guess)
+    const DecodeOptions& options, Platform& platform, const TechnologyGuess& guess, TimelineOutput* timeline)
     : _options(options)
     , _platform(platform)
     , _guess(guess)
+    , _timeline(timeline)
 {
 }
+
+CaptureDecoding::~CaptureDecoding() = default;
 
 void CaptureDecoding::decodeAll()
 {
@@ -91,6 +95,10 @@ void CaptureDecoding::decode(DecodedCapture& capture, Progress& progress)
     }
     if (!beginSession(capture))
         return;
+    if (_timeline) {
+        feedSampled(capture, reader, progress);
+        return;
+    }
     feed(capture, reader, wouldEndSession(reader) ? nullptr : &*_session, progress);
     if (capture.hasFailed())
         return;
@@ -115,6 +123,8 @@ void CaptureDecoding::feed(
     capture.counts.emplace(_guess.kindsOf(capture.technology));
     CaptureReader::Status status = reader.next();
     for (; status == CaptureReader::Status::message; status = reader.next()) {
+        if (_sampler)
+            _sampler->take(reader.message(), reader.time());
         _platform.clock.setTime(reader.time());
         capture.counts->add(reader.message(), reader.time());
         if (session)
@@ -132,6 +142,32 @@ void CaptureDecoding::feed(
             addError(capture, text("%s (after %zu whole messages)", reason.c_str(), total.messages));
     }
     noteWrongTechnology(capture);
+}
+
+void CaptureDecoding::feedSampled(DecodedCapture& capture, PeekedCapture& reader, Progress& progress)
+{
+    if (wouldEndSession(reader)) {
+        fail(capture, "does not look like " + _technology);
+        return;
+    }
+    _timeline->begin(capture);
+    _sampler = std::make_unique<CaptureSampler>(_options.sampling, *_session, *_timeline);
+    feed(capture, reader, &*_session, progress);
+    const auto sampler = std::move(_sampler);
+    if (capture.hasFailed())
+        return;
+    if (!sampler->finish()) {
+        fail(capture, "no message has a time");
+        return;
+    }
+    if (const std::string note = sampler->clockNote(); !note.empty())
+        addNote(capture, note);
+    for (const std::string& path : sampler->missingFields())
+        addNote(capture, "nothing was shown at " + path);
+    _lastOfSession = _captures.size() - 1;
+    endSession();
+    if (const std::string error = _timeline->end(capture); !error.empty())
+        _isGood = printError(error);
 }
 
 void CaptureDecoding::noteWrongTechnology(DecodedCapture& capture)
@@ -154,7 +190,7 @@ void CaptureDecoding::noteWrongTechnology(DecodedCapture& capture)
 
 bool CaptureDecoding::beginSession(DecodedCapture& capture)
 {
-    if (_session && _technology == capture.technology)
+    if (_session && _technology == capture.technology && !_timeline)
         return true;
     if (_session && _options.snapshotFile) {
         fail(capture, "is of " + capture.technology + "; the snapshot is of " + _technology);

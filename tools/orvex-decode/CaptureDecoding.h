@@ -7,11 +7,15 @@
 #include "Platform.h"
 #include "Reporting.h"
 
+#include <memory>
 #include <optional>
 #include <string>
 #include <vector>
 
 namespace orvex {
+
+class CaptureSampler;
+class TimelineOutput;
 
 // What came of a capture.
 struct DecodedCapture {
@@ -27,11 +31,16 @@ struct DecodedCapture {
 };
 
 // Decodes captures one after the other. Captures of the same technology make one session; another technology
-// begins a new one. For a summary, counts their messages and decodes none.
+// begins a new one. For a summary, counts their messages and decodes none. For a timeline, each capture is a
+// session of its own.
 class CaptureDecoding {
 public:
-    // Prints errors and notes as they come up.
-    CaptureDecoding(const DecodeOptions& options, Platform& platform, const TechnologyGuess& guess);
+    // Prints errors and notes as they come up. The timeline is there if the options want one.
+    CaptureDecoding(const DecodeOptions& options, Platform& platform, const TechnologyGuess& guess,
+        TimelineOutput* timeline = nullptr);
+    ~CaptureDecoding();
+    CaptureDecoding(const CaptureDecoding&) = delete;
+    CaptureDecoding& operator=(const CaptureDecoding&) = delete;
 
     void decodeAll();
     // Saves the session, of which there is one at most, in the options' snapshot file.
@@ -46,6 +55,7 @@ private:
     bool wouldEndSession(PeekedCapture& capture) const;
     // A null session gets nothing; the messages are counted.
     void feed(DecodedCapture& capture, CaptureReader& reader, OfflineSession* session, Progress& progress);
+    void feedSampled(DecodedCapture& capture, PeekedCapture& reader, Progress& progress);
     void noteWrongTechnology(DecodedCapture& capture);
     bool beginSession(DecodedCapture& capture);
     void endSession();
@@ -56,6 +66,8 @@ private:
     const DecodeOptions& _options;
     Platform& _platform;
     const TechnologyGuess& _guess;
+    TimelineOutput* _timeline;
+    std::unique_ptr<CaptureSampler> _sampler; // of the capture that is fed, if it is sampled
     std::vector<DecodedCapture> _captures;
     std::optional<OfflineSession> _session;
     std::string _technology;                   // the session's

@@ -11,7 +11,10 @@ namespace orvex {
 
 namespace {
 
-CommandLine::Program program()
+// What shows captures over time, instead of printing a document.
+constexpr const char* kSampled[] = {"timeline"};
+
+CommandLine::Program baseProgram()
 {
     return {
         .name = "orvex-decode",
@@ -41,6 +44,16 @@ CommandLine::Program program()
                     "Also ask for the display after every N messages, as a session does every two seconds. "
                     "Default: only at the end.",
                     "N"},
+                {"timeline",
+                    "Instead of the tree, write to FILE.csv which rows changed when, by the clock of the "
+                    "capture: time, path, key, text, number and unit.",
+                    "FILE.csv"},
+                {"every", "With --timeline: look at the display every SECONDS, at least 0.1. Default: 2.",
+                    "SECONDS"},
+                {"field",
+                    "With --timeline: follow only this row or branch; '*' stands for one component: "
+                    "'/Neighbor Cells List/*/Measured RSRP'. May be given more than once.",
+                    "PATH", true},
                 {"output", "Print to FILE.", "FILE"},
                 {"quiet",
                     "On standard error, print errors only: no notes, no progress. With --diff, print no "
@@ -60,6 +73,16 @@ CommandLine::Program program()
             "Captures or snapshots (.orvex), not both. A capture is a DLF file or a pcap file with link type "
             "147 (USER0), one log message per packet; gzip and xz are undone.",
     };
+}
+
+CommandLine::Program program()
+{
+    CommandLine::Program result = baseProgram();
+    for (const char* option : kSampled) {
+        for (const char* other : {"output", "format", "path", "refresh-every", "summary", "diff", "snapshot"})
+            result.exclusions.push_back({option, other});
+    }
+    return result;
 }
 
 // A property list, or whatever is named like a snapshot.
@@ -103,7 +126,7 @@ std::string readInputs(const CommandLine& line, DecodeOptions& options)
     if (areSnapshots)
         options.task = DecodeOptions::Task::showSnapshots;
 
-    for (const char* option : {"snapshot", "refresh-every", "summary"}) {
+    for (const char* option : {"snapshot", "refresh-every", "summary", "timeline"}) {
         if (areSnapshots && line.isSet(option))
             return "--" + std::string(option) + " goes with captures.";
     }
@@ -112,6 +135,25 @@ std::string readInputs(const CommandLine& line, DecodeOptions& options)
     if (line.isSet("dlf") && (!areSnapshots || options.inputs.size() != 1))
         return "--dlf goes with one snapshot.";
     return {};
+}
+
+std::string readSampling(const CommandLine& line, DecodeOptions& options)
+{
+    const bool isSampled =
+        std::ranges::any_of(kSampled, [&](const char* option) { return line.isSet(option); });
+    for (const char* option : {"every", "field"}) {
+        if (line.isSet(option) && !isSampled)
+            return "--" + std::string(option) + " goes with --timeline.";
+    }
+    if (!isSampled)
+        return {};
+    options.task = DecodeOptions::Task::sample;
+    options.timelineFile = line.value("timeline");
+    if (options.timelineFile == kStandardStream)
+        options.timelineFile = "/dev/stdout";
+    if (options.inputs.size() > 1)
+        return "--timeline goes with one capture.";
+    return options.sampling.read(line.value("every"), line.values("field"));
 }
 
 std::string readDecoding(const CommandLine& line, DecodeOptions& options)
@@ -164,7 +206,7 @@ DecodeOptions DecodeOptions::parse(int count, const char* const* arguments)
     DecodeOptions result;
     CommandLine line(program());
     result.earlyExit = line.parse(count, arguments);
-    for (const auto read : {&readInputs, &readDecoding, &readPrinting}) {
+    for (const auto read : {&readInputs, &readSampling, &readDecoding, &readPrinting}) {
         if (result.earlyExit)
             break;
         if (const std::string error = read(line, result); !error.empty())

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CommandLine.h"
+#include "Sampling.h"
 
 #include <cstddef>
 #include <optional>
@@ -14,7 +15,7 @@ inline constexpr const char* kStandardStream = "-";
 
 // What the user asked of the decoder.
 struct DecodeOptions {
-    enum class Task { decode, summarize, showSnapshots, compareSnapshots };
+    enum class Task { decode, sample, summarize, showSnapshots, compareSnapshots };
     enum class Format { tree, json };
 
     // The arguments as the program got them, its own name first.
@@ -29,6 +30,7 @@ struct DecodeOptions {
     std::string path = "/";               // of the part of each display to print
     bool isQuiet = false;                 // no notes, no progress
     std::size_t refreshEvery = 0;         // messages; 0 asks for the display only at the end
+    Sampling sampling;                    // of the display over time
     std::optional<std::string> resources; // absent: the default directory
 
     // Where outputs go; "-" has become /dev/stdout.
@@ -37,6 +39,7 @@ struct DecodeOptions {
     std::optional<std::string> snapshotFile; // where to save the session; captures only
     std::string description;                 // the user's words in the snapshot
     std::optional<std::string> dlfFile;      // where the binary log of a snapshot goes
+    std::optional<std::string> timelineFile;
 };
 
 } // namespace orvex

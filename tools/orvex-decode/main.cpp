@@ -8,6 +8,7 @@
 #include "Reporting.h"
 #include "SnapshotDiff.h"
 #include "SnapshotDocument.h"
+#include "TimelineOutputs.h"
 
 #include "LinuxSystemLog.h"
 #include "Process.h"
@@ -40,13 +41,14 @@ std::string conflictOf(const DecodeOptions& options)
         inputs.push_back({"the template " + name, std::filesystem::path(resources) / name});
 
     std::vector<FileInUse> outputs;
-    if (!options.outputFile)
+    if (!options.outputFile && options.task != DecodeOptions::Task::sample)
         outputs.push_back({"standard output", "/dev/stdout"});
     const std::pair<const char*, const std::optional<std::string>*> files[] = {
         {"--output ", &options.outputFile},
         {"--log ", &options.logFile},
         {"--snapshot ", &options.snapshotFile},
         {"--dlf ", &options.dlfFile},
+        {"--timeline ", &options.timelineFile},
     };
     for (const auto& [option, path] : files) {
         if (*path)
@@ -71,6 +73,18 @@ int decodeCaptures(const DecodeOptions& options, Platform& platform, const Techn
         isGood = decoding.isGood() && isGood;
     }
     return isGood ? 0 : kFailure;
+}
+
+int sampleCaptures(const DecodeOptions& options, Platform& platform, const TechnologyGuess& guess)
+{
+    TimelineOutputs outputs(options);
+    if (!outputs.error().empty()) {
+        printError(outputs.error());
+        return kFailure;
+    }
+    CaptureDecoding decoding(options, platform, guess, &outputs);
+    decoding.decodeAll();
+    return decoding.isGood() ? 0 : kFailure;
 }
 
 int summarizeCaptures(const DecodeOptions& options, Platform& platform, const TechnologyGuess& guess)
@@ -177,6 +191,7 @@ int perform(const DecodeOptions& options, Platform& platform, const TechnologyGu
 {
     switch (options.task) {
     case DecodeOptions::Task::decode: return decodeCaptures(options, platform, guess);
+    case DecodeOptions::Task::sample: return sampleCaptures(options, platform, guess);
     case DecodeOptions::Task::summarize: return summarizeCaptures(options, platform, guess);
     case DecodeOptions::Task::showSnapshots: return showSnapshots(options, platform);
     case DecodeOptions::Task::compareSnapshots: return compareSnapshots(options);
