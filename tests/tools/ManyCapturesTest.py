@@ -134,7 +134,7 @@ def decode_on(hosts, work, environment):
 def contents(database):
     connection = sqlite3.connect(f"file:{database}?mode=ro", uri=True)
     return [connection.execute(f"SELECT * FROM {table}").fetchall()
-            for table in ("captures ORDER BY id", "paths ORDER BY id", "samples ORDER BY capture, n")]
+            for table in ("captures ORDER BY id", "paths ORDER BY id", "samples ORDER BY path, capture, n")]
 
 
 def check(folder):

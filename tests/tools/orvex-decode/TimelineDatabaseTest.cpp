@@ -128,7 +128,8 @@ TEST_F(TimelineDatabaseTest, MergesDatabases)
     EXPECT_THAT(merged.errors,
         HasSubstr("two?%.sqlite: 1 of 3 captures are in " + path("all.sqlite") + " already\n"));
     ASSERT_EQ(add(captures, "together.sqlite").status, 0);
-    for (const char* table : {"captures ORDER BY id", "paths ORDER BY id", "samples ORDER BY capture, n"}) {
+    for (const char* table :
+        {"captures ORDER BY id", "paths ORDER BY id", "samples ORDER BY path, capture, n"}) {
         const std::string sql = std::string("SELECT * FROM ") + table;
         EXPECT_EQ(all(sql), query(path("together.sqlite"), sql));
     }

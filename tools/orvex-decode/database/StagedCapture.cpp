@@ -12,14 +12,16 @@ namespace orvex {
 
 namespace {
 
-// The tables, but the capture's identity is known only at the end.
+// The tables, but samples are kept as they come, and the capture's identity is known only at the end.
 SqliteConnection makeStage()
 {
     SqliteConnection connection;
     timeline_schema::makeTables(connection, "main");
     connection.execute(R"(
-        ALTER TABLE samples RENAME TO staged;
-        CREATE VIEW samples AS SELECT (SELECT id FROM captures) AS capture, n, time, path, text, number, unit FROM staged;
+        DROP TABLE samples;
+        CREATE TABLE staged (n INTEGER PRIMARY KEY, time REAL, path INTEGER, text TEXT, number REAL, unit TEXT);
+        CREATE VIEW samples AS
+            SELECT path, (SELECT id FROM captures) AS capture, n, time, text, number, unit FROM staged;
         BEGIN)");
     return connection;
 }
@@ -29,7 +31,7 @@ SqliteConnection makeStage()
 StagedCapture::StagedCapture()
     : _connection(makeStage())
     , _addPath(_connection, "INSERT INTO paths VALUES (?, ?, ?)")
-    , _addSample(_connection, "INSERT INTO staged VALUES (0, ?, ?, ?, ?, ?, ?)")
+    , _addSample(_connection, "INSERT INTO staged VALUES (?, ?, ?, ?, ?, ?)")
 {
 }
 

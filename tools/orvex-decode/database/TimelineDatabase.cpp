@@ -28,15 +28,16 @@ CREATE TEMP TABLE chosen AS SELECT id FROM main.captures AS new WHERE NOT EXISTS
     AND old.every = new.every AND old.fields = new.fields AND old.version = new.version))";
 
 constexpr const char* kReplace = R"(
-DELETE FROM target.samples WHERE capture IN temp.chosen;
+DELETE FROM target.samples WHERE path IN (SELECT id FROM target.paths) AND capture IN temp.chosen;
 DELETE FROM target.captures WHERE id IN temp.chosen)";
 
+// Samples are added in the order of their table: otherwise SQLite goes back to a page for nearly every row.
 constexpr const char* kAdd = R"(
 INSERT OR IGNORE INTO target.paths SELECT * FROM main.paths;
-INSERT INTO target.samples SELECT * FROM main.samples WHERE capture IN temp.chosen;
+INSERT INTO target.samples SELECT * FROM main.samples WHERE capture IN temp.chosen ORDER BY path, capture, n;
 INSERT INTO target.captures SELECT * FROM main.captures WHERE id IN temp.chosen)";
 
-// Without statistics, SQLite reads a whole capture for one of its rows.
+// Without statistics, SQLite reads the whole table for a capture and a whole capture for one of its rows.
 constexpr const char* kAnalyze = "PRAGMA analysis_limit = 1000; ANALYZE target";
 
 std::string systemError()
@@ -73,7 +74,7 @@ Taken move(SqliteConnection& source)
         return {.error = fault};
     if (timeline_schema::isEmpty(source, "target")) {
         timeline_schema::makeTables(source, "target");
-        timeline_schema::makeIndexes(source, "target");
+        timeline_schema::finish(source, "target");
     }
     source.execute(kChoose);
     source.execute(kReplace);

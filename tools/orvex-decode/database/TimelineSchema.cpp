@@ -27,18 +27,16 @@ constexpr const char* kTables[] = {
     UNIQUE (path, key)
 ))",
     R"(samples (
+    path INTEGER NOT NULL REFERENCES paths,
     capture INTEGER NOT NULL REFERENCES captures,
     n INTEGER NOT NULL,       -- counts the changes within the capture
     time REAL NOT NULL,       -- seconds since 1970 UTC
-    path INTEGER NOT NULL REFERENCES paths,
     text TEXT,                -- NULL: no longer shown
     number REAL,              -- NULL unless the text is a quantity
     unit TEXT,
-    PRIMARY KEY (capture, n)
+    PRIMARY KEY (path, capture, n)
 ) WITHOUT ROWID)",
 };
-
-constexpr const char* kIndex = "samples_by_path ON samples (path, capture, time)";
 
 constexpr const char* kView = R"(timeline AS
 SELECT c.id AS capture, c.name, c.technology, s.n,
@@ -55,10 +53,9 @@ bool makeTables(SqliteConnection& connection, const std::string& schema)
     return connection.isGood();
 }
 
-bool makeIndexes(SqliteConnection& connection, const std::string& schema)
+bool finish(SqliteConnection& connection, const std::string& schema)
 {
-    return connection.execute("CREATE INDEX " + schema + "." + kIndex)
-        && connection.execute("CREATE VIEW " + schema + "." + kView)
+    return connection.execute("CREATE VIEW " + schema + "." + kView)
         && connection.execute("PRAGMA " + schema + ".application_id = " + std::to_string(kApplication))
         && connection.execute("PRAGMA " + schema + ".user_version = " + std::to_string(kVersion));
 }

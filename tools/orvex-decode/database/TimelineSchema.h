@@ -12,8 +12,8 @@ namespace timeline_schema {
 
 // Makes the tables of a connection's schema.
 bool makeTables(SqliteConnection& connection, const std::string& schema);
-// Makes what finding and reading takes, and marks the database.
-bool makeIndexes(SqliteConnection& connection, const std::string& schema);
+// Makes the view and marks the database.
+bool finish(SqliteConnection& connection, const std::string& schema);
 
 // True if the schema has no tables at all.
 bool isEmpty(SqliteConnection& connection, const std::string& schema);
