@@ -184,6 +184,9 @@ TEST_F(TimelineDatabaseTest, LeavesTheFileAsItWasAfterAFault)
         EXPECT_EQ(std::ranges::count(result.errors, '\n'), 1) << result.errors;
         EXPECT_EQ(contentsOf(file), before) << error;
     }
+    const Result result = decode({"--resources", name("nowhere"), "--timeline", name("new.sqlite"), lte});
+    EXPECT_EQ(result.status, 1);
+    EXPECT_THAT(result.errors, HasSubstr("nowhere/LTE.plist: No such file or directory\n"));
     EXPECT_EQ(files("new"), std::vector<std::string>{"newer.sqlite"});
 }
 
