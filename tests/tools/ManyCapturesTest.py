@@ -104,13 +104,13 @@ def documented_commands():
     """The first commands under the heading."""
     section = (source / "docs/many-captures.md").read_text().split("\n## Several machines\n")[1]
     commands = section[section.index("\n\n    ") + 2:].split("\n\n")[0]
-    assert commands.startswith("    parallel --sshloginfile hosts "), commands
-    return "set -e\n" + textwrap.dedent(commands)
+    assert "--sshloginfile hosts " in commands, commands
+    return textwrap.dedent(commands)
 
 
 def jobs_done(log):
     """The host of each."""
-    jobs = [line.split("\t") for line in log.read_text().splitlines()[1:]] if log.exists() else []
+    jobs = [line.split("\t") for line in log.read_text().splitlines()] if log.exists() else []
     return [job[1].rpartition("/")[2] for job in jobs if job[6] == "0"]
 
 
@@ -150,7 +150,7 @@ def check(folder):
                        ORVEX_RESOURCES=f"{source}/resources")
     decode_on(hosts, work, environment)
     captures, paths, samples = contents(work / "all.sqlite")
-    assert sorted(row[1] for row in captures) == names and len(names) == 40, captures
+    assert sorted(row[1] for row in captures) == names and len(names) == 40, set(names) - {row[1] for row in captures}
     subprocess.run([decoder, "--timeline", "one.sqlite", *names], cwd=work, env=environment, check=True)
     assert [captures, paths, samples] == contents(work / "one.sqlite"), "not what one process finds"
     assert len(samples) > 1000
