@@ -155,6 +155,12 @@ TEST_F(TimelineDatabaseTest, LeavesTheFileAsItWasAfterAFault)
     ASSERT_EQ(add({lte}, "good.sqlite").status, 0);
     std::filesystem::copy(path("good.sqlite"), path("newer.sqlite"));
     query(path("newer.sqlite"), "PRAGMA user_version = 2");
+    std::filesystem::copy(path("good.sqlite"), path("half.sqlite"));
+    std::filesystem::resize_file(path("half.sqlite"), std::filesystem::file_size(path("half.sqlite")) / 2);
+    std::filesystem::copy(path("good.sqlite"), path("damaged.sqlite"));
+    std::fstream damaged(path("damaged.sqlite"), std::ios::in | std::ios::out | std::ios::binary);
+    damaged.seekp(100'000);
+    damaged << std::string(200'000, 'x') << std::flush;
     std::ofstream(path("none.sqlite")) << std::string(5000, 'x');
     std::ofstream(path("other.sqlite"));
     query(path("other.sqlite"), "CREATE TABLE captures (x)");
@@ -169,11 +175,13 @@ TEST_F(TimelineDatabaseTest, LeavesTheFileAsItWasAfterAFault)
             "newer.sqlite: has version 2 of the tables; this orvex-decode knows version 1\n"},
         {"none.sqlite", lte, "none.sqlite: file is not a database\n"},
         {"other.sqlite", lte, "other.sqlite: is not a database of timelines\n"},
+        {"half.sqlite", name("MRL_GSM.pcap"), "half.sqlite: database disk image is malformed\n"},
         {"nowhere/new.sqlite", lte, "nowhere/new.sqlite: No such file or directory\n"},
         {"good.sqlite", name("broken.pcap"), "broken.pcap: "},
         {"new.sqlite", name("broken.pcap"), "broken.pcap: "},
         {"good.sqlite", name("other.sqlite"), "other.sqlite: is not a database of timelines\n"},
         {"good.sqlite", name("missing.sqlite"), "missing.sqlite: unable to open database file: No such file"},
+        {"new.sqlite", name("damaged.sqlite"), "damaged.sqlite: not added to "},
         {"new.sqlite", name("none.sqlite"), "none.sqlite: file is not a database\n"},
     };
     for (const auto& [file, input, error] : cases) {

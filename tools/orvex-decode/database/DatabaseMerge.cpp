@@ -17,7 +17,7 @@ bool add(const std::string& input, const TimelineDatabase& database, const Decod
         return printError(input + ": " + fault);
     const TimelineDatabase::Taken taken = database.take(source);
     if (!taken.error.empty())
-        return printError(*options.timelineFile + ": " + taken.error);
+        return printError(input + ": not added to " + *options.timelineFile + ": " + taken.error);
     if (taken.known > 0)
         printNote(text("%s: %zu of %zu captures are in %s already", input.c_str(), taken.known,
                       taken.known + taken.added, options.timelineFile->c_str()),

@@ -54,8 +54,8 @@ std::string DatabaseOutput::end(const DecodedCapture& capture)
     SqliteConnection& staged = _staged->finish({.id = _hash.value(),
         .name = capture.path == kStandardStream ? "standard input" : capture.path,
         .technology = capture.technology,
-        .first = *_first, // a capture without times has failed
-        .last = *_last,
+        .first = _first.value_or(Date{}), // a capture without times has failed
+        .last = _last.value_or(Date{}),
         .messages = capture.counts->total().messages,
         .every = std::chrono::duration<double>(_options.sampling.every).count(),
         .fields = textOf(_options.sampling.fields)});

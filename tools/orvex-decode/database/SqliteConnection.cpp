@@ -61,6 +61,7 @@ void SqliteConnection::open(const std::string& name)
         fail();
     else
         sqlite3_busy_timeout(connection, kPatience);
+    execute("PRAGMA trusted_schema = OFF"); // a database may come from elsewhere
 }
 
 bool SqliteConnection::execute(const std::string& statements)

@@ -17,11 +17,11 @@ struct CloseSqlite {
     void operator()(sqlite3_stmt* statement) const;
 };
 
-// A connection to an SQLite database, the schema "main", and to whatever is attached to it. After an error
-// nothing more is done: callers ask for the error when they are through.
+// A connection to an SQLite database, the schema "main", and to what is attached beside it. After an error it
+// does nothing more, so callers may ask for the error at the end.
 class SqliteConnection {
 public:
-    // A database of the connection's own, which spills to a file for temporary data ($SQLITE_TMPDIR) and goes
+    // A database of the connection's own, which spills to a temporary file (in $SQLITE_TMPDIR) and is deleted
     // with the connection.
     SqliteConnection();
     // An existing database, which is only read. What is attached can be written.

@@ -110,15 +110,7 @@ TimelineDatabase::TimelineDatabase(const std::string& path)
 {
     const LinkEnd end = followLinks(path, FollowedLinks::trusted);
     _path = std::filesystem::absolute(end.path); // neither a URI nor a name special to SQLite
-    struct stat status { };
-    if (!end.error.empty())
-        _fault = end.error;
-    else if (::stat(_path.c_str(), &status) != 0)
-        return;
-    else if (!S_ISREG(status.st_mode))
-        _fault = "is not a regular file";
-    else if (status.st_uid != ::geteuid())
-        _fault = "belongs to another user";
+    _fault = end.error;
 }
 
 std::string TimelineDatabase::fault() const
@@ -129,20 +121,30 @@ std::string TimelineDatabase::fault() const
         const std::string directory = std::filesystem::path(_path).parent_path();
         return ::access(directory.c_str(), W_OK | X_OK) == 0 ? "" : systemError();
     }
+    if (const std::string fault = faultOfFile(); !fault.empty())
+        return fault;
     SqliteConnection connection;
-    const std::string fault = attach(connection, _path) ? faultOfTarget(connection) : connection.error();
-    return fault.empty() && ::access(_path.c_str(), W_OK) != 0 ? systemError() : fault;
+    return attach(connection, _path) ? faultOfTarget(connection) : connection.error();
+}
+
+std::string TimelineDatabase::faultOfFile() const
+{
+    struct stat status { };
+    if (::stat(_path.c_str(), &status) != 0 || ::access(_path.c_str(), W_OK) != 0)
+        return systemError();
+    if (!S_ISREG(status.st_mode))
+        return "is not a regular file";
+    return status.st_uid == ::geteuid() ? "" : "belongs to another user";
 }
 
 Taken TimelineDatabase::take(SqliteConnection& source) const
 {
-    if (!_fault.empty())
-        return {.error = _fault};
     while (!exists()) {
         if (const std::optional<Taken> taken = create(source))
             return *taken;
     }
-    return moveInto(source, _path);
+    const std::string fault = faultOfFile(); // another process may have made it
+    return fault.empty() ? moveInto(source, _path) : Taken{.error = fault};
 }
 
 std::optional<Taken> TimelineDatabase::create(SqliteConnection& source) const

@@ -25,16 +25,18 @@ public:
         std::string error;        // why nothing changed; empty if all went well
     };
     // Adds the captures of the schema "main", all of them or none. A new file, readable by its owner only,
-    // gets its name when it is whole.
+    // gets its name when it is whole. Called when there is no fault.
     Taken take(SqliteConnection& source) const;
 
 private:
     // None when another process has made the file meanwhile.
     std::optional<Taken> create(SqliteConnection& source) const;
     bool exists() const;
+    // Why an existing file must not be touched.
+    std::string faultOfFile() const;
 
-    std::string _path;
-    std::string _fault;
+    std::string _path;  // behind links
+    std::string _fault; // of the links
 };
 
 } // namespace orvex
