@@ -199,6 +199,10 @@ bool CaptureDecoding::beginSession(DecodedCapture& capture)
     endSession();
     auto generator = _platform.generatorFor(capture.technology);
     if (const std::string error = generator->templateError({}); !error.empty()) {
+        if (_timeline) { // which would say that nothing was shown
+            fail(capture, error);
+            return false;
+        }
         capture.errors.push_back(error);
         _isGood = printError(error);
     }

@@ -46,8 +46,9 @@ CommandLine::Program baseProgram()
                     "N"},
                 {"timeline",
                     "Instead of the tree, write to FILE.csv which rows changed when, by the clock of the "
-                    "capture: time, path, key, text, number and unit.",
-                    "FILE.csv"},
+                    "capture: time, path, key, text, number and unit. Or add that to the SQLite database "
+                    "FILE.sqlite, where each of the captures is once, however often it is added.",
+                    "FILE.csv|FILE.sqlite"},
                 {"every", "With --timeline: look at the display every SECONDS, at least 0.1. Default: 2.",
                     "SECONDS"},
                 {"field",
@@ -71,7 +72,9 @@ CommandLine::Program baseProgram()
         .argumentsSyntax = "INPUT...",
         .argumentsDescription =
             "Captures or snapshots (.orvex), not both. A capture is a DLF file or a pcap file with link type "
-            "147 (USER0), one log message per packet; gzip and xz are undone.",
+            "147 (USER0), one log message per packet; gzip and xz are undone. Databases of timelines "
+            "(.sqlite) "
+            "are merged into that of --timeline.",
     };
 }
 
@@ -83,6 +86,24 @@ CommandLine::Program program()
             result.exclusions.push_back({option, other});
     }
     return result;
+}
+
+// Sets the task if the inputs are databases.
+std::string readDatabases(const CommandLine& line, DecodeOptions& options)
+{
+    const auto databases = std::ranges::count_if(options.inputs, isDatabaseFile);
+    if (databases == 0)
+        return {};
+    if (databases < std::ssize(options.inputs))
+        return "Databases cannot be combined with other inputs.";
+    if (!isDatabaseFile(line.value("timeline").value_or("")))
+        return "Databases go with --timeline FILE.sqlite.";
+    for (const char* option : {"every", "field", "technology"}) {
+        if (line.isSet(option))
+            return "--" + std::string(option) + " goes with captures.";
+    }
+    options.task = DecodeOptions::Task::mergeDatabases;
+    return {};
 }
 
 // A property list, or whatever is named like a snapshot.
@@ -151,8 +172,8 @@ std::string readSampling(const CommandLine& line, DecodeOptions& options)
     options.timelineFile = line.value("timeline");
     if (options.timelineFile == kStandardStream)
         options.timelineFile = "/dev/stdout";
-    if (options.inputs.size() > 1)
-        return "--timeline goes with one capture.";
+    if (options.inputs.size() > 1 && !isDatabaseFile(*options.timelineFile))
+        return "--timeline FILE.csv goes with one capture.";
     return options.sampling.read(line.value("every"), line.values("field"));
 }
 
@@ -201,12 +222,17 @@ std::string readPrinting(const CommandLine& line, DecodeOptions& options)
 
 } // namespace
 
+bool isDatabaseFile(const std::string& path)
+{
+    return path.ends_with(".sqlite") || path.ends_with(".sqlite3") || path.ends_with(".db");
+}
+
 DecodeOptions DecodeOptions::parse(int count, const char* const* arguments)
 {
     DecodeOptions result;
     CommandLine line(program());
     result.earlyExit = line.parse(count, arguments);
-    for (const auto read : {&readInputs, &readSampling, &readDecoding, &readPrinting}) {
+    for (const auto read : {&readInputs, &readSampling, &readDatabases, &readDecoding, &readPrinting}) {
         if (result.earlyExit)
             break;
         if (const std::string error = read(line, result); !error.empty())

@@ -13,9 +13,12 @@ namespace orvex {
 // The name of standard input among the inputs.
 inline constexpr const char* kStandardStream = "-";
 
+// True for the name of an SQLite database.
+bool isDatabaseFile(const std::string& path);
+
 // What the user asked of the decoder.
 struct DecodeOptions {
-    enum class Task { decode, sample, summarize, showSnapshots, compareSnapshots };
+    enum class Task { decode, sample, summarize, showSnapshots, compareSnapshots, mergeDatabases };
     enum class Format { tree, json };
 
     // The arguments as the program got them, its own name first.
@@ -24,7 +27,7 @@ struct DecodeOptions {
     std::optional<CommandLine::EarlyExit> earlyExit; // instead of decoding; nothing else is valid then
 
     Task task = Task::decode;
-    std::vector<std::string> inputs; // captures, or snapshots for the last two tasks
+    std::vector<std::string> inputs; // captures, or what the task names
     std::string technology;          // empty to guess that of captures, and not to decode snapshots
     Format format = Format::tree;
     std::string path = "/";               // of the part of each display to print

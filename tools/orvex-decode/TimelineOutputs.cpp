@@ -1,13 +1,16 @@
 #include "TimelineOutputs.h"
 
 #include "CsvOutput.h"
+#include "database/DatabaseOutput.h"
 
 namespace orvex {
 
 TimelineOutputs::TimelineOutputs(const DecodeOptions& options)
 {
     // Each is made with the error to set, and says nothing if another failed before.
-    if (options.timelineFile)
+    if (options.timelineFile && isDatabaseFile(*options.timelineFile))
+        _outputs.push_back(std::make_unique<DatabaseOutput>(options, _error));
+    else if (options.timelineFile)
         _outputs.push_back(std::make_unique<CsvOutput>(*options.timelineFile, _error));
 }
 

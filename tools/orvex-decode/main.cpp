@@ -9,6 +9,7 @@
 #include "SnapshotDiff.h"
 #include "SnapshotDocument.h"
 #include "TimelineOutputs.h"
+#include "database/DatabaseMerge.h"
 
 #include "LinuxSystemLog.h"
 #include "Process.h"
@@ -41,7 +42,8 @@ std::string conflictOf(const DecodeOptions& options)
         inputs.push_back({"the template " + name, std::filesystem::path(resources) / name});
 
     std::vector<FileInUse> outputs;
-    if (!options.outputFile && options.task != DecodeOptions::Task::sample)
+    if (!options.outputFile && options.task != DecodeOptions::Task::sample
+        && options.task != DecodeOptions::Task::mergeDatabases)
         outputs.push_back({"standard output", "/dev/stdout"});
     const std::pair<const char*, const std::optional<std::string>*> files[] = {
         {"--output ", &options.outputFile},
@@ -195,6 +197,7 @@ int perform(const DecodeOptions& options, Platform& platform, const TechnologyGu
     case DecodeOptions::Task::summarize: return summarizeCaptures(options, platform, guess);
     case DecodeOptions::Task::showSnapshots: return showSnapshots(options, platform);
     case DecodeOptions::Task::compareSnapshots: return compareSnapshots(options);
+    case DecodeOptions::Task::mergeDatabases: return mergeDatabases(options) ? 0 : kFailure;
     }
     return kFailure;
 }

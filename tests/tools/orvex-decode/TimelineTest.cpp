@@ -216,7 +216,7 @@ TEST_F(TimelineTest, RefusesWhatItWouldIgnore)
         {{"--timeline", "x.csv", "--every", "0.05"}, "--every takes seconds, from 0.1 to 86400."},
         {{"--timeline", "x.csv", "--every", "2s"}, "--every takes seconds, from 0.1 to 86400."},
         {{"--timeline", "x.csv", "--field", "Level"}, "--field takes a path that begins with '/'."},
-        {{"--timeline", "x.csv", capture}, "--timeline goes with one capture."},
+        {{"--timeline", "x.csv", capture}, "--timeline FILE.csv goes with one capture."},
     };
     for (const auto& [arguments, error] : cases) {
         const Result result = decode(QStringList{capture} << arguments);
