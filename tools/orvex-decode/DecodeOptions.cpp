@@ -12,7 +12,7 @@ namespace orvex {
 namespace {
 
 // What shows captures over time, instead of printing a document.
-constexpr const char* kSampled[] = {"timeline"};
+constexpr const char* kSampled[] = {"timeline", "report"};
 
 CommandLine::Program baseProgram()
 {
@@ -48,10 +48,19 @@ CommandLine::Program baseProgram()
                     "Instead of the tree, write to FILE.csv which rows changed when, by the clock of the "
                     "capture: time, path, key, text, number and unit.",
                     "FILE.csv"},
-                {"every", "With --timeline: look at the display every SECONDS, at least 0.1. Default: 2.",
+                {"report",
+                    "Instead of the tree, write to FILE.html a page of its own that any browser opens: plots "
+                    "of "
+                    "the levels over time, serving cells, neighbours, contexts, log codes and the last "
+                    "display.",
+                    "FILE.html"},
+                {"every",
+                    "With --timeline or --report: look at the display every SECONDS, at least 0.1. Default: "
+                    "2.",
                     "SECONDS"},
                 {"field",
-                    "With --timeline: follow only this row or branch; '*' stands for one component: "
+                    "With --timeline or --report: follow only this row or branch; '*' stands for one "
+                    "component: "
                     "'/Neighbor Cells List/*/Measured RSRP'. May be given more than once.",
                     "PATH", true},
                 {"output", "Print to FILE.", "FILE"},
@@ -126,7 +135,7 @@ std::string readInputs(const CommandLine& line, DecodeOptions& options)
     if (areSnapshots)
         options.task = DecodeOptions::Task::showSnapshots;
 
-    for (const char* option : {"snapshot", "refresh-every", "summary", "timeline"}) {
+    for (const char* option : {"snapshot", "refresh-every", "summary", "timeline", "report"}) {
         if (areSnapshots && line.isSet(option))
             return "--" + std::string(option) + " goes with captures.";
     }
@@ -143,7 +152,7 @@ std::string readSampling(const CommandLine& line, DecodeOptions& options)
         std::ranges::any_of(kSampled, [&](const char* option) { return line.isSet(option); });
     for (const char* option : {"every", "field"}) {
         if (line.isSet(option) && !isSampled)
-            return "--" + std::string(option) + " goes with --timeline.";
+            return "--" + std::string(option) + " goes with --timeline or --report.";
     }
     if (!isSampled)
         return {};
@@ -151,8 +160,11 @@ std::string readSampling(const CommandLine& line, DecodeOptions& options)
     options.timelineFile = line.value("timeline");
     if (options.timelineFile == kStandardStream)
         options.timelineFile = "/dev/stdout";
+    options.reportFile = line.value("report");
+    if (options.reportFile == kStandardStream)
+        options.reportFile = "/dev/stdout";
     if (options.inputs.size() > 1)
-        return "--timeline goes with one capture.";
+        return std::string(options.timelineFile ? "--timeline" : "--report") + " goes with one capture.";
     return options.sampling.read(line.value("every"), line.values("field"));
 }
 

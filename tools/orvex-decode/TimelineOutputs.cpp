@@ -1,6 +1,7 @@
 #include "TimelineOutputs.h"
 
 #include "CsvOutput.h"
+#include "ReportOutput.h"
 
 namespace orvex {
 
@@ -9,6 +10,9 @@ TimelineOutputs::TimelineOutputs(const DecodeOptions& options)
     // Each is made with the error to set, and says nothing if another failed before.
     if (options.timelineFile)
         _outputs.push_back(std::make_unique<CsvOutput>(*options.timelineFile, _error));
+    if (options.reportFile)
+        _outputs.push_back(
+            std::make_unique<ReportOutput>(*options.reportFile, options.sampling.every, _error));
 }
 
 void TimelineOutputs::begin(const DecodedCapture& capture)
