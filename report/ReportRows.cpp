@@ -137,7 +137,7 @@ const ReportRows& cdma()
 const ReportRows& ifx()
 {
     static const ReportRows rows{
-        .technologyName = "Baseband’s own layout",
+        .technologyName = "IFX",
         .servingCells = {{"Serving cell",
             {{"cell", "/Serving Cell/Cell"}, {"carrier", "/Serving Cell/Carrier"},
                 {"", "/Serving Cell/Technology"}},
