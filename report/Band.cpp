@@ -22,12 +22,10 @@ void Band::writeJson(JsonWriter& json) const
     json.boolean(_isCell);
     json.member("omitted", _omitted);
     json.key("times");
-    json.setCompact(true);
     json.beginArray();
     for (const Change& change : _changes)
         json.number(static_cast<std::size_t>(change.position));
     json.endArray();
-    json.setCompact(false);
     json.key("texts");
     json.beginArray();
     for (const Change& change : _changes) {

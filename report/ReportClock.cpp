@@ -64,7 +64,6 @@ void ReportClock::writeJson(JsonWriter& json) const
     write(json, std::max(_newest, _last.position));
     json.member("samples", _samples);
     json.key("shifts");
-    json.setCompact(true);
     json.beginArray();
     for (const Shift& shift : _shifts) {
         json.beginArray();
@@ -73,9 +72,7 @@ void ReportClock::writeJson(JsonWriter& json) const
         json.endArray();
     }
     json.endArray();
-    json.setCompact(false);
     json.key("gaps");
-    json.setCompact(true);
     json.beginArray();
     for (const Gap& gap : _gaps) {
         json.beginArray();
@@ -84,7 +81,6 @@ void ReportClock::writeJson(JsonWriter& json) const
         json.endArray();
     }
     json.endArray();
-    json.setCompact(false);
     json.member("gapsOmitted", _gapsOmitted);
 }
 

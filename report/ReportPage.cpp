@@ -84,6 +84,7 @@ void writePart(std::string_view name, std::ostream& stream, const std::function<
         ScriptDataBuffer buffer(stream);
         std::ostream data(&buffer);
         JsonWriter json(data);
+        json.setCompact(true);
         writeData(json);
     }
 }

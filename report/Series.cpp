@@ -40,10 +40,6 @@ void keep(std::span<const Point> bucket, std::vector<Point>& kept)
 
 void Series::add(std::int64_t position, std::optional<double> number)
 {
-    if (!_points.empty() && _points.back().position == position) {
-        _points.back().number = number;
-        return;
-    }
     if (!number && (_points.empty() || !_points.back().number))
         return;
     _points.push_back({position, number});
@@ -80,15 +76,15 @@ void Series::writeJson(JsonWriter& json) const
 {
     if (_bucket != 0)
         json.member("bucket", static_cast<std::size_t>(_bucket));
-    json.key("times");
-    json.setCompact(true);
+    json.key("steps");
     json.beginArray();
-    for (const Point& point : _points)
-        json.number(static_cast<std::size_t>(point.position));
+    std::int64_t before = 0;
+    for (const Point& point : _points) {
+        json.number(static_cast<std::size_t>(point.position - before));
+        before = point.position;
+    }
     json.endArray();
-    json.setCompact(false);
     json.key("numbers");
-    json.setCompact(true);
     json.beginArray();
     for (const Point& point : _points) {
         if (point.number)
@@ -97,7 +93,6 @@ void Series::writeJson(JsonWriter& json) const
             json.null();
     }
     json.endArray();
-    json.setCompact(false);
 }
 
 } // namespace orvex

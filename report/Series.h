@@ -18,9 +18,11 @@ public:
     struct Point {
         std::int64_t position;        // when the value changed
         std::optional<double> number; // none when there is no value from here on
+
+        friend bool operator==(const Point&, const Point&) = default;
     };
 
-    // Positions do not decrease. A change at the position of the last one replaces that.
+    // Positions do not decrease. Of several values at one position the last one holds.
     void add(std::int64_t position, std::optional<double> number);
     // Before it is written.
     void finish();
@@ -29,7 +31,8 @@ public:
     // Length of the buckets in ms; 0 while nothing was thinned.
     std::int64_t bucket() const { return _bucket; }
 
-    // The members "times" and "numbers" and, of a thinned series, "bucket".
+    // The members "steps" (ms since the point before; the first since 1970) and "numbers" and, of a thinned
+    // series, "bucket".
     void writeJson(JsonWriter& json) const;
 
 private:

@@ -125,6 +125,8 @@ function remarksOf(plot) {
 
 function prepareLines(plot) {
     plot.lines.forEach((line) => {
+        let time = 0;
+        line.times = line.steps.map((step) => time += step);
         const name = line.path.split('/').at(-1);
         line.name = name === '*' ? '' : name;
     });
