@@ -51,11 +51,11 @@ std::vector<Bytes> basebandStream(const Technology& technology)
     return result;
 }
 
-std::unique_ptr<LogGenerator> makeGenerator(const char* identifier)
+std::unique_ptr<LogGenerator> makeGenerator(const char* identifier, std::size_t rawPacketLimit)
 {
     static const FileResources kResources(ORVEX_RESOURCES);
     static const SystemClock kClock;
-    return LogGenerator::generatorFromTechnology(identifier, {kResources, kClock, {}});
+    return LogGenerator::generatorFromTechnology(identifier, {kResources, kClock, {}, rawPacketLimit});
 }
 
 void countMessages(benchmark::State& state, std::size_t messagesPerIteration)

@@ -29,7 +29,8 @@ const std::vector<Bytes>& recordedStream(const char* name);
 std::vector<Bytes> basebandStream(const Technology& technology);
 
 // A generator with its real template.
-std::unique_ptr<LogGenerator> makeGenerator(const char* identifier);
+std::unique_ptr<LogGenerator> makeGenerator(
+    const char* identifier, std::size_t rawPacketLimit = RawPackets::kLimit);
 
 // Sets the counter that the table reads: messages per iteration.
 void countMessages(benchmark::State& state, std::size_t messagesPerIteration);
@@ -42,6 +43,7 @@ void registerRebuilding();
 void registerPainting();
 void registerStarting();
 void registerPorts();
+void registerTimelines();
 // Decodes captures that it writes into the directory: one of the given size and smaller ones.
 void registerOffline(const std::string& directory, std::size_t captureMiB);
 

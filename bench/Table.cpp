@@ -83,6 +83,11 @@ constexpr Bound atMost(double factor, Figure of = {nullptr, nullptr})
 }
 constexpr Bound kDecodeBound = atLeast(1.5, {kPrintFloor, kRate});
 
+constexpr Bound timelineBound(const char* plain)
+{
+    return atMost(2, {plain, nullptr});
+}
+
 constexpr Row kRows[] = {
     {"floor: copy, LTE", Unit::perSecond, {"copy/lte", kRate}},
     {"floor: copy, UTRAN", Unit::perSecond, {"copy/utran", kRate}},
@@ -133,6 +138,22 @@ constexpr Row kRows[] = {
     {"decode IFX, log queue", Unit::perSecond, {"decode+queue/ifx", kRate}, "copy/ifx",
         atLeast(1.0 / 3, {"decode/ifx", kRate})},
     {"— lines that were not dropped", Unit::percent, {"decode+queue/ifx", "kept %"}},
+
+    {"ten hours of LTE", Unit::milliseconds, {"hours/lte", nullptr}},
+    {"— followed over time", Unit::milliseconds, {"hours+timeline/lte", nullptr}, nullptr,
+        timelineBound("hours/lte")},
+    {"ten hours of UTRAN", Unit::milliseconds, {"hours/utran", nullptr}},
+    {"— followed over time", Unit::milliseconds, {"hours+timeline/utran", nullptr}, nullptr,
+        timelineBound("hours/utran")},
+    {"ten hours of GSM/UMTS", Unit::milliseconds, {"hours/gsm", nullptr}},
+    {"— followed over time", Unit::milliseconds, {"hours+timeline/gsm", nullptr}, nullptr,
+        timelineBound("hours/gsm")},
+    {"ten hours of CDMA2000", Unit::milliseconds, {"hours/cdma", nullptr}},
+    {"— followed over time", Unit::milliseconds, {"hours+timeline/cdma", nullptr}, nullptr,
+        timelineBound("hours/cdma")},
+    {"ten hours of IFX", Unit::milliseconds, {"hours/ifx", nullptr}},
+    {"— followed over time", Unit::milliseconds, {"hours+timeline/ifx", nullptr}, nullptr,
+        timelineBound("hours/ifx")},
 
     {"dictionary of 100,000 random keys", Unit::milliseconds, {"dictionary/random", nullptr}},
     {"— of keys that collide in std::hash", Unit::milliseconds, {"dictionary/chosen", nullptr}, nullptr,

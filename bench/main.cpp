@@ -55,6 +55,7 @@ int main(int argc, char** argv)
     registerPainting();
     registerStarting();
     registerPorts();
+    registerTimelines();
     registerOffline(directory, captureMiB);
 
     benchmark::Initialize(&argc, argv);

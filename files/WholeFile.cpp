@@ -4,7 +4,6 @@
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
-#include <filesystem>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -45,8 +44,9 @@ WholeFile::WholeFile(const std::string& path)
 
 void WholeFile::createBeside(const std::string& target)
 {
-    const std::filesystem::path path(target);
-    std::string name = (path.parent_path() / ("." + path.filename().string() + ".XXXXXX")).string();
+    const std::size_t folder = target.rfind('/') + 1; // 0 without a slash
+    std::string name(target, 0, folder);
+    name.append(".").append(target, folder).append(".XXXXXX");
     const int descriptor = ::mkostemp(name.data(), O_CLOEXEC); // with mode 0600
     if (descriptor >= 0) {
         _temporary = name;

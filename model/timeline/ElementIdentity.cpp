@@ -79,7 +79,7 @@ void ElementIdentity::readRows(const Dictionary& dictionary)
         if (known != std::end(kIdentifyingRows)) {
             if (const std::string* text = value.string(); text && !text->empty())
                 _rows.push_back(
-                    {place, key, *text, static_cast<std::size_t>(known - std::begin(kIdentifyingRows))});
+                    {place, *known, *text, static_cast<std::size_t>(known - std::begin(kIdentifyingRows))});
         }
         ++place;
     }
@@ -111,7 +111,7 @@ std::string ElementIdentity::text() const
 {
     std::string result;
     for (const Row& row : _rows)
-        result += (result.empty() ? "" : ", ") + row.key + ' ' + row.text;
+        result.append(result.empty() ? "" : ", ").append(row.key).append(" ").append(row.text);
     return result;
 }
 

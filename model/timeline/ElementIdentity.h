@@ -26,7 +26,7 @@ public:
 private:
     struct Row {
         std::size_t place; // in its dictionary
-        std::string key;
+        std::string_view key;
         std::string text;
         std::size_t rank; // of the name, among those that identify
     };

@@ -7,6 +7,7 @@
 #include "Dictionary.h"
 #include "DisplayOrder.h"
 #include "NodesByPath.h"
+#include "TextFormat.h"
 
 #include <algorithm>
 #include <utility>
@@ -14,6 +15,22 @@
 namespace orvex {
 
 namespace {
+
+// Without the separator where there is nothing in front of it.
+std::string joined(std::string_view first, std::string_view separator, std::string_view second)
+{
+    std::string result(first);
+    if (!result.empty())
+        result += separator;
+    result += second;
+    return result;
+}
+
+// The second of the same name is "name (2)".
+std::string numbered(const std::string& name, std::size_t number)
+{
+    return number == 1 ? name : joined(name, " ", text("(%zu)", number));
+}
 
 TimelineBranch& branchOf(TimelineNode& node)
 {
@@ -63,7 +80,7 @@ public:
         const auto [element, isNew, id] = claim(_branch.elements, std::move(identity));
         if (isNew) {
             const std::string& key = _node.name.key;
-            element.name = {pathByAppending(_node.name.path, "*"), key.empty() ? id : key + "; " + id};
+            element.name = {pathByAppending(_node.name.path, "*"), joined(key, "; ", id)};
         }
         return element;
     }
@@ -91,17 +108,16 @@ private:
         std::string id;
     };
 
-    // The second of the same name becomes "name (2)".
     Claim claim(std::unordered_map<std::string, TimelineNode>& nodes, const std::string& name)
     {
-        std::size_t& count = _counts[name];
-        while (true) {
-            std::string id = ++count == 1 ? name : name + " (" + std::to_string(count) + ")";
+        const auto [first, isNewName] = nodes.try_emplace(name);
+        if (std::exchange(first->second.layout, _number) != _number)
+            return {first->second, isNewName, name};
+        for (std::size_t& count = _counts[name];;) {
+            std::string id = numbered(name, ++count + 1);
             const auto [found, isNew] = nodes.try_emplace(id);
-            if (found->second.layout != _number) {
-                found->second.layout = _number;
+            if (std::exchange(found->second.layout, _number) != _number)
                 return {found->second, isNew, std::move(id)};
-            }
         }
     }
 
@@ -109,7 +125,7 @@ private:
     TimelineBranch& _branch;
     std::size_t _number;
     std::vector<TimelineBranch::Place> _before;
-    std::unordered_map<std::string, std::size_t> _counts;
+    std::unordered_map<std::string, std::size_t> _counts; // of names after their first
 };
 
 } // namespace
@@ -119,7 +135,7 @@ Timeline::Timeline(TimelineFields& fields, TimelineSink& sink)
     , _fields(fields.ofDisplay())
     , _root(std::make_unique<TimelineNode>())
 {
-    _root->name.path = "/";
+    _root->name.path.push_back('/');
 }
 
 Timeline::~Timeline() = default;
@@ -208,8 +224,8 @@ void Timeline::layOut(TimelineNode& node, const Dictionary& dictionary, const Ti
         place.fields = fields.below(name);
         if (place.fields.isNothing())
             return;
-        place.node = branch.elementName ? &layout.element(branch.elementName + (" " + std::string(name)))
-                                        : &layout.child(name);
+        place.node =
+            branch.elementName ? &layout.element(joined(branch.elementName, " ", name)) : &layout.child(name);
     });
     layout.finish(fields, [this](TimelineNode& left) { hide(left); });
 }
@@ -231,7 +247,10 @@ void Timeline::layOut(TimelineNode& node, const Array& array, const TimelineFiel
         if (identity.empty())
             identity = number;
         else if (branch.sharedText)
-            identity += ", " + std::string(branch.sharedIdentity->path.back()) + ' ' + *branch.sharedText;
+            identity.append(", ")
+                .append(branch.sharedIdentity->path.back())
+                .append(" ")
+                .append(*branch.sharedText);
         place.node = &layout.element(std::move(identity));
     }
     layout.finish(fields, [this](TimelineNode& left) { hide(left); });
@@ -241,8 +260,9 @@ void Timeline::addRow(TimelineNode& node)
 {
     // Names hold anything, so "a/b" may be one of them or two.
     const std::string key = node.name.key;
-    for (int number = 2; !_rowNames.insert(node.name.path + '\0' + node.name.key).second; ++number)
-        node.name.key = key + (key.empty() ? "(" : " (") + std::to_string(number) + ")";
+    for (std::size_t number = 2; !_rowNames.insert(joined(node.name.path, "\n", node.name.key)).second;
+         ++number)
+        node.name.key = numbered(key, number);
     node.row = _rowNames.size() - 1;
     _sink.addRow(*node.row, node.name);
 }

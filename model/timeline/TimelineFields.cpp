@@ -45,13 +45,13 @@ TimelineFields::Part TimelineFields::ofDisplay()
 
 TimelineFields::Part TimelineFields::Part::below(std::string_view name) const
 {
-    Part part;
-    part._isWhole = _isWhole;
     // Names may contain "/", so a component of the path is whatever the name is. One of nothing else adds
     // nothing to the path.
     const std::string_view component = withoutSlashesAround(name);
-    if (component.empty())
+    if (_rests.empty() || component.empty())
         return *this;
+    Part part;
+    part._isWhole = _isWhole;
     for (const Rest& rest : _rests) {
         for (const std::string_view candidate : {component, std::string_view("*")}) {
             const auto behind = restBehind(rest.path, candidate);

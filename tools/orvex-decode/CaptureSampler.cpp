@@ -66,7 +66,7 @@ void CaptureSampler::sample(microseconds time)
 {
     // In milliseconds, as all outputs show it.
     const auto whole = std::chrono::floor<std::chrono::milliseconds>(time);
-    _timeline.sample({std::chrono::duration<double>(whole).count()}, _session.display());
+    _timeline.sample({std::chrono::duration<double>(whole).count()}, _session.shown());
 }
 
 std::string CaptureSampler::clockNote() const
