@@ -8,7 +8,8 @@
 
 namespace orvex {
 
-// A text over time, drawn as a strip. Changes beyond the first 20,000 are left out.
+// A text over time, drawn as a strip. Of more than 20,000 changes, buckets of equal length remain, each with
+// the text that held longest in it.
 class Band {
 public:
     static constexpr std::size_t kLimit = 20'000;
@@ -19,13 +20,18 @@ public:
     {
     }
 
-    // An empty text is no text. A change at the position of the last one replaces that.
+    // An empty text is no text.
     void add(std::int64_t position, const std::string& text);
+
+    // Before it is written.
+    void finish();
 
     bool isEmpty() const { return _changes.empty(); }
     void writeJson(JsonWriter& json) const;
 
 private:
+    void thin();
+
     struct Change {
         std::int64_t position;
         std::string text;
@@ -34,7 +40,7 @@ private:
     std::string _title;
     bool _isCell;
     std::vector<Change> _changes;
-    std::size_t _omitted = 0;
+    std::int64_t _bucket = 0; // ms; 0 while nothing was thinned
 };
 
 } // namespace orvex

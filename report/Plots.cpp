@@ -74,8 +74,15 @@ void Plots::finish(const Moment& /*last*/)
 {
     for (Plot& plot : _plots) {
         std::erase_if(plot.lines, [](const auto& entry) { return entry.second.series.points().empty(); });
-        for (auto& [number, line] : plot.lines)
+        std::size_t points = 0;
+        for (auto& [number, line] : plot.lines) {
             line.series.finish();
+            points += line.series.points().size();
+        }
+        if (points <= kMostPoints)
+            continue;
+        for (auto& [number, line] : plot.lines)
+            line.series.finish(kMostPoints / plot.lines.size());
     }
 }
 

@@ -14,7 +14,8 @@ namespace orvex {
 // The member "plots": the series of the rows that the rules name, those with a value ever.
 class Plots final : public ReportPart {
 public:
-    static constexpr std::size_t kMostLines = 64; // of a plot; of more, those with the lowest peaks go
+    static constexpr std::size_t kMostLines = 64;       // of a plot; of more, those with the lowest peaks go
+    static constexpr std::size_t kMostPoints = 200'000; // of a plot, shared equally where it has more
 
     // `rules` outlive the plots.
     explicit Plots(const std::vector<PlotRule>& rules);

@@ -43,19 +43,29 @@ void Series::add(std::int64_t position, std::optional<double> number)
     if (!number && (_points.empty() || !_points.back().number))
         return;
     _points.push_back({position, number});
-    if (_points.size() <= kLimit)
-        return;
-    // At most four of each bucket stay, so that half of the limit is free again.
-    constexpr std::int64_t kBuckets = kLimit / 8;
-    const std::int64_t length = position - _points.front().position + 1;
-    _bucket = std::max(2 * _bucket, (length + kBuckets - 1) / kBuckets);
-    thin();
+    if (_points.size() > kLimit)
+        widen(kLimit);
 }
 
-void Series::finish()
+void Series::finish(std::size_t limit)
 {
     if (_bucket != 0)
         thin(); // what came after the last time has all its points
+    if (_points.size() > limit)
+        widen(limit);
+}
+
+// At most four points of each bucket stay, so that a fifth of the limit is free again. Buckets double, so
+// that what a bucket keeps is in the one that takes its place.
+void Series::widen(std::size_t limit)
+{
+    const auto buckets = std::max<std::int64_t>(static_cast<std::int64_t>(limit) / 5, 1);
+    const std::int64_t length = _points.back().position - _points.front().position + 1;
+    if (_bucket == 0)
+        _bucket = (length + buckets - 1) / buckets;
+    while (_bucket * buckets < length)
+        _bucket *= 2;
+    thin();
 }
 
 void Series::thin()

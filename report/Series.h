@@ -24,8 +24,8 @@ public:
 
     // Positions do not decrease. Of several values at one position the last one holds.
     void add(std::int64_t position, std::optional<double> number);
-    // Before it is written.
-    void finish();
+    // Before it is written: thins it to so many points, if it has more.
+    void finish(std::size_t limit = kLimit);
 
     const std::vector<Point>& points() const { return _points; }
     // Length of the buckets in ms; 0 while nothing was thinned.
@@ -36,6 +36,7 @@ public:
     void writeJson(JsonWriter& json) const;
 
 private:
+    void widen(std::size_t limit);
     void thin();
 
     std::vector<Point> _points;

@@ -69,6 +69,7 @@ void ServingCells::settle(const Moment& before, const Moment& now)
 void ServingCells::finish(const Moment& last)
 {
     settle(last, last);
+    _band.finish();
 }
 
 const std::string& ServingCells::textOf(const char* path) const

@@ -36,6 +36,14 @@ void States::clear(std::size_t number, const Moment& now)
     set(number, "", now);
 }
 
+void States::finish(const Moment& /*last*/)
+{
+    for (std::vector<Band>& bands : _bands) {
+        for (Band& band : bands)
+            band.finish();
+    }
+}
+
 void States::writeJson(JsonWriter& json) const
 {
     for (const std::vector<Band>& bands : _bands) {

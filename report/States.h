@@ -21,6 +21,7 @@ public:
     bool addRow(std::size_t number, const TimelineRow& row) override;
     void set(std::size_t number, const std::string& text, const Moment& now) override;
     void clear(std::size_t number, const Moment& now) override;
+    void finish(const Moment& last) override;
     // Elements of the member "bands".
     void writeJson(JsonWriter& json) const override;
 

@@ -84,8 +84,9 @@ function addBand(band) {
     const canvas = element('canvas', {className: 'strip'});
     const surface = element('div', {className: 'surface strip-surface'}, canvas);
     const reading = element('div', {className: 'band-reading'});
-    byId('bands').append(element('div', {className: 'track band'},
-        element('h3', {textContent: band.title}), surface, reading));
+    const remark = band.bucket > 0 ? `Thinned: one text for each ${durationText(band.bucket)}.` : '';
+    byId('bands').append(element('div', {className: 'track band'}, element('h3', {textContent: band.title}), surface,
+        reading, element('p', {className: 'remark', textContent: remark})));
     const indexes = colorIndexes(band);
     const draw = () => drawBand(canvas, band, indexes);
     const read = () => { reading.textContent = textAt(band, axis.readingTime()) ?? '—'; };
@@ -94,7 +95,4 @@ function addBand(band) {
     theme.onChange.push(draw);
     new ResizeObserver(draw).observe(canvas);
     makeInteractive(surface, () => ({left: canvas.offsetLeft, width: canvas.clientWidth}));
-    if (band.omitted > 0)
-        surface.after(element('p', {className: 'remark',
-            textContent: `${grouped(band.omitted)} later changes are not shown.`}));
 }

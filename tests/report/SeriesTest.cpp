@@ -1,9 +1,11 @@
 #include "Series.h"
+#include "Band.h"
 #include "LevelStatistics.h"
 
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <sstream>
 
 namespace orvex::test {
 namespace {
@@ -45,7 +47,8 @@ TEST(Series, ThinsALongerOneAndKeepsItsPeaks)
         all.push_back({2000 * i, number});
         ASSERT_LE(series.points().size(), Series::kLimit) << i;
     }
-    series.finish();
+    series.finish(5'000);
+    EXPECT_LE(series.points().size(), 5'000);
     const std::vector<Point>& kept = series.points();
     EXPECT_TRUE(std::ranges::is_sorted(kept, {}, &Point::position));
     for (const Point& point : kept)
@@ -56,6 +59,26 @@ TEST(Series, ThinsALongerOneAndKeepsItsPeaks)
     ASSERT_GT(series.bucket(), 2000);
     for (std::int64_t end = series.bucket() - 1; end < all.back().position; end += series.bucket())
         ASSERT_EQ(valueAt(kept, end), valueAt(all, end)) << end;
+}
+
+TEST(Band, ThinsToWhatHeldLongest)
+{
+    Band band("State", false);
+    band.add(0, "start");
+    const auto periods = static_cast<std::int64_t>(Band::kLimit);
+    for (std::int64_t i = 0; i < periods; ++i) {
+        band.add(10'000 * i + 1, i < periods / 4 ? "long" : "idle");
+        band.add(10'000 * i + 9'500, "short");
+    }
+    band.add(10'000 * periods, "end");
+    band.finish();
+    std::ostringstream stream;
+    JsonWriter json(stream);
+    json.setCompact(true);
+    band.writeJson(json);
+    const std::string text = stream.str();
+    EXPECT_NE(text.find(R"("texts":["long","idle","end"])"), std::string::npos) << text;
+    EXPECT_NE(text.find(",200000000]"), std::string::npos) << text;
 }
 
 TEST(LevelStatistics, WeighsValuesByTheirTime)
