@@ -17,7 +17,7 @@ constexpr int kBroadestHandset = 600; // the shorter side of its screen
 
 // These say how a session is to run.
 constexpr const char* kSessionOptions[] = {
-    "print-status", "until-painted", "once", "timeout", "save", "diagnose"};
+    "print-status", "until-painted", "once", "timeout", "save", "timeline", "diagnose"};
 
 CommandLine::Program program()
 {
@@ -35,6 +35,18 @@ CommandLine::Program program()
                     "tree), else 1.",
                     "S"},
                 {"save", "Write a snapshot to this file at the end.", "FILE"},
+                {"timeline",
+                    "Write to FILE.csv which rows changed when: time, path, key, text, number and unit. Each "
+                    "line is written at once, so what was recorded stays if the program is killed.",
+                    "FILE.csv"},
+                {"every",
+                    "With --timeline: look at the display every SECONDS, at least 0.1, if a message came. "
+                    "Default: 2.",
+                    "SECONDS"},
+                {"field",
+                    "With --timeline: follow only this row or branch; '*' stands for one component: "
+                    "'/Neighbor Cells List/*/Measured RSRP'. May be given more than once.",
+                    "PATH", true},
                 {"diagnose",
                     "Say why a session does not come up, step by step. The status is 0 if nothing is wrong, "
                     "else 1."},
@@ -64,6 +76,7 @@ CommandLine::Program program()
                 {"open", "once"},
                 {"open", "timeout"},
                 {"open", "save"},
+                {"open", "timeline"},
                 {"diagnose", "console"},
                 {"diagnose", "open"},
                 {"diagnose", "light"},
@@ -79,6 +92,9 @@ CommandLine::Program program()
                 {"json", "console"},
                 {"timeout", "console"},
                 {"save", "console"},
+                {"timeline", "console"},
+                {"every", "timeline"},
+                {"field", "timeline"},
             },
         .argumentsSyntax = "[FILE]",
         .argumentsDescription = "Snapshot or capture to show instead of a session.",
@@ -130,6 +146,9 @@ std::string read(const CommandLine& line, ConsoleOptions& options)
     options.once = line.isSet("once");
     options.json = line.isSet("json");
     options.saveFile = line.value("save");
+    options.timelineFile = line.value("timeline");
+    if (options.timelineFile == "-")
+        return "--timeline takes a file; the tree goes to standard output.";
     if (const auto path = line.value("path")) {
         if (!path->starts_with('/'))
             return "--path takes a path that begins with '/'.";
@@ -140,7 +159,7 @@ std::string read(const CommandLine& line, ConsoleOptions& options)
         if (!options.timeout)
             return "--timeout takes a number of seconds above 0.";
     }
-    return {};
+    return options.sampling.read(line.value("every"), line.values("field"));
 }
 
 } // namespace

@@ -10,6 +10,7 @@
 #include "OrvexConsole.h"
 #include "TerminalView.h"
 
+#include "FileConflict.h"
 #include "NodesByPath.h"
 #include "Process.h"
 #include "RawTerminal.h"
@@ -93,6 +94,17 @@ private:
         .onRedraw = [this] { _view.redraw(); }}};
 };
 
+// Returns why the files cannot be used together; empty when they can.
+std::string conflictOf(const ConsoleOptions& options)
+{
+    std::vector<FileInUse> outputs;
+    if (options.timelineFile)
+        outputs.push_back({"--timeline " + *options.timelineFile, *options.timelineFile});
+    if (options.saveFile)
+        outputs.push_back({"--save " + *options.saveFile, *options.saveFile});
+    return fileConflict({}, outputs);
+}
+
 std::unique_ptr<ConsoleView> pageView(ConsoleOutput& output, const ConsoleOptions& options)
 {
     if (options.json)
@@ -111,6 +123,10 @@ int runConsole(int argc, char** argv, const AppOptions& options)
 {
     const QCoreApplication application(argc, argv);
     keepDecimalPoints();
+    if (const std::string conflict = conflictOf(options.console); !conflict.empty()) {
+        printError(conflict);
+        return CommandLine::kWrongUsage;
+    }
     LinuxPlatform platform(options.resourceDirectory());
     ConsoleStream stream;
     const bool redrawsTerminal = ::isatty(STDOUT_FILENO) && !options.console.once && !options.console.json;

@@ -30,6 +30,8 @@ OrvexConsole::~OrvexConsole()
 void OrvexConsole::start(std::function<void()> onEnd)
 {
     _onEnd = std::move(onEnd);
+    if (!startRecording())
+        return;
     _model = OrvexModel::create(_platform.session);
     _model->setListener(this);
     sayConnecting();
@@ -47,6 +49,8 @@ void OrvexConsole::applicationWillTerminate()
 {
     if (!_model)
         return;
+    record();
+    _recordingTimer.reset();
     if (_options.saveFile)
         save();
     const auto model = std::exchange(_model, nullptr);
@@ -98,6 +102,33 @@ void OrvexConsole::show(const std::string& status, const OrvexModelNodeRef& tree
         .path = _options.path,
         .tree = tree,
         .messages = _model->decodedMessages()});
+}
+
+// Returns false when there is to be a recording and its file cannot be created.
+bool OrvexConsole::startRecording()
+{
+    if (!_options.timelineFile)
+        return true;
+    _recording.emplace(*_options.timelineFile, _options.sampling);
+    _failure = _recording->failure();
+    RunLoop& runLoop = _platform.session.runLoop;
+    if (!_failure.empty()) {
+        runLoop.post([this] { end(); });
+        return false;
+    }
+    _recordingTimer = runLoop.startTimer(_options.sampling.every, [this] { record(); });
+    return true;
+}
+
+void OrvexConsole::record()
+{
+    if (!_recording || !_model || !_failure.empty() || _model->decodedMessages() == _recordedMessages)
+        return;
+    _recordedMessages = _model->decodedMessages();
+    _recording->sample(_platform.session.generators.clock.now(), _model->shownDisplay());
+    _failure = _recording->failure();
+    if (!_failure.empty())
+        end();
 }
 
 void OrvexConsole::timeIsUp()

@@ -4,9 +4,12 @@
 #include "ConsoleOptions.h"
 #include "ConsoleOutput.h"
 #include "ConsoleView.h"
+#include "TimelineRecording.h"
 
+#include <cstdint>
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 #include <utility>
 
@@ -25,8 +28,8 @@ public:
     // Shows that it is connecting and queues the start of the session. `onEnd` is called once when the
     // options say that it is time to end.
     void start(std::function<void()> onEnd = {});
-    // Saves a snapshot if asked to, writes the home-screen preference and closes the session. Further calls
-    // do nothing.
+    // Ends the recording, saves a snapshot if asked to, writes the home-screen preference and closes the
+    // session. Further calls do nothing.
     void applicationWillTerminate();
 
     // Why the program has failed, in one line; empty if it has not.
@@ -38,6 +41,8 @@ private:
     void checkConnection();
     void sayConnecting();
     void show(const std::string& status, const OrvexModelNodeRef& tree);
+    bool startRecording();
+    void record();
     void timeIsUp();
     void save();
     void end();
@@ -49,9 +54,12 @@ private:
     std::shared_ptr<OrvexModel> _model;
     std::unique_ptr<RunLoop::Timer> _connectionTimer;
     std::unique_ptr<RunLoop::Timer> _timeout;
-    OrvexModelNodeRef _tree;      // of the last update
-    bool _saidConnecting = false; // and nothing else since
-    bool _cameUp = false;         // the session did, at some time
+    std::optional<TimelineRecording> _recording;
+    std::unique_ptr<RunLoop::Timer> _recordingTimer;
+    std::uint64_t _recordedMessages = 0; // up to the last sample
+    OrvexModelNodeRef _tree;             // of the last update
+    bool _saidConnecting = false;        // and nothing else since
+    bool _cameUp = false;                // the session did, at some time
     std::string _failure;
 };
 

@@ -63,6 +63,9 @@ public:
     OrvexModelNodeRef topLevelNodes();
     // Null when no node has the path.
     OrvexModelNodeRef nodeAtPath(const std::string& path);
+    // The display as it stands, without asking the generator for it, which would make a history entry. Null
+    // before the first message.
+    const Value& shownDisplay() const { return (*_state)["Display"]; }
     // What a snapshot stores. Null while the technology is unknown.
     ArrayRef getSaveContents() const;
 

@@ -9,31 +9,55 @@ namespace orvex {
 
 namespace {
 
+// A row that identifies. Sections have several names for the same thing, which have one label, so that a cell
+// has the same key wherever it is shown.
+struct IdentifyingRow {
+    std::string_view name;
+    std::string_view label;
+};
+
 // In the order in which they make a key. The channel stands behind the cell, because a text cut short should
 // still tell cells apart.
-constexpr std::string_view kIdentifyingRows[] = {
-    "Physical Cell ID", "Cell ID", "Scrambling Code", "PSC", "Pilot", "BSIC", "BSIC ID", // cells
-    "E-ARFCN", "E ARFCN", "UARFCN", "U ARFCN", "ARFCN", "Carrier", "Channel", "Band",    // their channels
-    "Context ID", "Process ID", "Transport Channel ID", "TRCH ID", "CCTRCH ID", "TSNUM", //
-    "Mobile Country Code", "Mobile Network Code",                                        //
+constexpr IdentifyingRow kIdentifyingRows[] = {
+    // cells
+    {"Physical Cell ID", "Physical Cell ID"},
+    {"Cell ID", "Cell ID"},
+    {"Scrambling Code", "Scrambling Code"},
+    {"PSC", "Scrambling Code"},
+    {"Cell Parameter ID", "Cell Parameter ID"},
+    {"BSIC", "BSIC"},
+    {"BSIC ID", "BSIC"},
+    {"Base Station ID", "Base Station ID"},
+    {"Pilot", "Pilot"},
+    {"PN Offset", "PN Offset"},
+    // their channels
+    {"E-ARFCN", "E-ARFCN"},
+    {"E ARFCN", "E-ARFCN"},
+    {"EARFCN", "E-ARFCN"},
+    {"NR-ARFCN", "NR-ARFCN"},
+    {"UARFCN", "UARFCN"},
+    {"U ARFCN", "UARFCN"},
+    {"Downlink Frequency", "UARFCN"},
+    {"ARFCN", "ARFCN"},
+    {"Carrier", "Carrier"},
+    {"Channel", "Channel"},
+    {"Band", "Band"},
+    // contexts, channels and processes
+    {"Context ID", "Context ID"},
+    {"Process ID", "Process ID"},
+    {"Transport Channel ID", "Transport Channel ID"},
+    {"TRCH ID", "TRCH ID"},
+    {"CCTRCH ID", "CCTRCH ID"},
+    {"TSNUM", "TSNUM"},
+    // networks
+    {"Mobile Country Code", "Mobile Country Code"},
+    {"Mobile Network Code", "Mobile Network Code"},
 };
 
 struct SharedEntry {
     std::string_view list;
     SharedIdentity identity;
 };
-
-const SharedEntry* sharedEntries(std::size_t& count)
-{
-    static const SharedEntry kEntries[] = {
-        {"/Neighbor Cells List", {{"Neighbor Measurements", "E-ARFCN"}}},
-        {"/Measured Neighbor Cells", {{"Connected mode LTE Intra-frequency Measurement", "E-ARFCN"}}},
-        {"/Detected Cells", {{"Connected mode LTE Intra-frequency Measurement", "E-ARFCN"}}},
-        {"/Serving/Active Set", {{"Serving", "UMTS RR Info", "Downlink Frequency"}}},
-    };
-    count = std::size(kEntries);
-    return kEntries;
-}
 
 struct NamedEntry {
     std::string_view dictionary;
@@ -75,11 +99,11 @@ void ElementIdentity::readRows(const Dictionary& dictionary)
 {
     std::size_t place = 0;
     for (const auto& [key, value] : dictionary) {
-        const auto* known = std::ranges::find(kIdentifyingRows, key);
+        const auto* known = std::ranges::find(kIdentifyingRows, key, &IdentifyingRow::name);
         if (known != std::end(kIdentifyingRows)) {
             if (const std::string* text = value.string(); text && !text->empty())
-                _rows.push_back(
-                    {place, *known, *text, static_cast<std::size_t>(known - std::begin(kIdentifyingRows))});
+                _rows.push_back({place, known->name, *text,
+                    static_cast<std::size_t>(known - std::begin(kIdentifyingRows))});
         }
         ++place;
     }
@@ -111,19 +135,24 @@ std::string ElementIdentity::text() const
 {
     std::string result;
     for (const Row& row : _rows)
-        result.append(result.empty() ? "" : ", ").append(row.key).append(" ").append(row.text);
+        result.append(result.empty() ? "" : ", ")
+            .append(kIdentifyingRows[row.rank].label)
+            .append(" ")
+            .append(row.text);
     return result;
 }
 
 const SharedIdentity* sharedIdentityOfList(std::string_view path)
 {
-    std::size_t count = 0;
-    const SharedEntry* entries = sharedEntries(count);
-    for (std::size_t i = 0; i < count; ++i) {
-        if (entries[i].list == path)
-            return &entries[i].identity;
-    }
-    return nullptr;
+    static const SharedEntry kEntries[] = {
+        {"/Neighbor Cells List", {{"Neighbor Measurements", "E-ARFCN"}, "E-ARFCN"}},
+        {"/Measured Neighbor Cells",
+            {{"Connected mode LTE Intra-frequency Measurement", "E-ARFCN"}, "E-ARFCN"}},
+        {"/Detected Cells", {{"Connected mode LTE Intra-frequency Measurement", "E-ARFCN"}, "E-ARFCN"}},
+        {"/Serving/Active Set", {{"Serving", "UMTS RR Info", "Downlink Frequency"}, "UARFCN"}},
+    };
+    const auto* entry = std::ranges::find(kEntries, path, &SharedEntry::list);
+    return entry == std::end(kEntries) ? nullptr : &entry->identity;
 }
 
 const std::string* textOf(const SharedIdentity& identity, const Value& display)

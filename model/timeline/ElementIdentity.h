@@ -42,6 +42,7 @@ private:
 // A row outside of a list that also identifies its elements, such as the channel of all cells in it.
 struct SharedIdentity {
     std::vector<const char*> path; // of keys
+    const char* label;             // in the elements' keys
 };
 // Null when there is none for the list with that path.
 const SharedIdentity* sharedIdentityOfList(std::string_view path);

@@ -247,10 +247,7 @@ void Timeline::layOut(TimelineNode& node, const Array& array, const TimelineFiel
         if (identity.empty())
             identity = number;
         else if (branch.sharedText)
-            identity.append(", ")
-                .append(branch.sharedIdentity->path.back())
-                .append(" ")
-                .append(*branch.sharedText);
+            identity.append(", ").append(branch.sharedIdentity->label).append(" ").append(*branch.sharedText);
         place.node = &layout.element(std::move(identity));
     }
     layout.finish(fields, [this](TimelineNode& left) { hide(left); });

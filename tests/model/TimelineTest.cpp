@@ -115,6 +115,14 @@ TEST(Timeline, FollowsElementsByWhatTheyShow)
             " /*/Name Servers/*|Context ID 5; 0 gone"
             " /*/Context/State|Context ID 6=on /*/Context/Context ID|Context ID 6=6"
             " /*/Name Servers/*|Context ID 6; 0=192.0.2.1"},
+        {"one cell under several names",
+            {Array::make({Dictionary::make({{"U ARFCN", "10588"}, {"PSC", "57"}})}),
+                Array::make(
+                    {Dictionary::make({{"Downlink Frequency", "10588"}, {"Scrambling Code", "57"}})})},
+            " /*/U ARFCN|Scrambling Code 57, UARFCN 10588=10588 /*/PSC|Scrambling Code 57, UARFCN 10588=57\n"
+            " /*/U ARFCN|Scrambling Code 57, UARFCN 10588 gone /*/PSC|Scrambling Code 57, UARFCN 10588 gone"
+            " /*/Downlink Frequency|Scrambling Code 57, UARFCN 10588=10588"
+            " /*/Scrambling Code|Scrambling Code 57, UARFCN 10588=57"},
         {"pilots, and their fingers",
             {pilots({{"_sorted", ""}, {"0;12", "a"}}),
                 pilots({{"_sorted", ""}, {"0;44", "b"}, {"1;12", "a"}, {"2;44", "c"}})},

@@ -6,9 +6,14 @@
 
 #include <gmock/gmock.h>
 
+#include <QDateTime>
+
 #include <algorithm>
 #include <csignal>
 #include <filesystem>
+#include <fstream>
+#include <map>
+#include <sstream>
 #include <thread>
 
 namespace orvex::test {
@@ -87,6 +92,49 @@ TEST_F(LiveSession, MonitorAndDecoderShowTheSameOfIt)
         EXPECT_GT(live.size(), 500U);
         EXPECT_EQ(live, run(ORVEX_DECODE, {"--technology", technology, folder.name("live")}).output);
     }
+}
+
+// The last text of each row in a timeline.
+std::map<std::string, std::string> lastTexts(const std::string& csv)
+{
+    std::map<std::string, std::string> result;
+    std::istringstream lines(csv.substr(csv.find('\n') + 1));
+    for (std::string line; std::getline(lines, line);) {
+        const auto text = line.find(line.find(",\"") < line.find(",,") ? "\"," : ",,") + 2;
+        EXPECT_TRUE(line.ends_with('\r')) << line;
+        result[line.substr(25, text - 25)] = line.substr(text);
+    }
+    return result;
+}
+
+TEST_F(LiveSession, MonitorAndDecoderRecordTheSameTimeline)
+{
+    constexpr std::size_t kCount = 500;
+    const KoratProgram korat(folder,
+        {"--technology", "MRL_LTE", "--rate", "1000", "--count", QString::number(kCount), "--record",
+            folder.name("live")});
+    Program monitor(
+        folder, ORVEX_PATH, {"--console", "--timeline", folder.name("live.csv"), "--every", "0.2"});
+    EXPECT_TRUE(waitUntil([&] { return messagesIn("live").size() == kCount; }, 30s));
+    turnFor(700ms);
+    monitor.kill(); // what was recorded stays
+    const auto read = [this](const char* name) {
+        std::ifstream stream(folder.path(name), std::ios::binary);
+        return std::string(std::istreambuf_iterator<char>(stream), {});
+    };
+    const std::string live = read("live.csv");
+    EXPECT_EQ(run(ORVEX_DECODE, {"--timeline", folder.name("offline.csv"), folder.name("live")}).status, 0);
+    const auto rows = lastTexts(live);
+    const auto decoded = lastTexts(read("offline.csv"));
+    EXPECT_GT(rows.size(), 80U);
+    for (const auto& [row, text] : rows)
+        EXPECT_EQ(text, decoded.contains(row) ? decoded.at(row) : ",,\r") << row;
+
+    // By the clock on the wall.
+    const auto now = QDateTime::currentDateTimeUtc();
+    const auto last = QDateTime::fromString(
+        QString::fromStdString(live.substr(live.rfind('\n', live.size() - 2) + 1, 24)), Qt::ISODateWithMs);
+    EXPECT_LT(std::abs(last.secsTo(now)), 20);
 }
 
 TEST_F(LiveSession, AServiceThatHasGoneIsHeardToItsLastMessage)
@@ -173,6 +221,10 @@ TEST_F(ShellTest, ProgramsEndInTimeWhateverStandsStill)
         {"reader gone", "{ $ORVEX --console; echo $? > s; } | true; exit $(cat s)", 0, ""},
         {"no room", "exec $ORVEX --console > /dev/full", 1,
             "orvex: standard output: No space left on device\n"},
+        {"no room for a timeline", "$ORVEX --console --timeline /dev/full", 1,
+            "orvex: /dev/full: No space left on device\n"},
+        {"no folder for a timeline", "$ORVEX --console --timeline none/x.csv", 1,
+            "orvex: none/x.csv: No such file or directory\n"},
         {"no standard streams", "$ORVEX --console >&- <&-", 1,
             "orvex: standard output: Bad file descriptor\n"},
         {"output stuck",
