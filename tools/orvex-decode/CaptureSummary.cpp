@@ -79,15 +79,20 @@ void writeJson(JsonWriter& json, const DecodedCapture& capture)
     beginEnvelope(json, capture);
     if (capture.counts) {
         json.key("summary");
-        json.beginArray();
-        for (const auto& [code, row] : capture.counts->rows())
-            writeRowJson(json, code, row);
-        json.endArray();
+        writeSummaryJson(json, *capture.counts);
     }
     json.endObject();
 }
 
 } // namespace
+
+void writeSummaryJson(JsonWriter& json, const CaptureCounts& counts)
+{
+    json.beginArray();
+    for (const auto& [code, row] : counts.rows())
+        writeRowJson(json, code, row);
+    json.endArray();
+}
 
 void writeSummaries(
     const std::vector<DecodedCapture>& captures, const DecodeOptions& options, std::ostream& stream)

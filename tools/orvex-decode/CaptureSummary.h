@@ -2,6 +2,8 @@
 
 #include "CaptureDecoding.h"
 
+#include "TreeJson.h"
+
 #include <ostream>
 #include <vector>
 
@@ -10,5 +12,8 @@ namespace orvex {
 // Prints what captures hold: a table for each, with a line for each log code.
 void writeSummaries(
     const std::vector<DecodedCapture>& captures, const DecodeOptions& options, std::ostream& stream);
+
+// The table of one capture, as a JSON array.
+void writeSummaryJson(JsonWriter& json, const CaptureCounts& counts);
 
 } // namespace orvex

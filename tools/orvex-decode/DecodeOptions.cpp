@@ -12,7 +12,7 @@ namespace orvex {
 namespace {
 
 // What shows captures over time, instead of printing a document.
-constexpr const char* kSampled[] = {"timeline"};
+constexpr const char* kSampled[] = {"timeline", "report"};
 
 CommandLine::Program baseProgram()
 {
@@ -49,10 +49,17 @@ CommandLine::Program baseProgram()
                     "capture: time, path, key, text, number and unit. Or add that to the SQLite database "
                     "FILE.sqlite, where each of the captures is once, however often it is added.",
                     "FILE.csv|FILE.sqlite"},
-                {"every", "With --timeline: look at the display every SECONDS, at least 0.1. Default: 2.",
+                {"report",
+                    "Instead of the tree, write to FILE.html a page that any browser opens: plots of the "
+                    "levels over time, serving cells, neighbors, contexts, log codes and the last display.",
+                    "FILE.html"},
+                {"every",
+                    "With --timeline or --report: look at the display every SECONDS, at least 0.1. Default: "
+                    "2.",
                     "SECONDS"},
                 {"field",
-                    "With --timeline: follow only this row or branch; '*' stands for one component: "
+                    "With --timeline or --report: follow only this row or branch; '*' stands for one "
+                    "component: "
                     "'/Neighbor Cells List/*/Measured RSRP'. May be given more than once.",
                     "PATH", true},
                 {"output", "Print to FILE.", "FILE"},
@@ -147,7 +154,7 @@ std::string readInputs(const CommandLine& line, DecodeOptions& options)
     if (areSnapshots)
         options.task = DecodeOptions::Task::showSnapshots;
 
-    for (const char* option : {"snapshot", "refresh-every", "summary", "timeline"}) {
+    for (const char* option : {"snapshot", "refresh-every", "summary", "timeline", "report"}) {
         if (areSnapshots && line.isSet(option))
             return "--" + std::string(option) + " goes with captures.";
     }
@@ -164,7 +171,7 @@ std::string readSampling(const CommandLine& line, DecodeOptions& options)
         std::ranges::any_of(kSampled, [&](const char* option) { return line.isSet(option); });
     for (const char* option : {"every", "field"}) {
         if (line.isSet(option) && !isSampled)
-            return "--" + std::string(option) + " goes with --timeline.";
+            return "--" + std::string(option) + " goes with --timeline or --report.";
     }
     if (!isSampled)
         return {};
@@ -172,8 +179,15 @@ std::string readSampling(const CommandLine& line, DecodeOptions& options)
     options.timelineFile = line.value("timeline");
     if (options.timelineFile == kStandardStream)
         options.timelineFile = "/dev/stdout";
-    if (options.inputs.size() > 1 && !isDatabaseFile(*options.timelineFile))
-        return "--timeline FILE.csv goes with one capture.";
+    options.reportFile = line.value("report");
+    if (options.reportFile == kStandardStream)
+        options.reportFile = "/dev/stdout";
+    if (options.inputs.size() > 1) {
+        if (options.reportFile)
+            return "--report goes with one capture.";
+        if (!isDatabaseFile(*options.timelineFile))
+            return "--timeline FILE.csv goes with one capture.";
+    }
     return options.sampling.read(line.value("every"), line.values("field"));
 }
 
@@ -207,7 +221,9 @@ std::string readPrinting(const CommandLine& line, DecodeOptions& options)
 
     if (line.value("output") != kStandardStream)
         options.outputFile = line.value("output");
-    int printed = options.outputFile ? 0 : 1;
+    int printed = options.outputFile || options.task == DecodeOptions::Task::sample ? 0 : 1;
+    for (const auto& file : {options.timelineFile, options.reportFile})
+        printed += file == "/dev/stdout" ? 1 : 0;
     const std::pair<const char*, std::optional<std::string>*> files[] = {
         {"log", &options.logFile}, {"snapshot", &options.snapshotFile}, {"dlf", &options.dlfFile}};
     for (const auto& [option, file] : files) {

@@ -43,6 +43,7 @@ struct DecodeOptions {
     std::string description;                 // the user's words in the snapshot
     std::optional<std::string> dlfFile;      // where the binary log of a snapshot goes
     std::optional<std::string> timelineFile;
+    std::optional<std::string> reportFile;
 };
 
 } // namespace orvex

@@ -1,6 +1,7 @@
 #include "TimelineOutputs.h"
 
 #include "CsvOutput.h"
+#include "ReportOutput.h"
 #include "database/DatabaseOutput.h"
 
 namespace orvex {
@@ -12,6 +13,9 @@ TimelineOutputs::TimelineOutputs(const DecodeOptions& options)
         _outputs.push_back(std::make_unique<DatabaseOutput>(options, _error));
     else if (options.timelineFile)
         _outputs.push_back(std::make_unique<CsvOutput>(*options.timelineFile, _error));
+    if (options.reportFile)
+        _outputs.push_back(
+            std::make_unique<ReportOutput>(*options.reportFile, options.sampling.every, _error));
 }
 
 void TimelineOutputs::begin(const DecodedCapture& capture)

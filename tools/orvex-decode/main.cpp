@@ -51,6 +51,7 @@ std::string conflictOf(const DecodeOptions& options)
         {"--snapshot ", &options.snapshotFile},
         {"--dlf ", &options.dlfFile},
         {"--timeline ", &options.timelineFile},
+        {"--report ", &options.reportFile},
     };
     for (const auto& [option, path] : files) {
         if (*path)

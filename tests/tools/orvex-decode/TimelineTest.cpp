@@ -212,7 +212,7 @@ TEST_F(TimelineTest, RefusesWhatItWouldIgnore)
         const char* error;
     } cases[] = {
         {{"--timeline", "x.csv", "--path", "/"}, "--timeline cannot be combined with --path."},
-        {{"--every", "2"}, "--every goes with --timeline."},
+        {{"--every", "2"}, "--every goes with --timeline or --report."},
         {{"--timeline", "x.csv", "--every", "0.05"}, "--every takes seconds, from 0.1 to 86400."},
         {{"--timeline", "x.csv", "--every", "2s"}, "--every takes seconds, from 0.1 to 86400."},
         {{"--timeline", "x.csv", "--field", "Level"}, "--field takes a path that begins with '/'."},
