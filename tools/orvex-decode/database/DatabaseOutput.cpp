@@ -13,7 +13,7 @@ namespace {
 std::string textOf(std::vector<std::string> fields)
 {
     std::ranges::sort(fields);
-    fields.erase(std::ranges::unique(fields).begin(), fields.end());
+    fields.erase(std::unique(fields.begin(), fields.end()), fields.end());
     std::string text;
     for (const std::string& field : fields)
         (text += text.empty() ? "" : "\n") += field;
