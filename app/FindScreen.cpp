@@ -9,7 +9,6 @@
 
 #include <QCoreApplication>
 #include <QKeyEvent>
-#include <QPainter>
 
 #include <algorithm>
 
@@ -18,7 +17,7 @@ namespace orvex {
 namespace {
 
 constexpr const char* kFoundCellIdentifier = "FoundRow";
-constexpr int kFieldMargin = 8;
+constexpr int kFieldMargin = 10;
 constexpr int kFieldHeight = 34;
 constexpr int kFieldFontSize = 15;
 
@@ -42,8 +41,9 @@ QString placeOf(const FoundRow& row)
 FindScreen::FindScreen(OrvexModelNodeRef root, Actions actions)
     : _root(std::move(root))
     , _actions(std::move(actions))
-    , _field(new TextField(this))
-    , _cancel(new BarButton(BarButton::Style::plain, QStringLiteral("Cancel"), this))
+    , _bar(new Bar(this))
+    , _field(new TextField(_bar))
+    , _cancel(new BarButton(BarButton::Style::plain, QStringLiteral("Cancel"), _bar))
     , _results(new TableList(*this, this))
     , _nothing(new TextLabel(Theme::systemFont(kFieldFontSize), _results))
 {
@@ -110,17 +110,13 @@ void FindScreen::resizeEvent(QResizeEvent*)
 {
     const QSize cancel = _cancel->sizeHint();
     const int middle = Bar::kHeight / 2;
+    _bar->setGeometry(0, 0, width(), Bar::kHeight);
     _cancel->setGeometry(
         width() - cancel.width(), middle - cancel.height() / 2, cancel.width(), cancel.height());
     _field->setGeometry(
         kFieldMargin, middle - kFieldHeight / 2, width() - cancel.width() - kFieldMargin, kFieldHeight);
     _results->setGeometry(0, Bar::kHeight, width(), height() - Bar::kHeight);
     _nothing->setGeometry(kFieldMargin, 0, width() - 2 * kFieldMargin, TableList::kDefaultRowHeight);
-}
-
-void FindScreen::paintEvent(QPaintEvent*)
-{
-    QPainter(this).fillRect(rect(), Theme::current().bar);
 }
 
 void FindScreen::keyPressEvent(QKeyEvent* event)

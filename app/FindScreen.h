@@ -10,6 +10,7 @@
 
 namespace orvex {
 
+class Bar;
 class BarButton;
 class TextField;
 class TextLabel;
@@ -38,7 +39,6 @@ public:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 protected:
-    void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
 
@@ -48,7 +48,8 @@ private:
     OrvexModelNodeRef _root;
     Actions _actions;
     std::vector<FoundRow> _found;
-    TextField* _field; // children
+    Bar* _bar; // children
+    TextField* _field;
     BarButton* _cancel;
     TableList* _results;
     TextLabel* _nothing; // shown if nothing matches

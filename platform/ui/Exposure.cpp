@@ -41,7 +41,11 @@ void Exposure::update()
         if (!_isSeen)
             return;
         _onSeen();
+        if (_window.updatesEnabled())
+            return;
         _window.setUpdatesEnabled(true);
+        // Not left to Qt, which waits for more if the window still had to be painted when it was covered.
+        _window.repaint();
     };
     QMetaObject::invokeMethod(this, show, Qt::QueuedConnection);
 }

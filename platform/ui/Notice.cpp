@@ -4,7 +4,9 @@
 
 #include <QEvent>
 #include <QPainter>
+#include <QTextOption>
 #include <QTimerEvent>
+#include <QtMath>
 
 namespace orvex {
 
@@ -15,8 +17,6 @@ constexpr int kNoticeMargin = 10;
 constexpr int kNoticePadding = 12;
 constexpr int kNoticeCornerRadius = 10;
 constexpr int kAboveBottom = 54; // clears the toolbar
-// Paths have no blanks to break them at.
-constexpr int kLayout = Qt::AlignLeft | Qt::AlignVCenter | Qt::TextWrapAnywhere;
 } // namespace
 
 Notice& Notice::show(QWidget& window, const QString& text)
@@ -50,8 +50,14 @@ void Notice::place()
 {
     const QSize window = parentWidget()->size();
     const int width = window.width() - 2 * kNoticeMargin;
-    const QRect room(0, 0, width - 2 * kNoticePadding, window.height());
-    const int height = fontMetrics().boundingRect(room, kLayout, _text).height() + 2 * kNoticePadding;
+    QTextOption wrapping;
+    wrapping.setWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere); // a path may have no place to break
+    _lines = QStaticText(_text);
+    _lines.setTextFormat(Qt::PlainText);
+    _lines.setTextOption(wrapping);
+    _lines.setTextWidth(width - 2 * kNoticePadding);
+    _lines.prepare({}, font());
+    const int height = qCeil(_lines.size().height()) + 2 * kNoticePadding;
     setGeometry(kNoticeMargin, window.height() - kAboveBottom - height, width, height);
 }
 
@@ -80,8 +86,7 @@ void Notice::paintEvent(QPaintEvent*)
     painter.setBrush(theme.text);
     painter.drawRoundedRect(rect(), kNoticeCornerRadius, kNoticeCornerRadius);
     painter.setPen(theme.background);
-    painter.drawText(
-        rect().adjusted(kNoticePadding, kNoticePadding, -kNoticePadding, -kNoticePadding), kLayout, _text);
+    painter.drawStaticText(kNoticePadding, kNoticePadding, _lines);
 }
 
 } // namespace orvex

@@ -1,6 +1,8 @@
 #pragma once
 
 #include <QBasicTimer>
+#include <QStaticText>
+#include <QString>
 #include <QWidget>
 
 namespace orvex {
@@ -25,6 +27,7 @@ private:
     void place();
 
     QString _text;
+    QStaticText _lines; // as the width breaks the text
     QBasicTimer _shown;
 };
 

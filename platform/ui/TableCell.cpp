@@ -1,5 +1,6 @@
 #include "TableCell.h"
 
+#include "TextLabel.h"
 #include "Theme.h"
 
 #include <QPainter>
@@ -35,9 +36,12 @@ void SidewaysScrollView::setContentSize(const QSize& size)
     setOffset(_offset);
 }
 
-bool SidewaysScrollView::hidesContentAtRight() const
+bool SidewaysScrollView::hidesTextAtRight() const
 {
-    return _content->childrenRect().right() + _content->x() >= width();
+    return std::ranges::any_of(_content->children(), [this](const QObject* child) {
+        const auto* const label = dynamic_cast<const TextLabel*>(child);
+        return label && _content->x() + label->x() + label->textRight() > width();
+    });
 }
 
 void SidewaysScrollView::setOffset(int offset, int overshoot)
@@ -102,7 +106,7 @@ void TableCell::paintEvent(QPaintEvent*)
     }
     if (_accessory == Accessory::checkmark)
         drawCheckmark(painter);
-    if (sidewaysScrollView() && sidewaysScrollView()->hidesContentAtRight())
+    if (sidewaysScrollView() && sidewaysScrollView()->hidesTextAtRight())
         drawMoreMark(painter);
 }
 

@@ -1,4 +1,4 @@
-// Files dragged with the mouse from this program to the window of the monitor's.
+// Files dragged with the mouse from this program to the window of a real monitor.
 
 #include "Captures.h"
 
