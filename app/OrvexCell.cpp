@@ -136,9 +136,6 @@ void OrvexCell::layoutAsLeaf()
     if (!_view || !_value)
         return;
     _value->setGeometry(layout.value.toRect());
-    // The frame has room for bold text. Where it ends with the row, so do the values, in one column.
-    const bool endsWithRow = layout.value.right() == contentView()->width();
-    _value->setAlignment((endsWithRow ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignVCenter);
     _view->setGeometry(layout.view.toRect());
     _view->setContentSize(layout.contentSize.toSize());
 }

@@ -1,6 +1,5 @@
 #include "TableCell.h"
 
-#include "TextLabel.h"
 #include "Theme.h"
 
 #include <QPainter>
@@ -36,12 +35,9 @@ void SidewaysScrollView::setContentSize(const QSize& size)
     setOffset(_offset);
 }
 
-bool SidewaysScrollView::hidesTextAtRight() const
+bool SidewaysScrollView::hidesContentAtRight() const
 {
-    return std::ranges::any_of(_content->children(), [this](const QObject* child) {
-        const auto* const label = dynamic_cast<const TextLabel*>(child);
-        return label && _content->x() + label->x() + label->textRight() > width();
-    });
+    return _content->childrenRect().right() + _content->x() >= width();
 }
 
 void SidewaysScrollView::setOffset(int offset, int overshoot)
@@ -106,7 +102,7 @@ void TableCell::paintEvent(QPaintEvent*)
     }
     if (_accessory == Accessory::checkmark)
         drawCheckmark(painter);
-    if (sidewaysScrollView() && sidewaysScrollView()->hidesTextAtRight())
+    if (sidewaysScrollView() && sidewaysScrollView()->hidesContentAtRight())
         drawMoreMark(painter);
 }
 

@@ -20,8 +20,8 @@ public:
 
     int offset() const { return _offset; }
     int maximumOffset() const { return qMax(0, _content->width() - width()); }
-    // Whether some text is out of view to the right.
-    bool hidesTextAtRight() const;
+    // Whether some content is out of view to the right.
+    bool hidesContentAtRight() const;
     // Clamped to the content. The overshoot is how far a finger has pulled beyond the end; it is only shown.
     void setOffset(int offset, int overshoot = 0);
 

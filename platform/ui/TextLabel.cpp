@@ -45,12 +45,6 @@ void TextLabel::setLine(const QString& text)
     setText(inOneLine(text));
 }
 
-int TextLabel::textRight() const
-{
-    const bool fillsFromRight = alignment().testFlag(Qt::AlignRight);
-    return fillsFromRight ? width() : std::min(width(), sizeOfLine(text(), font()).width());
-}
-
 // Text that a scroll view cuts off fades out at the edge.
 void TextLabel::paintEvent(QPaintEvent*)
 {
@@ -59,13 +53,13 @@ void TextLabel::paintEvent(QPaintEvent*)
     const QColor color = palette().color(foregroundRole());
     painter.setPen(color);
     const QRect seen = visibleRegion().boundingRect();
-    if (room == width() && !seen.isEmpty() && seen.right() < textRight() - 1) {
+    if (room == width() && !seen.isEmpty() && seen.right() < width() - 1) {
         QLinearGradient fading(seen.right() - kFadeLength, 0, seen.right(), 0);
         fading.setColorAt(0, color);
         fading.setColorAt(1, QColor(color.red(), color.green(), color.blue(), 0));
         painter.setPen(QPen(fading, 1));
     }
-    painter.drawText(QRect(0, 0, room, height()), static_cast<int>(alignment()) | Qt::TextSingleLine,
+    painter.drawText(QRect(0, 0, room, height()), Qt::AlignLeft | Qt::AlignVCenter | Qt::TextSingleLine,
         room < width() || room < sizeOfLine(text(), font()).width()
             ? fontMetrics().elidedText(text(), Qt::ElideRight, room)
             : text());

@@ -16,8 +16,6 @@ public:
     explicit TextLabel(const QFont& font, QWidget* parent = nullptr);
 
     void setLine(const QString& text);
-    // Where the text ends, which may be before the label does.
-    int textRight() const;
 
 protected:
     void paintEvent(QPaintEvent* event) override;

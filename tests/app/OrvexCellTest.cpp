@@ -45,30 +45,6 @@ TEST(OrvexCell, MeasuresTheValueInTheBoldFontAndScrollsByBothWidths)
     }
 }
 
-TEST(OrvexCell, EndsValuesInOneColumn)
-{
-    // Ones have the same shape in each value.
-    const auto lastPixel = [](int digits, int width) {
-        OrvexCell cell(OrvexCell::Kind::leaf, "cell");
-        cell.setValue(QString(digits, '1'));
-        cell.setLayout();
-        cell.resize(width, 30);
-        const QImage image = cell.grab({0, 0, width, 29}).toImage(); // above the separator
-        int x = width - 1;
-        const auto isBlank = [&] { return image.copy(x, 0, 1, 29) == image.copy(0, 0, 1, 29); };
-        while (x > 0 && isBlank())
-            --x;
-        return x;
-    };
-    const int column = lastPixel(1, 300);
-    EXPECT_NEAR(column, 300 - TableCell::kRightInset, 3);
-    EXPECT_EQ(lastPixel(12, 300), column);
-    // Too long if it were bold: the row scrolls, but nothing is hidden.
-    const int digits = 20;
-    const int regular = sizeOfLine(QString(digits, '1'), Theme::systemFont(15)).width();
-    EXPECT_LT(lastPixel(digits, 10 + 50 + regular + 10), 10 + 50 + regular);
-}
-
 TEST(OrvexCell, PaintsHighlightAccessoriesAndTheMarkOfHiddenText)
 {
     using Accessory = TableCell::Accessory;
