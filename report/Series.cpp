@@ -29,8 +29,8 @@ void keep(std::span<const Point> bucket, std::vector<Point>& kept)
     }
     std::array<const Point*, 4> points{lowest, highest, absent, &bucket.back()};
     std::ranges::sort(points);
-    const auto repeated = std::ranges::unique(points);
-    for (auto point = points.begin(); point != repeated.begin(); ++point) {
+    const auto* const end = std::unique(points.begin(), points.end());
+    for (const auto* point = points.begin(); point != end; ++point) {
         if (*point)
             kept.push_back(**point);
     }
