@@ -37,6 +37,9 @@ WholeFile::WholeFile(const std::string& path)
         createBeside(end.path);
     }
     if (_file) {
+        constexpr std::size_t kBuffered = std::size_t{64} << 10; // 4 KiB as a rule, a system call each
+        _storage.resize(kBuffered);
+        std::setvbuf(_file.get(), _storage.data(), _IOFBF, _storage.size());
         _buffer.emplace(*_file);
         _stream.emplace(&*_buffer);
     }
@@ -67,8 +70,6 @@ std::string WholeFile::commit()
 {
     _stream->flush();
     const std::string error = closeOutputFile(std::move(_file));
-    if (_buffer->error() != 0)
-        return reasonOf(_buffer->error());
     if (!error.empty() || _temporary.empty())
         return error;
     if (::rename(_temporary.c_str(), _target.c_str()) != 0)

@@ -39,7 +39,7 @@ void Band::thin()
     // What the last bucket will hold is not known yet.
     const auto end = [&] { return (from / _bucket + 1) * _bucket; };
     while (end() <= _changes.back().position) {
-        const std::string* text = nullptr;
+        const std::string* text = &_changes[i].text;
         std::int64_t longest = -1;
         for (std::int64_t start = from; start < end();) {
             const std::int64_t next = std::min(_changes[i + 1].position, end());
