@@ -5,9 +5,13 @@
 #include "DecodeProgram.h"
 
 #include <gmock/gmock.h>
+#include <nlohmann/json.hpp>
 
 #include <cstdint>
 #include <filesystem>
+#include <map>
+#include <regex>
+#include <set>
 
 namespace orvex::test {
 namespace {
@@ -138,6 +142,66 @@ TEST_F(TimelineTest, FailsInOneLineAndLeavesNothingHalfWritten)
     EXPECT_TRUE(waitUntil([&] { return files() > before; }));
     killed.kill();
     EXPECT_EQ(sampled(), "13:20.654 0\n");
+}
+
+using Records = std::vector<std::vector<std::string>>;
+
+// The fields of each line. An empty field without quotes is "NULL".
+Records recordsOf(const std::string& csv)
+{
+    Records records(1);
+    std::string field = "NULL";
+    for (std::size_t i = 0; i < csv.size(); ++i) {
+        const bool ends = csv[i] == ',' || csv[i] == '\r';
+        if (csv[i] == '"') {
+            field.clear();
+            while (csv[++i] != '"' || csv[++i] == '"') // two are one
+                field += csv[i];
+            --i;
+        } else if (ends) {
+            records.back().push_back(std::exchange(field, "NULL"));
+        } else if (csv[i] == '\n') {
+            records.emplace_back();
+        } else {
+            field = (field == "NULL" ? "" : field) + csv[i];
+        }
+    }
+    records.pop_back();
+    return records;
+}
+
+using Rows = std::multiset<std::string>; // "path=text", with "*" for numbers
+
+void addRows(const nlohmann::json& node, Rows& rows)
+{
+    static const std::regex kNumbers("/[0-9]+(?=/|$)");
+    if (node.contains("value"))
+        rows.insert(std::regex_replace(node["path"].get<std::string>(), kNumbers, "/*") + '='
+            + node["value"].get<std::string>());
+    for (const auto& child : node.value("children", nlohmann::json::array()))
+        addRows(child, rows);
+}
+
+TEST_F(TimelineTest, EndsWithTheRowsOfTheTree)
+{
+    for (const std::string technology : kTechnologies) {
+        const QString capture = QString::fromStdString(capturePath(technology));
+        ASSERT_EQ(decode({"--timeline", name("out.csv"), "--every", "0.7", capture}).status, 0);
+        std::map<std::pair<std::string, std::string>, std::string> last;
+        const Records records = recordsOf(contentsOf("out.csv"));
+        for (const auto& record : records)
+            last[{record.at(1), record.at(2)}] = record.at(3);
+        last.erase({"path", "key"});
+        Rows shown;
+        for (const auto& [row, text] : last) {
+            if (text != "NULL")
+                shown.insert(row.first + '=' + text);
+        }
+        Rows tree;
+        addRows(nlohmann::json::parse(decode({"--format", "json", capture}).output)["tree"], tree);
+        EXPECT_EQ(shown, tree) << technology;
+        EXPECT_GT(last.size(), tree.size()) << technology;
+    }
 }
 
 TEST_F(TimelineTest, RefusesWhatItWouldIgnore)
