@@ -37,6 +37,9 @@ WholeFile::WholeFile(const std::string& path)
         createBeside(end.path);
     }
     if (_file) {
+        constexpr std::size_t kBuffered = std::size_t{64} << 10; // 4 KiB as a rule, a system call each
+        _storage.resize(kBuffered);
+        std::setvbuf(_file.get(), _storage.data(), _IOFBF, _storage.size());
         _buffer.emplace(*_file);
         _stream.emplace(&*_buffer);
     }

@@ -5,6 +5,7 @@
 #include <optional>
 #include <ostream>
 #include <string>
+#include <vector>
 
 namespace orvex {
 
@@ -33,6 +34,7 @@ private:
     std::string _target;
     std::string _temporary; // empty while there is none
     std::string _error;
+    std::vector<char> _storage; // of the file's buffer, which it outlives
     FilePointer _file;
     std::optional<FileBuffer> _buffer;
     std::optional<std::ostream> _stream;

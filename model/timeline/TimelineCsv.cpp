@@ -53,38 +53,48 @@ void TimelineCsv::sample(Date time)
 
 void TimelineCsv::addRow(std::size_t /*number*/, const TimelineRow& row)
 {
-    std::string& fields = _rows.emplace_back();
+    std::string& fields = _rows.emplace_back(",");
     appendField(fields, row.path);
     fields += ',';
     appendField(fields, row.key);
+    fields += ',';
 }
 
 void TimelineCsv::set(std::size_t number, const std::string& text)
 {
-    std::string rest;
+    beginLine(number);
     if (text.empty())
-        appendQuoted(rest, text);
+        appendQuoted(_line, text);
     else
-        appendField(rest, text);
-    rest += ',';
+        appendField(_line, text);
+    _line += ',';
     if (const auto quantity = quantityOf(text)) {
-        appendNumber(rest, quantity->number);
-        rest += ',';
-        rest += quantity->unit;
+        appendNumber(_line, quantity->number);
+        _line += ',';
+        _line += quantity->unit;
     } else {
-        rest += ',';
+        _line += ',';
     }
-    write(number, rest);
+    endLine();
 }
 
 void TimelineCsv::clear(std::size_t number)
 {
-    write(number, ",,");
+    beginLine(number);
+    _line += ",,";
+    endLine();
 }
 
-void TimelineCsv::write(std::size_t number, std::string_view rest)
+void TimelineCsv::beginLine(std::size_t number)
 {
-    _stream << _time << ',' << _rows[number] << ',' << rest << kLineEnd;
+    _line = _time;
+    _line += _rows[number];
+}
+
+void TimelineCsv::endLine()
+{
+    _line += kLineEnd;
+    _stream.write(_line.data(), static_cast<std::streamsize>(_line.size()));
 }
 
 std::string timestampOf(Date time)

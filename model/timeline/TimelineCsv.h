@@ -24,11 +24,13 @@ public:
     void clear(std::size_t number) override;
 
 private:
-    void write(std::size_t number, std::string_view rest);
+    void beginLine(std::size_t number);
+    void endLine();
 
     std::ostream& _stream;
     std::string _time;
-    std::vector<std::string> _rows; // "path,key" of each
+    std::string _line;
+    std::vector<std::string> _rows; // ",path,key," of each
 };
 
 // "2026-11-16T05:54:31.200Z"
