@@ -70,8 +70,6 @@ std::string WholeFile::commit()
 {
     _stream->flush();
     const std::string error = closeOutputFile(std::move(_file));
-    if (_buffer->error() != 0)
-        return reasonOf(_buffer->error());
     if (!error.empty() || _temporary.empty())
         return error;
     if (::rename(_temporary.c_str(), _target.c_str()) != 0)

@@ -123,6 +123,11 @@ TEST(Timeline, FollowsElementsByWhatTheyShow)
             " /*/U ARFCN|Scrambling Code 57, UARFCN 10588 gone /*/PSC|Scrambling Code 57, UARFCN 10588 gone"
             " /*/Downlink Frequency|Scrambling Code 57, UARFCN 10588=10588"
             " /*/Scrambling Code|Scrambling Code 57, UARFCN 10588=57"},
+        {"a cell whose identity is decoded later",
+            {Array::make({Dictionary::make({{"ARFCN", "24"}})}),
+                Array::make({Dictionary::make({{"ARFCN", "24"}, {"BSIC", "11"}})})},
+            " /*/ARFCN|ARFCN 24=24\n /*/ARFCN|ARFCN 24 gone"
+            " /*/ARFCN|BSIC 11, ARFCN 24=24 /*/BSIC|BSIC 11, ARFCN 24=11"},
         {"pilots, and their fingers",
             {pilots({{"_sorted", ""}, {"0;12", "a"}}),
                 pilots({{"_sorted", ""}, {"0;44", "b"}, {"1;12", "a"}, {"2;44", "c"}})},
@@ -133,12 +138,12 @@ TEST(Timeline, FollowsElementsByWhatTheyShow)
         EXPECT_EQ(followed(displays), changes) << name;
 
     // The same cell number on another channel is another cell, and twins are told apart.
-    EXPECT_EQ(
-        followed({cells("1300", {cell("7", "-80")}), cells("6300", {cell("7", "-70"), cell("7", "-75")})},
-            {"/Neighbor Cells List/*/RSRP"}),
+    EXPECT_EQ(followed({cells("1300", {cell("7", "-80")}), cells("6300", {cell("7", "-80")}),
+                           cells("6300", {cell("7", "-80"), cell("7", "-75")})},
+                  {"/Neighbor Cells List/*/RSRP"}),
         " /Neighbor Cells List/*/RSRP|Physical Cell ID 7, E-ARFCN 1300=-80\n"
         " /Neighbor Cells List/*/RSRP|Physical Cell ID 7, E-ARFCN 1300 gone"
-        " /Neighbor Cells List/*/RSRP|Physical Cell ID 7, E-ARFCN 6300=-70"
+        " /Neighbor Cells List/*/RSRP|Physical Cell ID 7, E-ARFCN 6300=-80\n"
         " /Neighbor Cells List/*/RSRP|Physical Cell ID 7, E-ARFCN 6300 (2)=-75");
 }
 
