@@ -69,7 +69,7 @@ WholeFile::~WholeFile()
 std::string WholeFile::commit()
 {
     _stream->flush();
-    const std::string error = closeOutputFile(std::move(_file));
+    std::string error = closeOutputFile(std::move(_file));
     if (!error.empty() || _temporary.empty())
         return error;
     if (::rename(_temporary.c_str(), _target.c_str()) != 0)

@@ -1,36 +1,18 @@
 #include "Timeline.h"
 
+#include "TimelineLayout.h"
 #include "TimelineNode.h"
 
 #include "Array.h"
 #include "ArrayLock.h"
 #include "Dictionary.h"
 #include "DisplayOrder.h"
-#include "NodesByPath.h"
-#include "TextFormat.h"
 
 #include <algorithm>
-#include <utility>
 
 namespace orvex {
 
 namespace {
-
-// Without the separator where there is nothing in front of it.
-std::string joined(std::string_view first, std::string_view separator, std::string_view second)
-{
-    std::string result(first);
-    if (!result.empty())
-        result += separator;
-    result += second;
-    return result;
-}
-
-// The second of the same name is "name (2)".
-std::string numbered(const std::string& name, std::size_t number)
-{
-    return number == 1 ? name : joined(name, " ", text("(%zu)", number));
-}
 
 TimelineBranch& branchOf(TimelineNode& node)
 {
@@ -56,77 +38,6 @@ bool isLaidOut(const TimelineBranch& branch, const Array& array)
         && std::ranges::equal(branch.places, array,
             [](const auto& place, const Value& element) { return place.identity.isStillOf(element); });
 }
-
-// Distributes the nodes of a branch anew. What was shown and has no place any more is left over.
-class Layout {
-public:
-    Layout(TimelineNode& node, std::size_t number)
-        : _node(node)
-        , _branch(*node.branch)
-        , _number(number)
-        , _before(std::exchange(_branch.places, {}))
-    {
-    }
-
-    TimelineNode& child(std::string_view name)
-    {
-        const auto [child, isNew, id] = claim(_branch.children, std::string(name));
-        if (isNew)
-            child.name = {pathByAppending(_node.name.path, id), _node.name.key};
-        return child;
-    }
-    TimelineNode& element(std::string identity)
-    {
-        const auto [element, isNew, id] = claim(_branch.elements, std::move(identity));
-        if (isNew) {
-            const std::string& key = _node.name.key;
-            element.name = {pathByAppending(_node.name.path, "*"), joined(key, "; ", id)};
-        }
-        return element;
-    }
-
-    template <typename Hide>
-    void finish(const TimelineFields::Part& fields, Hide hide) const
-    {
-        // An element that has moved may be wanted in other parts, and so all below it.
-        if (std::exchange(_branch.isStale, false) || !fields.isWhole()) {
-            for (const TimelineBranch::Place& place : _branch.places) {
-                if (place.node && place.node->branch)
-                    place.node->branch->isStale = true;
-            }
-        }
-        for (const TimelineBranch::Place& place : _before) {
-            if (place.node && place.node->layout != _number)
-                hide(*place.node);
-        }
-    }
-
-private:
-    struct Claim {
-        TimelineNode& node;
-        bool isNew;
-        std::string id;
-    };
-
-    Claim claim(std::unordered_map<std::string, TimelineNode>& nodes, const std::string& name)
-    {
-        const auto [first, isNewName] = nodes.try_emplace(name);
-        if (std::exchange(first->second.layout, _number) != _number)
-            return {first->second, isNewName, name};
-        for (std::size_t& count = _counts[name];;) {
-            std::string id = numbered(name, ++count + 1);
-            const auto [found, isNew] = nodes.try_emplace(id);
-            if (std::exchange(found->second.layout, _number) != _number)
-                return {found->second, isNew, std::move(id)};
-        }
-    }
-
-    TimelineNode& _node;
-    TimelineBranch& _branch;
-    std::size_t _number;
-    std::vector<TimelineBranch::Place> _before;
-    std::unordered_map<std::string, std::size_t> _counts; // of names after their first
-};
 
 } // namespace
 
@@ -214,7 +125,7 @@ void Timeline::followElements(TimelineNode& node, const Array& array, const Time
 void Timeline::layOut(TimelineNode& node, const Dictionary& dictionary, const TimelineFields::Part& fields)
 {
     TimelineBranch& branch = *node.branch;
-    Layout layout(node, ++_layouts);
+    TimelineLayout layout(node, ++_layouts);
     branch.isArray = false;
     branch.places.reserve(dictionary.size());
     for (const Dictionary::Entry& entry : dictionary)
@@ -227,13 +138,13 @@ void Timeline::layOut(TimelineNode& node, const Dictionary& dictionary, const Ti
         place.node =
             branch.elementName ? &layout.element(joined(branch.elementName, " ", name)) : &layout.child(name);
     });
-    layout.finish(fields, [this](TimelineNode& left) { hide(left); });
+    finish(layout, fields);
 }
 
 void Timeline::layOut(TimelineNode& node, const Array& array, const TimelineFields::Part& fields)
 {
     TimelineBranch& branch = *node.branch;
-    Layout layout(node, ++_layouts);
+    TimelineLayout layout(node, ++_layouts);
     branch.isArray = true;
     branch.places.reserve(array.size());
     for (const Value& element : array) {
@@ -248,9 +159,17 @@ void Timeline::layOut(TimelineNode& node, const Array& array, const TimelineFiel
             identity = number;
         else if (branch.sharedText)
             identity.append(", ").append(branch.sharedIdentity->label).append(" ").append(*branch.sharedText);
-        place.node = &layout.element(std::move(identity));
+        place.node = &layout.element(identity);
     }
-    layout.finish(fields, [this](TimelineNode& left) { hide(left); });
+    finish(layout, fields);
+}
+
+void Timeline::finish(const TimelineLayout& layout, const TimelineFields::Part& fields)
+{
+    if (layout.wasStale() || !fields.isWhole())
+        layout.markStale();
+    for (TimelineNode* node : layout.leftOver())
+        hide(*node);
 }
 
 void Timeline::addRow(TimelineNode& node)

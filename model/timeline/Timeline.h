@@ -11,6 +11,7 @@
 
 namespace orvex {
 
+class TimelineLayout;
 struct TimelineNode;
 
 // Follows the display over time: tells the sink which rows have changed between two looks at it.
@@ -37,6 +38,7 @@ private:
     void followElements(TimelineNode& node, const Array& array, const TimelineFields::Part& fields);
     void layOut(TimelineNode& node, const Dictionary& dictionary, const TimelineFields::Part& fields);
     void layOut(TimelineNode& node, const Array& array, const TimelineFields::Part& fields);
+    void finish(const TimelineLayout& layout, const TimelineFields::Part& fields);
     void addRow(TimelineNode& node);
     void hide(TimelineNode& node);
     void hideText(TimelineNode& node);
