@@ -1,8 +1,8 @@
 #!/usr/bin/env python3
 """ManyCapturesTest.py SOURCE ORVEX_DECODE: does what docs/many-captures.md says for several machines, with 40 captures and
 two hosts, each an sshd of its own on 127.0.0.1. One host goes away half-way. Every capture must be in the result exactly
-once, with the samples that one process finds in it."""
-import ctypes, os, pathlib, shutil, signal, socket, sqlite3, struct, subprocess, sys, tempfile, textwrap, time
+once, with the samples that one process finds in it and those of its own table."""
+import csv, ctypes, os, pathlib, shutil, signal, socket, sqlite3, struct, subprocess, sys, tempfile, textwrap, time
 
 PR_SET_CHILD_SUBREAPER = 36
 SLICES = 8  # captures made of each drive
@@ -137,6 +137,20 @@ def contents(database):
             for table in ("captures ORDER BY id", "paths ORDER BY id", "samples ORDER BY path, capture, n")]
 
 
+def check_tables(names, work, environment):
+    """The database says the same as the table of each capture."""
+    connection = sqlite3.connect(work / "all.sqlite")
+    for name in names:
+        table = subprocess.run([decoder, "--timeline", "-", name], cwd=work, env=environment, check=True,
+                               stdout=subprocess.PIPE, text=True).stdout
+        lines = [(*line[:4], line[4] and float(line[4]), line[5]) for line in csv.reader(table.splitlines()[1:])]
+        rows = connection.execute("SELECT time, path, key, ifnull(text, ''), ifnull(number, ''), ifnull(unit, '') "
+                                  "FROM timeline WHERE name = ?", [name]).fetchall()
+        assert sorted(lines) == sorted(rows) and len(rows) > 50, name
+        gone = connection.execute("SELECT count(*) FROM timeline WHERE name = ? AND text IS NULL", [name])
+        assert gone.fetchone()[0] == table.count(",,,\n"), name
+
+
 def check(folder):
     for key in ("host", "user"):
         subprocess.run(["ssh-keygen", "-q", "-t", "ed25519", "-N", "", "-f", folder / key], check=True)
@@ -154,6 +168,7 @@ def check(folder):
     subprocess.run([decoder, "--timeline", "one.sqlite", *names], cwd=work, env=environment, check=True)
     assert [captures, paths, samples] == contents(work / "one.sqlite"), "not what one process finds"
     assert len(samples) > 1000
+    check_tables(names[::SLICES], work, environment)
 
 
 def main():

@@ -45,10 +45,11 @@ CommandLine::Program baseProgram()
                     "Default: only at the end.",
                     "N"},
                 {"timeline",
-                    "Instead of the tree, write to FILE.csv which rows changed when, by the clock of the "
-                    "capture: time, path, key, text, number and unit. Or add that to the SQLite database "
-                    "FILE.sqlite, where each of the captures is once, however often it is added.",
-                    "FILE.csv|FILE.sqlite"},
+                    "Instead of the tree, write to FILE which rows changed when, by the clock of the "
+                    "capture: time, path, key, text, number and unit. FILE becomes a CSV table of one "
+                    "capture. If it is named .sqlite, captures are added to that database, each once, "
+                    "however often.",
+                    "FILE"},
                 {"report",
                     "Instead of the tree, write to FILE.html a page that any browser opens: plots of the "
                     "levels over time, serving cells, neighbors, contexts, log codes and the last display.",

@@ -4,20 +4,26 @@
 #include "Reporting.h"
 
 #include <algorithm>
+#include <set>
+#include <vector>
 
 namespace orvex {
 
 namespace {
 
-// Those of the same rows are the same text.
-std::string textOf(std::vector<std::string> fields)
+// The same text whatever their order.
+std::string textOf(const std::vector<std::string>& fields)
 {
-    std::ranges::sort(fields);
-    fields.erase(std::unique(fields.begin(), fields.end()), fields.end());
     std::string text;
-    for (const std::string& field : fields)
+    for (const std::string& field : std::set<std::string>(fields.begin(), fields.end()))
         (text += text.empty() ? "" : "\n") += field;
     return text;
+}
+
+// A capture without times has failed.
+Date dateOf(const std::optional<std::chrono::microseconds>& time)
+{
+    return captureDate(time.value_or(std::chrono::microseconds(0))).value_or(Date{});
 }
 
 } // namespace
@@ -43,9 +49,9 @@ void DatabaseOutput::begin(const DecodedCapture& /*capture*/)
 void DatabaseOutput::message(ByteView message, std::chrono::microseconds time)
 {
     _hash.add(message, time);
-    if (const auto date = captureDate(time)) {
-        _first = std::min(*date, _first.value_or(*date));
-        _last = std::max(*date, _last.value_or(*date));
+    if (captureDate(time)) {
+        _first = std::min(time, _first.value_or(time));
+        _last = std::max(time, _last.value_or(time));
     }
 }
 
@@ -54,8 +60,8 @@ std::string DatabaseOutput::end(const DecodedCapture& capture)
     SqliteConnection& staged = _staged->finish({.id = _hash.value(),
         .name = capture.path == kStandardStream ? "standard input" : capture.path,
         .technology = capture.technology,
-        .first = _first.value_or(Date{}), // a capture without times has failed
-        .last = _last.value_or(Date{}),
+        .first = dateOf(_first),
+        .last = dateOf(_last),
         .messages = capture.counts->total().messages,
         .every = std::chrono::duration<double>(_options.sampling.every).count(),
         .fields = textOf(_options.sampling.fields)});

@@ -7,6 +7,7 @@
 #include "database/StagedCapture.h"
 #include "database/TimelineDatabase.h"
 
+#include <chrono>
 #include <optional>
 #include <string>
 
@@ -32,8 +33,8 @@ private:
     TimelineDatabase _database;
     std::optional<StagedCapture> _staged;
     CaptureHash _hash;
-    std::optional<Date> _first; // the earliest message and the latest
-    std::optional<Date> _last;
+    std::optional<std::chrono::microseconds> _first; // the earliest message and the latest
+    std::optional<std::chrono::microseconds> _last;
 };
 
 } // namespace orvex

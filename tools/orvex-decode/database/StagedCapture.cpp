@@ -19,7 +19,7 @@ SqliteConnection makeStage()
     timeline_schema::makeTables(connection, "main");
     connection.execute(R"(
         DROP TABLE samples;
-        CREATE TABLE staged (n INTEGER PRIMARY KEY, time REAL, path INTEGER, text TEXT, number REAL, unit TEXT);
+        CREATE TABLE staged (n INTEGER, time REAL, path INTEGER, text TEXT, number REAL, unit TEXT);
         CREATE VIEW samples AS
             SELECT path, (SELECT id FROM captures) AS capture, n, time, text, number, unit FROM staged;
         BEGIN)");
@@ -35,6 +35,12 @@ StagedCapture::StagedCapture()
 {
 }
 
+void StagedCapture::sample(Date time)
+{
+    ++_samples;
+    _time = time;
+}
+
 void StagedCapture::addRow(std::size_t /*number*/, const TimelineRow& row)
 {
     _paths.push_back(identityOf(row));
@@ -46,13 +52,13 @@ void StagedCapture::set(std::size_t number, const std::string& text)
     const std::optional<Quantity> quantity = quantityOf(text);
     const auto value = quantity ? std::optional(quantity->number) : std::nullopt;
     const auto unit = quantity ? std::optional(quantity->unit) : std::nullopt;
-    _addSample.run(_count++, _time.secondsSince1970, _paths[number], std::string_view(text), value, unit);
+    _addSample.run(_samples, _time.secondsSince1970, _paths[number], std::string_view(text), value, unit);
 }
 
 void StagedCapture::clear(std::size_t number)
 {
     constexpr std::optional<std::string_view> kNothing;
-    _addSample.run(_count++, _time.secondsSince1970, _paths[number], kNothing, kNothing, kNothing);
+    _addSample.run(_samples, _time.secondsSince1970, _paths[number], kNothing, kNothing, kNothing);
 }
 
 SqliteConnection& StagedCapture::finish(const CaptureRecord& record)

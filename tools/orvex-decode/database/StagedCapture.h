@@ -28,7 +28,7 @@ class StagedCapture final : public TimelineSink {
 public:
     StagedCapture();
 
-    void sample(Date time) override { _time = time; }
+    void sample(Date time) override;
     void addRow(std::size_t number, const TimelineRow& row) override;
     void set(std::size_t number, const std::string& text) override;
     void clear(std::size_t number) override;
@@ -39,7 +39,7 @@ public:
 private:
     SqliteConnection _connection;
     Date _time;
-    std::int64_t _count = 0;
+    std::int64_t _samples = 0;
     std::vector<std::int64_t> _paths; // by row
     SqliteStatement _addPath;
     SqliteStatement _addSample;

@@ -121,7 +121,7 @@ std::string TimelineDatabase::fault() const
         const std::string directory = std::filesystem::path(_path).parent_path();
         return ::access(directory.c_str(), W_OK | X_OK) == 0 ? "" : systemError();
     }
-    if (const std::string fault = faultOfFile(); !fault.empty())
+    if (std::string fault = faultOfFile(); !fault.empty())
         return fault;
     SqliteConnection connection;
     return attach(connection, _path) ? faultOfTarget(connection) : connection.error();

@@ -29,7 +29,7 @@ constexpr const char* kTables[] = {
     R"(samples (
     path INTEGER NOT NULL REFERENCES paths,
     capture INTEGER NOT NULL REFERENCES captures,
-    n INTEGER NOT NULL,       -- counts the changes within the capture
+    n INTEGER NOT NULL,       -- counts the looks at the display, in the order of the capture
     time REAL NOT NULL,       -- seconds since 1970 UTC
     text TEXT,                -- NULL: no longer shown
     number REAL,              -- NULL unless the text is a quantity

@@ -4,11 +4,9 @@
 
 #include <string>
 
-namespace orvex {
-
 // The tables of timelines. Identities are hashes of what they identify, so that databases made apart can be
 // merged row by row; a change of tables or hashes needs another version.
-namespace timeline_schema {
+namespace orvex::timeline_schema {
 
 // Makes the tables of a connection's schema.
 bool makeTables(SqliteConnection& connection, const std::string& schema);
@@ -20,6 +18,4 @@ bool isEmpty(SqliteConnection& connection, const std::string& schema);
 // Why the schema does not hold timelines; empty if it does.
 std::string faultOf(SqliteConnection& connection, const std::string& schema);
 
-} // namespace timeline_schema
-
-} // namespace orvex
+} // namespace orvex::timeline_schema
