@@ -71,7 +71,7 @@ TEST_F(MRLLogGenerator2Test, FramesRoutesAndKeepsMessages)
     };
     for (const auto& [words, expected, lines] : cases) {
         clearState();
-        const Bytes message = PacketText(words).bytes();
+        const Bytes message = bytesOfWords(words);
         const auto generator = makeGenerator();
         generator->getDisplayFromState(state);
         RecordingLog log;

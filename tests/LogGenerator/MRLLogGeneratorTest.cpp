@@ -40,11 +40,11 @@ TEST_F(MRLLogGeneratorTest, OpensWithTheVersionReport)
 {
     clock.zone = {-12600, true};
     const Bytes dlf = dlfOf({});
-    const Bytes expected = PacketText("A100 FD1F 00*8 01 00 01 00 4F7276657820 00 " // "Orvex "
-                                      "45584543555441424C455F4E414D45 00*25 "       // "EXECUTABLE_NAME"
-                                      "446563203139203230313820 32333A3539 00 "     // "Dec 19 2018 23:59"
-                                      "00F15365 2EFF 01 00*73") // 1700000000, -210 minutes, daylight saving
-                               .bytes();
+    const Bytes expected =
+        bytesOfWords("A100 FD1F 00*8 01 00 01 00 4F7276657820 00 " // "Orvex "
+                     "45584543555441424C455F4E414D45 00*25 "       // "EXECUTABLE_NAME"
+                     "446563203139203230313820 32333A3539 00 "     // "Dec 19 2018 23:59"
+                     "00F15365 2EFF 01 00*73"); // 1700000000, -210 minutes, daylight saving
     EXPECT_EQ(dlf, expected);
 
     EXPECT_EQ(textAt(dlfOf({}, std::nullopt), 16, 7), std::string("(none)\0", 7));

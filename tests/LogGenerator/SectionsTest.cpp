@@ -89,7 +89,7 @@ struct SectionPlan {
 
 class SectionsTest : public testing::TestWithParam<const char*> {
 protected:
-    const std::vector<std::string> lines = caseLines(GetParam());
+    const std::vector<std::string> lines = caseLines(text("LogGenerator/cases/%s.txt", GetParam()));
 };
 
 INSTANTIATE_TEST_SUITE_P(, SectionsTest,
@@ -153,7 +153,7 @@ TEST_P(SectionsTest, TakeTheirPackets)
         EXPECT_EQ(*index->getSubscribers(code), sections) << code;
     const bool isLTE = GetParam() == std::string_view(telephony::kTechnologyMRL_LTE);
     std::set<std::string> laidOut;
-    const FileResources resources(ORVEX_SOURCE_DIR "/resources");
+    const FileResources resources(ORVEX_RESOURCES);
     collectSections(*index, *resources.dictionaryNamed(isLTE ? "LTE" : GetParam()).dictionary, laidOut);
     EXPECT_EQ(laidOut, planned);
 }

@@ -27,7 +27,7 @@ public:
     FixedClock clock;
     Dictionary state;
     DictionaryRef display;
-    FileResources resources{ORVEX_SOURCE_DIR "/resources"};
+    FileResources resources{ORVEX_RESOURCES};
     C2KLogGenerator generator{GeneratorEnvironment{resources, clock, {}}};
 
 private:

@@ -82,11 +82,11 @@ TEST_F(C2KLogGeneratorTest, FramesAndKeepsWhatReachesADecoder)
         state.remove("Display");
         generator->generateLogUsingState(state);
         RecordingLog log;
-        generator->updateState(state, PacketText(message).bytes());
+        generator->updateState(state, bytesOfWords(message));
         EXPECT_EQ(log.take(), lines) << message;
         EXPECT_EQ(identityShown(), shownIdentity) << message;
         generator->generateLogUsingState(state);
-        EXPECT_EQ(keptMessages(), PacketText(kept).bytes()) << message;
+        EXPECT_EQ(keptMessages(), bytesOfWords(kept)) << message;
         generator->generateLogUsingState(state);
         EXPECT_TRUE(keptMessages().empty()) << message;
     }
