@@ -70,26 +70,6 @@ TEST_F(SnapshotTest, LargeAndDeepOnesAreReadAsTheyWereWritten)
     EXPECT_TRUE(read->description == written.description);
 }
 
-TEST_F(SnapshotTest, SaysWhyAFileIsNotASnapshot)
-{
-    const std::string data = "<key>Data</key><array>";
-    const std::pair<std::string, const char*> cases[] = {
-        {"<array/>", "its property list is no dictionary"},
-        {"<dict/>", "it has no list \"Data\""},
-        {"<dict>" + data + "<string/></array></dict>", "an entry of \"Data\" is no dictionary"},
-        {"<dict>" + data + "</array></dict>", "\"Timestamp\" or \"Description\" is no text"},
-    };
-    const std::string path = directory + "/file.orvex";
-    for (const auto& [content, reason] : cases) {
-        std::ofstream(path) << R"(<plist version="1.0">)" << content << "</plist>";
-        const auto [read, error] = readSnapshot(path);
-        EXPECT_FALSE(read) << content;
-        EXPECT_EQ(error, path + ": not a snapshot: " + reason);
-    }
-    EXPECT_EQ(readSnapshot(directory + "/none").error, directory + "/none: No such file or directory");
-    EXPECT_EQ(readSnapshot(directory).error, directory + ": Is a directory");
-}
-
 TEST_F(SnapshotTest, SaysWhyItCouldNotBeWritten)
 {
     Snapshot unwritable = someSnapshot();

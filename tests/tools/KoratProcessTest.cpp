@@ -9,47 +9,12 @@
 
 #include <csignal>
 #include <filesystem>
-#include <fstream>
 #include <thread>
 
 namespace orvex::test {
 namespace {
 
 using testing::HasSubstr;
-
-TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
-{
-    const ProgramFolder folder;
-    const QString capture = folder.name("capture");
-    std::ofstream(folder.path("capture")) << std::string(1000, 'x');
-    std::filesystem::create_symlink("capture", folder.path("link"));
-    const std::string conflict = "--record " + folder.path("link") + " and --capture "
-        + folder.path("capture") + " are the same file\n";
-    const struct {
-        std::string complaint;
-        QStringList arguments;
-        int status = 2;
-    } cases[] = {
-        {"Unknown technology 'MRL_NOISE'.\nTry 'koratd --help'.", {"--technology", "MRL_NOISE"}},
-        {"--rate takes a number", {"--rate", "0"}},
-        {"--count takes a number", {"--count", "-1"}},
-        {"Unknown fault 'garbage=101'.", {"--fault", "garbage=101"}},
-        {"Unknown fault 'die-after'.", {"--fault", "die-after"}},
-        {"Unknown fault 'refuse-channel=0'.", {"--fault", "refuse-channel=0"}},
-        {"Unknown fault 'null-port=1'.", {"--fault", "null-port=1"}},
-        {conflict, {"--capture", capture, "--record", folder.name("link")}},
-        {"koratd: /no/such/capture: No such file or directory\n", {"--capture", "/no/such/capture"}, 1},
-        {"neither a pcap nor a DLF file\n", {"--capture", capture}, 1},
-        {"koratd: /dev/full: No space left on device\n", {"--record", "/dev/full"}, 1},
-    };
-    for (const auto& [complaint, arguments, status] : cases) {
-        const Result result = run(KORATD_PATH, arguments);
-        EXPECT_EQ(result.status, status) << complaint;
-        EXPECT_THAT(result.errors, HasSubstr(complaint));
-    }
-    EXPECT_EQ(std::filesystem::file_size(folder.path("capture")), 1000U);
-    EXPECT_THAT(run(KORATD_PATH, {"--help"}).output, HasSubstr("--fault"));
-}
 
 TEST(KoratProcess, StreamsWhatWasAskedForAfterTheStartCommand)
 {

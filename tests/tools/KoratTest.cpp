@@ -43,7 +43,7 @@ TEST(Subscription, TakesTheCodesThatTheCommandNames)
     }
 }
 
-TEST(Recorder, SaysOnceThatAMessageIsTooLongAndGoesOn)
+TEST(Recorder, SaysOnceThatAMessageIsTooLongForReadersAndGoesOn)
 {
     const TemporaryFile file;
     testing::internal::CaptureStderr();
@@ -58,6 +58,12 @@ TEST(Recorder, SaysOnceThatAMessageIsTooLongAndGoesOn)
         "koratd: a message of 262145 bytes is too long for the recording; only its first 262144 bytes were "
         "written\n"
         "koratd: 2 messages were cut in the recording; a replay skips them\n");
+    const auto replay = CaptureReader::open(file.path);
+    for (const std::size_t length : {262'144U, 5U}) {
+        ASSERT_EQ(replay->next(), CaptureReader::Status::message) << replay->error();
+        EXPECT_EQ(replay->message().size(), length);
+    }
+    EXPECT_EQ(replay->next(), CaptureReader::Status::end) << replay->error();
 }
 
 // A client that takes what it is sent only when the test says so.

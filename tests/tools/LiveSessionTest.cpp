@@ -4,18 +4,16 @@
 #include "KoratClient.h"
 #include "Programs.h"
 
-#include <gmock/gmock.h>
+#include <gtest/gtest.h>
 
 #include <algorithm>
 #include <csignal>
-#include <filesystem>
 #include <thread>
 
 namespace orvex::test {
 namespace {
 
 using namespace std::chrono_literals;
-using testing::HasSubstr;
 
 class LiveSession : public testing::Test {
 protected:
@@ -101,119 +99,6 @@ TEST_F(LiveSession, AServiceThatHasGoneIsHeardToItsLastMessage)
     std::this_thread::sleep_for(500ms);
     ::kill(monitor.id(), SIGCONT);
     EXPECT_TRUE(monitor.waitFor("\n300 ")) << monitor.output();
-}
-
-TEST_F(LiveSession, FullDiskEndsTheRecordingOnly)
-{
-    // A limit of the file's size stands for the disk.
-    Program korat(folder, "/bin/sh",
-        {"-c", R"(trap '' XFSZ; ulimit -f 16; exec "$0" "$@")", KORATD_PATH, "--rate", "2000", "--record",
-            folder.name("capture")});
-    KoratClient client(folder.ports());
-    ASSERT_TRUE(waitUntil([&] { return client.open() == 0; }));
-    client.send();
-    ASSERT_TRUE(korat.waitFor("File too large; recording ends here"));
-    const std::size_t before = client.messages.size();
-    EXPECT_TRUE(waitUntil([&] { return client.messages.size() > before + 1000; }));
-    EXPECT_EQ(korat.terminate(), 0);
-    EXPECT_EQ(QString::fromStdString(korat.errors()).count("recording ends"), 1) << korat.errors();
-    EXPECT_GT(messagesIn("capture").size(), 10U);
-}
-
-// Each line is run by a shell, in its own folder. What stands still would do so for ever.
-class ShellTest : public testing::Test {
-protected:
-    static Result shell(const std::string& line)
-    {
-        return run("/bin/sh",
-            {"-c",
-                "ORVEX=$0 KORATD=$1 DECODE=$2 RESOURCES=$3; mkdir -p $XDG_STATE_HOME; cd $XDG_STATE_HOME; "
-                    + QString::fromStdString(line),
-                ORVEX_PATH, KORATD_PATH, ORVEX_DECODE, ORVEX_RESOURCES});
-    }
-};
-
-TEST_F(ShellTest, FileNamesAreBytes)
-{
-    const struct {
-        const char* script;
-        int status;
-        const char* said;
-    } cases[] = {
-        {"$KORATD --record $ODD/capture & while [ ! -s $ODD/capture ]; do sleep .1; done; kill $!; wait $!",
-            0, "koratd: sent 0 messages"},
-        {"cp $RESOURCES/LTE.plist $ODD; $DECODE --technology MRL_LTE --resources $ODD --output $ODD/tree"
-         " --log $ODD/log --snapshot $ODD/snapshot $CAPTURE && cat $ODD/tree && test -s $ODD/log && "
-         "$DECODE --dlf $ODD/dlf $ODD/snapshot && test -s $ODD/dlf && $ORVEX --console --open $ODD/snapshot",
-            0, "Saved "},
-        {"$ORVEX --console $ODD", 1, R"(\xff\xe4: )"},
-        {"echo x > $ODD/log; $KORATD --capture $ODD/log", 1,
-            R"(\xff\xe4/log: neither a pcap nor a DLF file)"},
-    };
-    for (const std::string locale : {"C", "C.UTF-8"}) {
-        for (const auto& [script, status, said] : cases) {
-            const auto [result, output, errors] = shell("export LC_ALL=" + locale
-                + " CAPTURE=" ORVEX_CAPTURES "/MRL_LTE.pcap; ODD=$(printf '\\377\\344'); mkdir $ODD; ("
-                + script + "); s=$?; rm -r $ODD; exit $s");
-            EXPECT_EQ(result, status) << locale << ' ' << script << '\n' << errors;
-            EXPECT_THAT(output + errors, HasSubstr(said)) << locale << ' ' << script;
-        }
-    }
-}
-
-TEST_F(ShellTest, ProgramsEndInTimeWhateverStandsStill)
-{
-    const struct {
-        const char* name;
-        const char* line;
-        int status;
-        const char* errors;
-    } cases[] = {
-        {"painted, as was asked for", "[ $($ORVEX --until-painted 2> /dev/null) = painted ]", 0, ""},
-        {"reader gone", "{ $ORVEX --console; echo $? > s; } | true; exit $(cat s)", 0, ""},
-        {"no room", "exec $ORVEX --console > /dev/full", 1,
-            "orvex: standard output: No space left on device\n"},
-        {"no standard streams", "$ORVEX --console >&- <&-", 1,
-            "orvex: standard output: Bad file descriptor\n"},
-        {"output stuck",
-            "mkfifo f; exec 3<> f; head -c 65536 /dev/zero >&3; $ORVEX --console >&3 & p=$!; sleep 0.7; "
-            "kill $p; wait $p",
-            128 + SIGTERM, "Terminated\n"},
-        {"log stuck",
-            "mkfifo f; exec 3<> f; head -c 65536 /dev/zero >&3; $ORVEX --console > /dev/null 2>&3 & p=$!; "
-            "sleep 0.7; kill -HUP $p; wait $p",
-            128 + SIGHUP, "Hangup\n"},
-        {"readers of koratd's lines gone",
-            "{ $KORATD 2>&3 & p=$!; sleep 0.5; kill -0 $p && kill -INT $p; wait $p; echo $? > s; } 3>&1 | "
-            "true; "
-            "exit $(cat s)",
-            0, ""},
-    };
-    for (const auto& [name, line, status, errors] : cases) {
-        const auto start = std::chrono::steady_clock::now();
-        const Result result = shell(line);
-        EXPECT_EQ(result.status, status) << name;
-        EXPECT_LT(std::chrono::steady_clock::now() - start, 10s) << name;
-        EXPECT_EQ(result.errors, errors) << name;
-    }
-}
-
-TEST_F(LiveSession, AFaultIsLoggedAndLeavesTheMonitorConnecting)
-{
-    const std::pair<const char*, const char*> cases[] = {
-        {"refuse-channel=35", "_KoratServerConnectionNetworkMonitorCreateLogChannel returns error: 35!"},
-        {"null-port", "Could not create a log channel (Korat returned null port)!"},
-        {"no-reply", " ***** No response to GetTechnology; cannot configure"},
-        {"bad-reply", " ***** Could not parse reply to GetTechnology; cannot configure"},
-        {"unknown-technology", "No log generator technology works"},
-    };
-    for (const auto& [fault, line] : cases) {
-        const KoratProgram korat(folder, {"--fault", fault});
-        Program monitor(folder, ORVEX_PATH, {"--console"});
-        EXPECT_TRUE(monitor.waitFor(line)) << fault;
-        EXPECT_THAT(monitor.output(), testing::Not(HasSubstr("Updated")));
-        EXPECT_EQ(monitor.terminate(), 0) << monitor.errors();
-    }
 }
 
 } // namespace

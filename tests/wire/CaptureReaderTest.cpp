@@ -1,6 +1,5 @@
 #include "DlfRecords.h"
 #include "MTLDLFAddVersionReport.h"
-#include "PcapWriter.h"
 #include "ReadAhead.h"
 
 #include "CaptureBytes.h"
@@ -126,24 +125,6 @@ TEST(CaptureReader, LongDlfIsReadAsAStream)
     const TemporaryFile file;
     EXPECT_TRUE(contentOf(writeFile(file.path, dlf)) == expected) << expected.size();
     EXPECT_GT(expected.size(), 5'000U);
-}
-
-TEST(PcapWriter, MessageLongerThanReadersTakeSpoilsNothing)
-{
-    const TemporaryFile file;
-    constexpr std::size_t kLongest = 262'144;
-    {
-        PcapWriter writer(file.path);
-        for (const std::size_t length : {kLongest, kLongest + 1, std::size_t{5}})
-            writer.write(Bytes(length, 7), 1s);
-    }
-    const auto reader = CaptureReader::open(file.path);
-    for (const std::size_t length : {kLongest, std::size_t{5}}) {
-        ASSERT_EQ(reader->next(), CaptureReader::Status::message) << reader->error();
-        EXPECT_EQ(reader->message().size(), length);
-    }
-    EXPECT_EQ(reader->next(), CaptureReader::Status::end) << reader->error();
-    EXPECT_THAT(reader->omissions(), testing::HasSubstr("1 packets"));
 }
 
 TEST(ReadAhead, KeepsLongCapturesInOrderAndMayBeLeft)

@@ -8,48 +8,16 @@
 
 #include <gtest/gtest.h>
 
+#include <fstream>
+
 namespace orvex::korat {
 namespace {
 
 // The objects of an LTE modem as an AT modem of version 1.20 has them.
 DictionaryRef objects()
 {
-    const Value none = Dictionary::make();
-    return Dictionary::make({
-        {"/org/freedesktop/ModemManager1/Modem/3",
-            Dictionary::make({
-                {kModemInterface,
-                    Dictionary::make({{"Manufacturer", "Example"}, {"Model", "M\x1b[1m"},
-                        {"Revision", "1.0.0"}, {"EquipmentIdentifier", "490154203237518"}, {"State", 11},
-                        {"AccessTechnologies", 0xC000}, {"SignalQuality", Array::make({64, true})},
-                        {"Sim", "/SIM/0"}, {"OwnNumbers", Array::make({"+15551234567"})},
-                        {"Bearers", Array::make({"/Bearer/0", "/Bearer/1"})}})},
-                {kModem3gppInterface,
-                    Dictionary::make({{"RegistrationState", 5}, {"OperatorCode", "00101"},
-                        {"OperatorName", "Test Net"}, {"Imei", "490154203237518"}})},
-                {kSignalInterface,
-                    Dictionary::make({{"Rate", 5}, {"Gsm", none},
-                        {"Lte", Dictionary::make({{"rsrp", -89.0}, {"rsrq", -10.0}, {"snr", 7.4}})}})},
-            })},
-        {"/SIM/0",
-            Dictionary::make({{kSimInterface,
-                Dictionary::make({{"SimIdentifier", "89000101123456789001"}, {"Imsi", "001010123456789"},
-                    {"Eid", "89049032000001"}, {"OperatorIdentifier", "00101"},
-                    {"OperatorName", "Home Op"}})}})},
-        {"/Bearer/0",
-            Dictionary::make({{kBearerInterface,
-                Dictionary::make({{"Connected", true}, {"Interface", "wwan0"},
-                    {"Properties",
-                        Dictionary::make(
-                            {{"apn", "internet.example"}, {"user", "u"}, {"password", "secret"}})},
-                    {"Ip4Config",
-                        Dictionary::make({{"method", 2}, {"address", "10.20.30.40"}, {"prefix", 30},
-                            {"dns1", "192.0.2.53"}, {"gateway", "10.20.30.41"}})},
-                    {"Ip6Config", Dictionary::make({{"address", "2001:db8::1"}, {"prefix", 64}})},
-                    {"Stats",
-                        Dictionary::make(
-                            {{"duration", 61}, {"rx-bytes", 5'000'000'000}, {"tx-bytes", 7}})}})}})},
-    });
+    std::ifstream file(ORVEX_TESTS "/tools/modem/objects.json");
+    return valueOf(Json::parse(file)).dictionary();
 }
 
 constexpr const char* kModemPath = "/org/freedesktop/ModemManager1/Modem/3";
