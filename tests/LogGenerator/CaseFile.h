@@ -8,6 +8,30 @@
 
 namespace orvex::test {
 
+// "[NAME] CODE/MINIMUM CODE ... | ENTRY LINE | other codes": a section, its codes in order, the length below
+// which their packets change nothing, the line that it logs for every packet, and that it reports others.
+struct SectionPlan {
+    explicit SectionPlan(const std::string& heading)
+    {
+        std::string rest;
+        std::tie(name, rest) = divided(heading.substr(1), "]");
+        const auto [codeWords, lines] = divided(rest, " | ");
+        std::tie(entryLine, otherCodes) = divided(lines, " | ");
+        std::istringstream words(codeWords);
+        for (std::string word; words >> word;) {
+            const auto [code, length] = divided(word, "/");
+            codes.push_back(static_cast<LogCode>(std::stol(code, nullptr, 16)));
+            minimumLengths.push_back(length.empty() ? 0 : std::stoul(length));
+        }
+    }
+
+    std::string name;
+    std::vector<LogCode> codes;
+    std::vector<std::size_t> minimumLengths; // 0: never refused for its length
+    std::string entryLine;
+    std::string otherCodes;
+};
+
 // "PACKETS -> SHOWN" or "PACKETS -> SHOWN !! LOG". Several packets, as packetOfText() reads them, are
 // separated by ";".
 struct PacketCase {

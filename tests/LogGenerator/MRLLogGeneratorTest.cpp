@@ -52,17 +52,6 @@ TEST_F(MRLLogGeneratorTest, OpensWithTheVersionReport)
     EXPECT_EQ(textAt(dlfOf({}), 85, 4), std::string(4, '\0')) << "truncated toward zero";
 }
 
-TEST_F(MRLLogGeneratorTest, AppendsTheHistoryWithoutTheFirstByteOfEachEntry)
-{
-    const auto entry = [](const Bytes& packets) {
-        return Dictionary::make({{"DisplayState", std::make_shared<Bytes>(packets)}});
-    };
-    state.set(
-        "History", Array::make({entry({1, 2, 3}), entry({9}), entry({}), Dictionary::make(), entry({1, 4})}));
-    const Bytes dlf = dlfOf(state);
-    EXPECT_EQ(Bytes(dlf.begin() + 161, dlf.end()), (Bytes{2, 3, 4}));
-}
-
 TEST_F(MRLLogGeneratorTest, SaveContentsAreTheHistoryAndTheDLF)
 {
     const ProbeGenerator generator({resources, clock, {}});
