@@ -33,15 +33,22 @@ struct SectionPlan {
 };
 
 // "PACKETS -> SHOWN" or "PACKETS -> SHOWN !! LOG". Several packets, as packetOfText() reads them, are
-// separated by ";".
+// separated by ";"; "7 x PACKET" is as many.
 struct PacketCase {
     explicit PacketCase(const std::string& line)
     {
         const auto [texts, outcome] = divided(line, " -> ");
         std::istringstream stream(texts);
         for (std::string text; std::getline(stream, text, ';');)
-            packets.push_back(packetOfText(text));
+            add(divided(text, " x "));
         std::tie(shown, log) = divided(outcome, " !! ");
+    }
+
+    void add(const std::pair<std::string, std::string>& text)
+    {
+        const auto& [first, repeated] = text;
+        const std::size_t times = repeated.empty() ? 1 : std::stoul(first);
+        packets.insert(packets.end(), times, packetOfText(repeated.empty() ? first : repeated));
     }
 
     std::vector<Bytes> packets;

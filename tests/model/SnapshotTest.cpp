@@ -1,7 +1,5 @@
 #include "Snapshot.h"
 
-#include "DisplayTreePrinter.h"
-#include "PropertyList.h"
 #include "SnapshotTree.h"
 
 #include <gtest/gtest.h>
@@ -81,20 +79,6 @@ TEST_F(SnapshotTest, SaysWhyItCouldNotBeWritten)
     EXPECT_EQ(writeSnapshot(someSnapshot(), directory + "/gone/x.orvex"),
         directory + "/gone/x.orvex: No such file or directory");
     EXPECT_EQ(writeSnapshot(someSnapshot(), "/dev/full"), "/dev/full: No space left on device");
-}
-
-TEST(SnapshotTree, ShowsDisplaysThenTheSizeOfTheDLFAndTheDescription)
-{
-    Snapshot snapshot = someSnapshot();
-    snapshot.data->append(Dictionary::make({{"Display", Array::make({"c"})}}));
-    snapshot.data->append(Dictionary::make({{"DLF", std::make_shared<Bytes>(3)}}));
-    const std::string entries = "Orvex\n  Snapshot (x)\n    A\n      0: b\n  (no description)\n    0: c\n";
-    EXPECT_EQ(DisplayTreePrinter::text(*snapshotTree(snapshot)),
-        entries + "  DLF: 3 bytes\n  Description: words\n");
-    snapshot.description.clear();
-    snapshot.data->append(Dictionary::make({{"DLF", std::make_shared<Bytes>(4)}}));
-    EXPECT_EQ(
-        DisplayTreePrinter::text(*snapshotTree(snapshot)), entries + "  DLF: 7 bytes\n  Description: —\n");
 }
 
 TEST(NumberedRows, NoRowHidesAnother)

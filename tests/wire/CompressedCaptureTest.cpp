@@ -1,6 +1,7 @@
 #include "CaptureReader.h"
 
 #include "CaptureBytes.h"
+#include "PcapWriter.h"
 #include "TemporaryFile.h"
 
 #include <gtest/gtest.h>
@@ -28,20 +29,19 @@ std::size_t messagesIn(CaptureReader& reader)
 }
 
 // Longer than what is read ahead to tell the kind of file.
-Bytes longPcap()
+void writeLongPcap(const std::string& path)
 {
-    PcapFile file;
+    PcapWriter file(path);
     for (std::size_t i = 0; i < 3'000; ++i)
-        file.add(Bytes(1 + i % 1'500, static_cast<std::uint8_t>(i * i)));
-    return file.bytes;
+        file.write(Bytes(1 + i % 1'500, static_cast<std::uint8_t>(i * i)), {});
 }
 
-Bytes longDlf()
+void writeLongDlf(const std::string& path)
 {
     Bytes dlf;
     for (std::size_t i = 0; dlf.size() < std::size_t{3} << 20; ++i)
         dlf += dlfRecord(12 + i % 1'000, static_cast<std::uint8_t>(i), 0);
-    return dlf += Bytes(5); // makes no record
+    writeFile(path, dlf);
 }
 
 // What is whole is read as from the file itself: tests/tools/transcripts/decode.txt.
@@ -49,8 +49,8 @@ TEST(CompressedCapture, GivesWhatIsWholeBeforeItBreaks)
 {
     const TemporaryFile file;
     for (const std::string compressor : {"gzip", "xz"}) {
-        for (const Bytes& plain : {longPcap(), longDlf()}) {
-            writeFile(file.path, plain);
+        for (const auto& write : {writeLongPcap, writeLongDlf}) {
+            write(file.path);
             const auto all = messagesIn(*CaptureReader::open(file.path));
             const auto compress = compressor + " -c " + file.path + " > " + file.path + ".packed";
             ASSERT_EQ(std::system(compress.c_str()), 0); // NOLINT(cert-env33-c,concurrency-mt-unsafe)

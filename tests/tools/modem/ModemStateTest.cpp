@@ -51,28 +51,21 @@ TEST(ModemState, IsShownWithoutIdentitiesUnlessTheyAreAskedFor)
 
 TEST(ModemState, SaysWhatStandsInTheWay)
 {
-    const struct {
-        int state;
-        const char* property;
-        int value;
-        const char* line;
-    } cases[] = {
-        {-1, "StateFailedReason", 2, "The modem has failed: the SIM is missing"},
-        {2, "UnlockRequired", 2, "The modem is locked and wants SIM PIN"},
-        {2, "UnlockRequired", 77, "The modem is locked and wants a code"},
-        {3, "UnlockRequired", 1, "The modem is not enabled"},
-        {8, "UnlockRequired", 1, ""},
+    const std::pair<const char*, const char*> cases[] = {
+        {R"({"State": -1, "StateFailedReason": 2})", "The modem has failed: the SIM is missing"},
+        {R"({"State": 2, "UnlockRequired": 2})", "The modem is locked and wants SIM PIN"},
+        {R"({"State": 2, "UnlockRequired": 77})", "The modem is locked and wants a code"},
+        {R"({"State": 3, "UnlockRequired": 1})", "The modem is not enabled"},
+        {R"({"State": 8, "UnlockRequired": 1})", ""},
     };
-    for (const auto& [state, property, value, line] : cases) {
-        const auto modem = Dictionary::make({{"State", state}, {property, value}});
-        const auto all = Dictionary::make({{"/a", Dictionary::make({{kModemInterface, modem}})}});
-        EXPECT_EQ(conditionLine(modemStateOf(*all, "/a", false)), line);
+    for (const auto& [properties, line] : cases) {
+        const Value all = valueOf({{"/a", {{kModemInterface, Json::parse(properties)}}}});
+        EXPECT_EQ(conditionLine(modemStateOf(*all.dictionary(), "/a", false)), line);
     }
-    const auto wrong = Dictionary::make({{"State", "11"}, {"SignalQuality", Array::make()}, {"Sim", 7},
-        {"Bearers", "/Bearer/0"}, {"OwnNumbers", Array::make({1})}, {"AccessTechnologies", -1}});
-    const auto all =
-        Dictionary::make({{"/a", Dictionary::make({{kModemInterface, wrong}, {kSignalInterface, 3}})}});
-    const ModemState state = modemStateOf(*all, "/a", true);
+    const auto wrong = valueOf(Json::parse(R"({"/a": {"org.freedesktop.ModemManager1.Modem": {"State": "11",
+        "SignalQuality": [], "Sim": 7, "Bearers": "/Bearer/0", "OwnNumbers": [1], "AccessTechnologies": -1},
+        "org.freedesktop.ModemManager1.Modem.Signal": 3}})"));
+    const ModemState state = modemStateOf(*wrong.dictionary(), "/a", true);
     EXPECT_EQ(test::shown(section(display("IFX", state), "Modem")), "State: unknown");
     EXPECT_EQ(conditionLine(state), "The modem is not enabled");
 }
@@ -94,10 +87,7 @@ TEST(ModemState, OfSeveralModemsTheFirstThatIsEnabledIsWatched)
 
 TEST(ModemLocation, IsWhatTheNetworkTells)
 {
-    const struct {
-        const char* text;
-        const char* shown;
-    } cases[] = {
+    const std::pair<const char*, const char*> cases[] = {
         {"001,01,1234,D30156,0", "{Network=001-01, LAC=4660, Cell ID=13828438}"},
         {"310,410,FFFE,1A2D001,84CD", "{Network=310-410, LAC=65534, TAC=33997, Cell ID=27447297}"},
         {"001,01,0,0,0", "(null)"},
