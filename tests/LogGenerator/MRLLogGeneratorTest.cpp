@@ -85,11 +85,8 @@ TEST_F(MRLLogGeneratorTest, RawPacketsStayWithinTheirLimit)
     const auto aged = [](int bytes) {
         return Lines{text("<4>The history dropped its oldest raw packets, %d bytes", bytes)};
     };
-    const struct {
-        int packets; // of 4 bytes, in this interval
-        Sizes kept;
-        Lines lines;
-    } intervals[] = {
+    // How many packets of 4 bytes arrive in an interval, and what is kept then.
+    const std::tuple<int, Sizes, Lines> intervals[] = {
         {5, {20}, {}},
         {15, {20, 60}, {}}, // the limit
         {3, {0, 60, 12}, aged(20)},

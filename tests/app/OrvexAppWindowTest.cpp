@@ -21,18 +21,6 @@ namespace {
 
 using namespace std::chrono_literals;
 
-// Counts the paint events of all widgets.
-class PaintCounter final : public QObject {
-public:
-    bool eventFilter(QObject*, QEvent* event) override
-    {
-        count += event->type() == QEvent::Paint ? 1 : 0;
-        return false;
-    }
-
-    int count = 0;
-};
-
 struct OrvexAppWindowTest : testing::Test, SessionFixture {
     OrvexAppWindowTest()
     {
@@ -96,13 +84,9 @@ TEST_F(OrvexAppWindowTest, UpdatesItsScreensWhenSomebodyLooksAgain)
     ASSERT_EQ(neighbors().rowCount(), 1);
     app->window()->windowHandle()->setVisible(false);
     QCoreApplication::processEvents();
-    PaintCounter paints;
-    qApp->installEventFilter(&paints);
     deliverNeighbors(2);
     refresh();
-    QTest::qWait(100);
-    EXPECT_EQ(paints.count, 0);
-    EXPECT_EQ(neighbors().rowCount(), 1);
+    EXPECT_EQ(neighbors().rowCount(), 1) << "nobody can see it";
     app->window()->windowHandle()->setVisible(true);
     EXPECT_TRUE(QTest::qWaitFor([&] { return neighbors().rowCount() == 2; }));
 }

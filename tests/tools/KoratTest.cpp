@@ -138,21 +138,14 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
 TEST_F(StreamerTest, RestsAfterTheEndAndRepeatsOnlyWhatIsWanted)
 {
     const TemporaryFile file;
-    const struct {
-        const char* name;
-        int wantedCode;
-        std::uint8_t length;
-        bool once;
-        std::optional<std::uint64_t> count;
-        std::size_t atLeast;
-        bool rests;
-    } cases[] = {
-        {"one round", 1, 3, true, {}, 3, true},
-        {"endless", 1, 3, false, {}, 30, false},
-        {"so many of those that are wanted", 1, 3, false, 30, 30, true},
-        {"endless, nothing in it", 1, 0, false, {}, 0, true},
-        {"endless, nothing wanted in it", 2, 3, false, {}, 0, true},
-    };
+    const std::tuple<const char*, int, std::uint8_t, bool, std::optional<std::uint64_t>, std::size_t, bool>
+        cases[] = {
+            {"one round", 1, 3, true, {}, 3, true},
+            {"endless", 1, 3, false, {}, 30, false},
+            {"so many of those that are wanted", 1, 3, false, 30, 30, true},
+            {"endless, nothing in it", 1, 0, false, {}, 0, true},
+            {"endless, nothing wanted in it", 2, 3, false, {}, 0, true},
+        };
     for (const auto& [name, wantedCode, length, once, count, atLeast, rests] : cases) {
         client->received.clear();
         {
