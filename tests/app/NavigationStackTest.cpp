@@ -57,7 +57,7 @@ TEST_F(NavigationStackTest, BackButtonAndKeysPopAllButTheRoot)
     }
 }
 
-TEST_F(NavigationStackTest, AResizeFinishesARunningSlide)
+TEST_F(NavigationStackTest, APushOrAResizeFinishesARunningSlide)
 {
     setAnimationsEnabled(true);
     Screen& root = stack.topScreen();
@@ -65,9 +65,12 @@ TEST_F(NavigationStackTest, AResizeFinishesARunningSlide)
     const QPointer<Screen> a = &stack.topScreen();
     EXPECT_EQ(a->x(), 300);
     EXPECT_TRUE(QTest::qWaitFor([&] { return a->x() < 280 && root.x() < 0; }, 1000));
-    stack.resize(500, 700);
-    EXPECT_EQ(a->geometry(), QRect(0, 0, 500, 700 - 44 - 44));
+    stack.push(screen("B"), true);
     EXPECT_FALSE(root.isVisible());
+    stack.resize(500, 700);
+    EXPECT_EQ(stack.topScreen().geometry(), QRect(0, 0, 500, 700 - 44 - 44));
+    EXPECT_FALSE(a->isVisible());
+    stack.pop(true);
     stack.pop(true);
     EXPECT_TRUE(a->isVisible()) << "on its way out";
     EXPECT_TRUE(QTest::qWaitFor([&] { return !stack.isAnimating() && !a; }, 1000));

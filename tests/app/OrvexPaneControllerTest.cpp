@@ -28,6 +28,7 @@ TEST_F(OrvexPaneControllerTest, ShowsThatItIsBusyWhileItIsSeen)
     show(Tree(rows({})));
     top().setStatus("Updated", false);
     EXPECT_TRUE(top().toolbarRow()->items()[0].widget->isHidden());
+    EXPECT_EQ(static_cast<TextLabel*>(top().toolbarRow()->items()[1].widget)->text(), "Updated");
     top().setStatus(std::nullopt, true);
     const auto& items = top().toolbarRow()->items();
     EXPECT_EQ(static_cast<TextLabel*>(items[1].widget)->text(), "");

@@ -133,5 +133,12 @@ TEST_F(OrvexSaveViewControllerTest, CancelAndEscapeSaveNothing)
     }
 }
 
+TEST_F(OrvexSaveViewControllerTest, SavesNothingWithoutAPlaceForIt)
+{
+    OrvexSaveViewController(nullptr, clock, "", [] {}).savePressed();
+    EXPECT_EQ(log.lines.back(), "<3>Unable to write snapshot to " + snapshotPath("", clock.now()));
+    EXPECT_FALSE(std::filesystem::exists(snapshotPath("", clock.now())));
+}
+
 } // namespace
 } // namespace orvex::test

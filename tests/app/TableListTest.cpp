@@ -4,6 +4,7 @@
 #include "TableCell.h"
 
 #include <QApplication>
+#include <QScroller>
 #include <QTest>
 #include <QWheelEvent>
 
@@ -139,6 +140,22 @@ TEST_F(TableListTest, AGestureKeepsToItsFirstAxis)
     EXPECT_EQ(sidewaysAt(11), 0);
     list.reloadData();
     EXPECT_NEAR(sidewaysAt(12), 140, 3);
+    EXPECT_TRUE(rows.opened.empty());
+}
+
+TEST_F(TableListTest, APressThatStopsAFlingOpensNothing)
+{
+    QTest::mousePress(&list, Qt::LeftButton, {}, {150, 400});
+    for (int y = 380; y > 100; y -= 40)
+        QTest::mouseMove(&list, {150, y}, 10);
+    QTest::mouseRelease(&list, Qt::LeftButton, {}, {150, 80}, 10);
+    const int atRelease = list.contentOffset();
+    EXPECT_TRUE(QTest::qWaitFor([&] { return list.contentOffset() > atRelease + 50; }, 2000));
+    ASSERT_EQ(QScroller::scroller(&list)->state(), QScroller::Scrolling);
+    QTest::mouseClick(&list, Qt::LeftButton, {}, {150, 200});
+    const int stopped = list.contentOffset();
+    QTest::qWait(60);
+    EXPECT_EQ(list.contentOffset(), stopped);
     EXPECT_TRUE(rows.opened.empty());
 }
 

@@ -91,6 +91,8 @@ TEST(CaptureReader, LongDlfIsReadAsAStream)
     const TemporaryFile file;
     EXPECT_TRUE(contentOf(writeFile(file.path, dlf)) == expected) << expected.size();
     EXPECT_GT(expected.size(), 5'000U);
+    ReadAhead left(CaptureReader::open(file.path)); // ends while there is more to read
+    EXPECT_EQ(left.next(), CaptureReader::Status::message);
 }
 
 } // namespace

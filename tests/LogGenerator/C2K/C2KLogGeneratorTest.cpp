@@ -102,6 +102,7 @@ TEST_F(C2KLogGeneratorTest, WithoutATemplateMessagesAreKept)
     EXPECT_TRUE(generator->generateLogUsingState(state).isNull());
     EXPECT_EQ(log.take(), Lines(2, "<3>Cannot load C2K template for display"));
     EXPECT_EQ(keptMessages(), identity(7));
+    EXPECT_EQ(generator->templateError(state), "C2KTemplate.plist: missing");
 }
 
 TEST_F(C2KLogGeneratorTest, TechnologiesTakeTurnsOnOneState)
