@@ -22,6 +22,21 @@ inline Bytes dlfRecord(std::size_t length, std::uint8_t time, std::uint8_t fill 
     return record;
 }
 
+// Records of all lengths, and between them bytes that make none; longer than what is read at once.
+inline Bytes longDlf()
+{
+    Bytes dlf;
+    for (std::size_t i = 0; dlf.size() < std::size_t{3} << 20; ++i) {
+        dlf += dlfRecord(i % 97 == 0 ? 65'535 : 12 + i % 1'000, static_cast<std::uint8_t>(i), 0);
+        if (i % 50 == 0)
+            dlf += Bytes(i); // makes no record
+    }
+    dlf += Bytes(std::size_t{2} << 20); // longer than a window
+    dlf += dlfRecord(40, 1);
+    dlf += dlfRecord(50, 2);
+    return dlf;
+}
+
 inline std::string writeFile(const std::string& path, const Bytes& bytes)
 {
     std::ofstream(path, std::ios::binary)

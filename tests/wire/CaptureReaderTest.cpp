@@ -74,15 +74,7 @@ TEST(CaptureReader, GivesWhatIsWholeAndSaysWhatIsNot)
 // Read window by window it gives the records that it gives as a whole.
 TEST(CaptureReader, LongDlfIsReadAsAStream)
 {
-    Bytes dlf;
-    for (std::size_t i = 0; dlf.size() < std::size_t{3} << 20; ++i) {
-        dlf += dlfRecord(i % 97 == 0 ? 65'535 : 12 + i % 1'000, static_cast<std::uint8_t>(i), 0);
-        if (i % 50 == 0)
-            dlf += Bytes(i); // makes no record
-    }
-    dlf += Bytes(std::size_t{2} << 20); // longer than a window
-    dlf += dlfRecord(40, 1);
-    dlf += dlfRecord(50, 2);
+    const Bytes dlf = longDlf();
     std::string expected = "0 us:";
     DlfRecords records(dlf);
     while (const auto record = records.next())

@@ -38,10 +38,7 @@ void writeLongPcap(const std::string& path)
 
 void writeLongDlf(const std::string& path)
 {
-    Bytes dlf;
-    for (std::size_t i = 0; dlf.size() < std::size_t{3} << 20; ++i)
-        dlf += dlfRecord(12 + i % 1'000, static_cast<std::uint8_t>(i), 0);
-    writeFile(path, dlf);
+    writeFile(path, longDlf());
 }
 
 // What is whole is read as from the file itself: tests/tools/transcripts/decode.txt.
