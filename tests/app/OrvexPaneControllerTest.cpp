@@ -27,6 +27,7 @@ TEST_F(OrvexPaneControllerTest, ShowsThatItIsBusyWhileItIsSeen)
 {
     show(Tree(rows({})));
     top().setStatus("Updated", false);
+    EXPECT_EQ(top().toolbarRow()->items().size(), 3U) << "no button where saving is not offered";
     EXPECT_TRUE(top().toolbarRow()->items()[0].widget->isHidden());
     EXPECT_EQ(static_cast<TextLabel*>(top().toolbarRow()->items()[1].widget)->text(), "Updated");
     top().setStatus(std::nullopt, true);
