@@ -8,6 +8,7 @@
 #include "MessageFrame.h"
 #include "PacketText.h"
 
+#include <algorithm>
 #include <map>
 #include <random>
 

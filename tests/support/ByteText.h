@@ -2,6 +2,7 @@
 
 #include "Value.h"
 
+#include <algorithm>
 #include <charconv>
 #include <sstream>
 #include <string>
