@@ -81,7 +81,7 @@ TEST(RecordList, ThrowsBeyondItsCount)
     EXPECT_THROW(LogCode_0xD00C(channels).compositeChannels()[0].sir(6), ArrayOutOfBoundsException);
     const Bytes gsm = packetOfText("B186: @19 0100 0000 0200 00000000");
     EXPECT_THROW(LogCode_0xB186(gsm).candidates()[0].lteFields(), ArrayOutOfBoundsException);
-    const Bytes set = PacketText("03 EE 7800 0100 01 00 01 00 0000 0700 00*108").bytes();
+    const Bytes set = bytesOfWords("03 EE 7800 0100 01 00 01 00 0000 0700 00*108");
     EXPECT_THROW(LogCode_0x119C_ActiveSet(Subpacket(PacketReader(set))).pilot(1), ArrayOutOfBoundsException);
 }
 

@@ -90,7 +90,7 @@ INSTANTIATE_TEST_SUITE_P(, CaptureTrees, testing::ValuesIn(kTechnologies),
 
 TEST_P(CaptureTrees, ShowWhatTheyShowed)
 {
-    const FileResources templates(ORVEX_SOURCE_DIR "/resources");
+    const FileResources templates(ORVEX_RESOURCES);
     auto generator = LogGenerator::generatorFromTechnology(GetParam(), {templates, clock, {}});
     std::string all = newLines();
     const DictionaryRef command = generator->getStartCommand();
@@ -112,7 +112,7 @@ TEST_P(CaptureTrees, ShowWhatTheyShowed)
     generator.reset();
     all += "end\n" + newLines();
 
-    const std::string path = text("%s/tests/LogGenerator/captures/%s.txt", ORVEX_SOURCE_DIR, GetParam());
+    const std::string path = text(ORVEX_TESTS "/LogGenerator/captures/%s.txt", GetParam());
     if (std::getenv("ORVEX_RECORD"))
         std::ofstream(path) << all;
     std::stringstream expected;

@@ -1,54 +1,54 @@
 #pragma once
 
+#include "CaseLines.h"
 #include "PacketText.h"
 
-#include <fstream>
 #include <map>
-#include <regex>
 #include <tuple>
 
 namespace orvex::test {
 
-// What stands before and after the separator; all of the text and nothing where there is none.
-inline std::pair<std::string, std::string> divided(const std::string& text, std::string_view separator)
-{
-    const auto place = text.find(separator);
-    if (place == std::string::npos)
-        return {text, ""};
-    return {text.substr(0, place), text.substr(place + separator.size())};
-}
-
-// The lines of cases/NAME.txt. Those that begin with "#" are comments, indented ones continue the line before
-// them, and "\n" stands for a line break.
-inline std::vector<std::string> caseLines(const std::string& name)
-{
-    static const std::regex kLineBreak(R"(\\n)");
-    std::ifstream file(ORVEX_SOURCE_DIR "/tests/LogGenerator/cases/" + name + ".txt");
-    std::vector<std::string> lines;
-    for (std::string line; std::getline(file, line);) {
-        if (line.empty() || line[0] == '#')
-            continue;
-        line = std::regex_replace(line, kLineBreak, "\n");
-        if (line[0] == ' ')
-            lines.back() += line.substr(line.find_first_not_of(' ') - 1);
-        else
-            lines.push_back(line);
+// "[NAME] CODE/MINIMUM CODE ... | ENTRY LINE | other codes": a section, its codes in order, the length below
+// which their packets change nothing, the line that it logs for every packet, and that it reports others.
+struct SectionPlan {
+    explicit SectionPlan(const std::string& heading)
+    {
+        std::string rest;
+        std::tie(name, rest) = divided(heading.substr(1), "]");
+        const auto [codeWords, lines] = divided(rest, " | ");
+        std::tie(entryLine, otherCodes) = divided(lines, " | ");
+        std::istringstream words(codeWords);
+        for (std::string word; words >> word;) {
+            const auto [code, length] = divided(word, "/");
+            codes.push_back(static_cast<LogCode>(std::stol(code, nullptr, 16)));
+            minimumLengths.push_back(length.empty() ? 0 : std::stoul(length));
+        }
     }
-    if (lines.empty())
-        throw std::runtime_error(name + ".txt: no cases");
-    return lines;
-}
+
+    std::string name;
+    std::vector<LogCode> codes;
+    std::vector<std::size_t> minimumLengths; // 0: never refused for its length
+    std::string entryLine;
+    std::string otherCodes;
+};
 
 // "PACKETS -> SHOWN" or "PACKETS -> SHOWN !! LOG". Several packets, as packetOfText() reads them, are
-// separated by ";".
+// separated by ";"; "7 x PACKET" is as many.
 struct PacketCase {
     explicit PacketCase(const std::string& line)
     {
         const auto [texts, outcome] = divided(line, " -> ");
         std::istringstream stream(texts);
         for (std::string text; std::getline(stream, text, ';');)
-            packets.push_back(packetOfText(text));
+            add(divided(text, " x "));
         std::tie(shown, log) = divided(outcome, " !! ");
+    }
+
+    void add(const std::pair<std::string, std::string>& text)
+    {
+        const auto& [first, repeated] = text;
+        const std::size_t times = repeated.empty() ? 1 : std::stoul(first);
+        packets.insert(packets.end(), times, packetOfText(repeated.empty() ? first : repeated));
     }
 
     std::vector<Bytes> packets;

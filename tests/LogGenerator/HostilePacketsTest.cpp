@@ -8,6 +8,7 @@
 #include "MessageFrame.h"
 #include "PacketText.h"
 
+#include <algorithm>
 #include <map>
 #include <random>
 
@@ -71,7 +72,7 @@ protected:
     }
 
 private:
-    FileResources _templates{ORVEX_SOURCE_DIR "/resources"};
+    FileResources _templates{ORVEX_RESOURCES};
     ConsoleLines _console;
     std::unique_ptr<LogGenerator> _generator =
         LogGenerator::generatorFromTechnology(GetParam(), {_templates, clock, {}, 0});

@@ -14,20 +14,6 @@ TEST_F(LogGeneratorTest, OtherTechnologiesHaveNoGenerator)
         EXPECT_EQ(LogGenerator::generatorFromTechnology(unknown, environment()), nullptr);
 }
 
-TEST_F(LogGeneratorTest, HistoryKeepsTheNewestFive)
-{
-    for (const auto& [before, oldest] : {std::pair(4, 0), {5, 1}, {7, 3}}) {
-        const auto history = Array::make();
-        for (int i = 0; i < before; ++i)
-            history->append(i);
-        Dictionary from{{"History", history}};
-        LogGenerator::updateHistoryInState(from, clock);
-        ASSERT_EQ(history->size(), 5U) << before;
-        EXPECT_EQ((*history)[0], Value(oldest)) << before;
-        EXPECT_NE((*history)[4].dictionary(), nullptr) << before;
-    }
-}
-
 TEST_F(LogGeneratorTest, HistoryEntryIsAShallowCopyUpToTheFirstAbsentValue)
 {
     const std::pair<const char*, const char*> cases[] = {

@@ -71,7 +71,7 @@ TEST_F(MRLLogGenerator2Test, FramesRoutesAndKeepsMessages)
     };
     for (const auto& [words, expected, lines] : cases) {
         clearState();
-        const Bytes message = PacketText(words).bytes();
+        const Bytes message = bytesOfWords(words);
         const auto generator = makeGenerator();
         generator->getDisplayFromState(state);
         RecordingLog log;
@@ -144,18 +144,6 @@ TEST_F(MRLLogGenerator2Test, TemplateEntryUnderAnotherKeyThanATextIsReported)
     generator->getDisplayFromState(state);
     EXPECT_THAT(log.take(), testing::Contains("<3>Dictionary Key is not a string?"));
     EXPECT_EQ(display(), "First={Packet=-}, Group={Second={}, Text=as it is}");
-}
-
-TEST_F(MRLLogGenerator2Test, SuccessorsShareTheDisplayOfTheirTemplate)
-{
-    displayAfter("Probe", packet(0x4116, Bytes()));
-    const auto first = state["Display"].dictionary();
-    EXPECT_EQ(displayAfter("Probe", packet(0x4116, Bytes(2))),
-        "First={Packet=4116, 15}, Group={Second={Packet=4116, 15}, Text=as it is}");
-    EXPECT_TRUE(makeGenerator("Missing")->generateLogUsingState(state).isNull());
-    displayAfter("Probe", packet(0x4116, Bytes(3)));
-    EXPECT_EQ(state["Display"].dictionary(), first);
-    EXPECT_EQ(displayAfter("Other", packet(0x4116, Bytes(4))), "Second={Packet=4116, 17}");
 }
 
 TEST_F(MRLLogGenerator2Test, SuccessorsFindSectionsInsideAnArrayOfContainers)

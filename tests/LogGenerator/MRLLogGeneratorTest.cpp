@@ -40,27 +40,16 @@ TEST_F(MRLLogGeneratorTest, OpensWithTheVersionReport)
 {
     clock.zone = {-12600, true};
     const Bytes dlf = dlfOf({});
-    const Bytes expected = PacketText("A100 FD1F 00*8 01 00 01 00 4F7276657820 00 " // "Orvex "
-                                      "45584543555441424C455F4E414D45 00*25 "       // "EXECUTABLE_NAME"
-                                      "446563203139203230313820 32333A3539 00 "     // "Dec 19 2018 23:59"
-                                      "00F15365 2EFF 01 00*73") // 1700000000, -210 minutes, daylight saving
-                               .bytes();
+    const Bytes expected =
+        bytesOfWords("A100 FD1F 00*8 01 00 01 00 4F7276657820 00 " // "Orvex "
+                     "45584543555441424C455F4E414D45 00*25 "       // "EXECUTABLE_NAME"
+                     "446563203139203230313820 32333A3539 00 "     // "Dec 19 2018 23:59"
+                     "00F15365 2EFF 01 00*73"); // 1700000000, -210 minutes, daylight saving
     EXPECT_EQ(dlf, expected);
 
     EXPECT_EQ(textAt(dlfOf({}, std::nullopt), 16, 7), std::string("(none)\0", 7));
     clock.zone = {-59, false};
     EXPECT_EQ(textAt(dlfOf({}), 85, 4), std::string(4, '\0')) << "truncated toward zero";
-}
-
-TEST_F(MRLLogGeneratorTest, AppendsTheHistoryWithoutTheFirstByteOfEachEntry)
-{
-    const auto entry = [](const Bytes& packets) {
-        return Dictionary::make({{"DisplayState", std::make_shared<Bytes>(packets)}});
-    };
-    state.set(
-        "History", Array::make({entry({1, 2, 3}), entry({9}), entry({}), Dictionary::make(), entry({1, 4})}));
-    const Bytes dlf = dlfOf(state);
-    EXPECT_EQ(Bytes(dlf.begin() + 161, dlf.end()), (Bytes{2, 3, 4}));
 }
 
 TEST_F(MRLLogGeneratorTest, SaveContentsAreTheHistoryAndTheDLF)
@@ -96,11 +85,8 @@ TEST_F(MRLLogGeneratorTest, RawPacketsStayWithinTheirLimit)
     const auto aged = [](int bytes) {
         return Lines{text("<4>The history dropped its oldest raw packets, %d bytes", bytes)};
     };
-    const struct {
-        int packets; // of 4 bytes, in this interval
-        Sizes kept;
-        Lines lines;
-    } intervals[] = {
+    // How many packets of 4 bytes arrive in an interval, and what is kept then.
+    const std::tuple<int, Sizes, Lines> intervals[] = {
         {5, {20}, {}},
         {15, {20, 60}, {}}, // the limit
         {3, {0, 60, 12}, aged(20)},

@@ -90,15 +90,5 @@ TEST(RowsTest, ListThatSomebodyElseHoldsIsReplaced)
     }
 }
 
-TEST(RowsTest, KeepsTheOthersAndTheirOrder)
-{
-    const auto dictionary = Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}});
-    RowWriter rows(dictionary);
-    rows.setText("C", "%d", 30);
-    rows.setText("A", "%d", 10);
-    rows.set("D", "40");
-    EXPECT_EQ(described(Array({dictionary})), "A=10 B=2 C=30 D=40 | ");
-}
-
 } // namespace
 } // namespace orvex

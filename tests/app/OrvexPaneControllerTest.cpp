@@ -23,25 +23,19 @@ Tree lteTree()
 
 using OrvexPaneControllerTest = PaneFixture;
 
-TEST_F(OrvexPaneControllerTest, ShowsItsStatusAndTheSaveButtonInItsToolbar)
+TEST_F(OrvexPaneControllerTest, ShowsThatItIsBusyWhileItIsSeen)
 {
-    for (const bool offersSave : {false, true}) {
-        host.offersSave = offersSave;
-        show(Tree(rows({})));
-        EXPECT_EQ(top().toolbarRow()->items().size(), offersSave ? 4U : 3U);
-    }
+    show(Tree(rows({})));
     top().setStatus("Updated", false);
-    const auto& items = top().toolbarRow()->items();
-    EXPECT_TRUE(items[0].widget->isHidden());
-    EXPECT_EQ(static_cast<TextLabel*>(items[1].widget)->text(), "Updated");
-    QTest::mouseClick(items[3].widget, Qt::LeftButton);
-    EXPECT_EQ(host.savesAsked, 1);
+    EXPECT_EQ(top().toolbarRow()->items().size(), 3U) << "no button where saving is not offered";
+    EXPECT_TRUE(top().toolbarRow()->items()[0].widget->isHidden());
+    EXPECT_EQ(static_cast<TextLabel*>(top().toolbarRow()->items()[1].widget)->text(), "Updated");
     top().setStatus(std::nullopt, true);
-    const auto& busy = top().toolbarRow()->items();
-    EXPECT_EQ(static_cast<TextLabel*>(busy[1].widget)->text(), "");
-    EXPECT_TRUE(static_cast<ActivityIndicator*>(busy[0].widget)->isTicking());
+    const auto& items = top().toolbarRow()->items();
+    EXPECT_EQ(static_cast<TextLabel*>(items[1].widget)->text(), "");
+    EXPECT_TRUE(static_cast<ActivityIndicator*>(items[0].widget)->isTicking());
     stack->hide();
-    EXPECT_FALSE(static_cast<ActivityIndicator*>(busy[0].widget)->isTicking());
+    EXPECT_FALSE(static_cast<ActivityIndicator*>(items[0].widget)->isTicking());
 }
 
 TEST_F(OrvexPaneControllerTest, OpensBranchesByTapAndByKeyAndComesBack)

@@ -78,7 +78,7 @@ public:
     // Packets of the code to write into: from the capture, and some of them with other bytes here and there.
     Packets packetsOf(LogCode code) const
     {
-        constexpr std::size_t kOfCapture = 6;
+        constexpr std::size_t kOfCapture = 4;
         Packets found;
         for (const Bytes& message : captureOf(_name)) {
             const MessageFrame frame(message);

@@ -1,6 +1,3 @@
-// Output files, and conflicts between a program's files.
-
-#include "FileConflict.h"
 #include "OutputFile.h"
 
 #include <gtest/gtest.h>
@@ -16,36 +13,24 @@ namespace {
 
 namespace fs = std::filesystem;
 
-class FilesTest : public testing::Test {
-protected:
-    FilesTest()
-    {
-        std::string pattern = testing::TempDir() + "filesXXXXXX";
-        folder = ::mkdtemp(pattern.data());
-        for (const char* name : {"old", "kept", "stranger's"})
-            std::ofstream(path(name)) << "a longer content";
-        fs::create_directory(path("folder"));
-        const std::pair<const char*, const char*> links[] = {{"kept", "foreign link"},
-            {"foreign link", "link to it"}, {"old", "link"}, {"../link", "folder/link"},
-            {"new too", "dangling"}, {"../dangling", "folder/further"}, {"circle", "circle"}};
-        for (const auto& [target, name] : links)
-            fs::create_symlink(target, path(name));
-        fs::create_hard_link(path("old"), path("hard"));
-    }
-    ~FilesTest() override { fs::remove_all(folder); }
-
-    std::string path(const std::string& name) const { return folder + '/' + name; }
-    std::string contentOf(const std::string& name) const
-    {
-        std::ifstream file(path(name));
-        return {std::istreambuf_iterator<char>(file), {}};
-    }
-
-    std::string folder;
-};
-
-TEST_F(FilesTest, OutputFilesAreTheirUsersAlone)
+TEST(OutputFiles, AreTheirUsersAlone)
 {
+    std::string folder = testing::TempDir() + "filesXXXXXX";
+    ::mkdtemp(folder.data());
+    const auto path = [&folder](const std::string& name) { return folder + '/' + name; };
+    const auto contentOf = [&path](const std::string& name) {
+        std::ifstream file(path(name));
+        return std::string(std::istreambuf_iterator<char>(file), {});
+    };
+    for (const char* name : {"old", "kept", "stranger's"})
+        std::ofstream(path(name)) << "a longer content";
+    fs::create_directory(path("folder"));
+    const std::pair<const char*, const char*> links[] = {{"kept", "foreign link"},
+        {"foreign link", "link to it"}, {"old", "link"}, {"../link", "folder/link"}, {"new too", "dangling"},
+        {"circle", "circle"}};
+    for (const auto& [target, name] : links)
+        fs::create_symlink(target, path(name));
+
     constexpr uid_t kStranger = 65534;
     fs::permissions(path("old"), fs::perms::all);
     const bool isRoot = ::geteuid() == 0;
@@ -82,31 +67,7 @@ TEST_F(FilesTest, OutputFilesAreTheirUsersAlone)
         EXPECT_EQ(fs::status(path(test.written)).permissions(), fs::perms(0600)) << test.name;
     }
     EXPECT_EQ(contentOf("kept") + contentOf("stranger's"), "a longer contenta longer content");
-}
-
-TEST_F(FilesTest, ConflictsAreFoundByEveryName)
-{
-    const struct {
-        const char* output;
-        const char* other; // an output too
-        const char* conflict;
-    } cases[] = {
-        {"old", "new", "A and in"},
-        {"folder/../old", "new", "A and in"},
-        {"hard", "new", "A and in"},
-        {"folder/link", "new", "A and in"},
-        {"new", "./new", "B and A"},
-        {"folder/further", "new too", "B and A"},
-        {"dangling", "folder/../folder/further", "B and A"},
-        {"new", "kept", ""},
-    };
-    for (const auto& [output, other, conflict] : cases) {
-        const std::string fault =
-            fileConflict({{"in", path("old")}}, {{"A", path(output)}, {"B", path(other)}});
-        EXPECT_EQ(fault, *conflict ? conflict + std::string(" are the same file") : "") << output;
-    }
-    EXPECT_EQ(fileConflict({{"in", "/dev/null"}}, {{"A", "/dev/null"}}), "");
-    EXPECT_FALSE(fs::exists(path("new")));
+    fs::remove_all(folder);
 }
 
 } // namespace

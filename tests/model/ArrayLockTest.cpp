@@ -2,6 +2,7 @@
 
 #include "Array.h"
 #include "GSM/MRL_GSMLogGenerator.h"
+#include "MessageFrame.h"
 #include "NodesByPath.h"
 #include "PacketText.h"
 
@@ -45,38 +46,32 @@ TEST(ArrayLock, NestedHoldsAreUnlockedOnceAtTheLastUnlock)
 
 TEST(ArrayLock, IsTakenByWhoeverWalksOrChangesAPublishedArray)
 {
-    const struct {
-        const char* section;
-        const char* packet;
-    } sections[] = {
+    const std::pair<const char*, const char*> sections[] = {
         {"GSM Set", "4005: 00 01 00*7"},            // a list filled in place
         {"BLER", "4116: 01 3492 07 01020304 FF*4"}, // a list in a row
         {"Detected Set", "417A: 0000 00"},          // a list emptied
         {"PDP Context Info", "FF0002: <array/>"},   // a list replaced
     };
-    const MRL_GSMClassIndex index;
-    const auto array = Array::make({"old"});
-    std::vector<std::pair<const char*, std::function<void()>>> users = {
-        {"tree builder", [&array] {
-             NodesByPath nodes;
-             OrvexModelNode::makeTreeFromObject(array, nodes);
-         }}};
-    for (const auto& [name, words] : sections) {
-        Base* section = index.getClass(name);
-        const Bytes packet = packetOfText(words);
-        const Value container = std::string_view(name) == "BLER" ? Value(Dictionary::make()) : Value(array);
-        users.emplace_back(name, [=] {
-            section->updateSectionRef(container);
-            section->updateWithData(
-                packet, (packet[0] == 255 ? kExtraCodeBase : 0) + PacketReader(packet).u16(3));
-        });
-    }
-    for (const auto& [name, use] : users) {
+    const auto expectLocking = [](const std::string& name, const std::function<void()>& use) {
         ArrayLock::lockArray();
         auto used = std::async(std::launch::async, use);
         EXPECT_EQ(used.wait_for(std::chrono::milliseconds(50)), std::future_status::timeout) << name;
         ArrayLock::unlockArray();
         EXPECT_EQ(used.wait_for(std::chrono::seconds(10)), std::future_status::ready) << name;
+    };
+    const MRL_GSMClassIndex index;
+    const auto array = Array::make({"old"});
+    expectLocking("tree builder", [&array] {
+        NodesByPath nodes;
+        OrvexModelNode::makeTreeFromObject(array, nodes);
+    });
+    for (const auto& [name, words] : sections) {
+        Base& section = *index.getClass(name);
+        const bool isInRow = std::string_view(name) == "BLER";
+        const Value container = isInRow ? Value(Dictionary::make()) : Value(array);
+        section.updateSectionRef(container);
+        const Bytes packet = packetOfText(words);
+        expectLocking(name, [&] { section.updateWithData(packet, MessageFrame(packet).logCode()); });
     }
 }
 

@@ -1,7 +1,10 @@
 #include "NodesByPath.h"
 
 #include "Array.h"
+#include "CaseLines.h"
 #include "Dictionary.h"
+#include "PropertyList.h"
+#include "PropertyListForms.h"
 
 #include <gtest/gtest.h>
 
@@ -19,44 +22,23 @@ std::string described(const OrvexModelNode& node, const std::string& path)
     return result;
 }
 
-DictionaryRef nested(const Value& value)
-{
-    return Dictionary::make({{"x", value}});
-}
-
+// "DISPLAY -> TREE", a display as a property list in XML.
 TEST(OrvexModelNode, ShowsEveryKindOfObject)
 {
-    const struct {
-        const char* name;
-        Value display;
-        const char* tree;
-    } cases[] = {
-        {"an unsorted dictionary keeps its order and its keys",
-            Dictionary::make({{"02;B", "x"}, {"01;A", "y"}}), " / /02;B=x /01;A=y"},
-        {"a sorted dictionary is in string order, without prefixes",
-            Dictionary::make({{"2;B", "x"}, {"_sorted", ""}, {"10;A", Dictionary::make()}}), " / /A /B=x"},
-        {"only one separator makes a prefix",
-            Dictionary::make({{"_sorted", "no"}, {"a;b;c", "1"}, {"plain", "2"}, {"z;", "3"}}),
-            " / /a;b;c=1 /plain=2 /=3"},
-        {"a null value is left out", Dictionary::make({{"A", Value()}, {"B", "b"}}), " / /B=b"},
-        {"array elements are numbered", nested(Array::make({"a", "b"})), " / /x /x/0=a /x/1=b"},
-        {"arrays in arrays", Array::make({Array::make(), Array::make({"a"})}), " / /0 /1 /1/0=a"},
-        {"other values are unknown",
-            Array::make({1, 1.5, true, Date(), std::make_shared<Bytes>(), UID(), Set{Array::make({"a"})}}),
-            " / /0=(unknown) /1=(unknown) /2=(unknown) /3=(unknown) /4=(unknown) /5=(unknown) /6=(unknown)"},
-        {"only the top dictionary is sorted",
-            Dictionary::make({{"_sorted", ""}, {"1;S", Dictionary::make({{"2;b", ""}, {"1;a", ""}})}}),
-            " / /S /S/2;b= /S/1;a="},
-        {"an absent display", Value(), " /=(unknown)"},
-        {"a display that is a text", "text", " /=text"},
-    };
-    for (const auto& [name, display, tree] : cases) {
+    const auto treeOf = [](const Value& display) {
         NodesByPath nodes;
         const auto root = OrvexModelNode::makeTreeFromObject(display, nodes);
-        EXPECT_EQ(described(*root, "/"), tree) << name;
         EXPECT_EQ(root->displayName(), "Orvex");
         EXPECT_EQ(nodes["/"], root);
+        return described(*root, "/");
+    };
+    for (const std::string& line : caseLines("model/trees.txt")) {
+        const auto [display, tree] = divided(line, " -> ");
+        EXPECT_EQ(" " + tree, treeOf(propertyListFromData(bytesOf(xmlList(display))).value.value())) << line;
     }
+    EXPECT_EQ(treeOf(Array::make({UID(), Set{Array::make({"a"})}})), " / /0=(unknown) /1=(unknown)");
+    EXPECT_EQ(treeOf(Dictionary::make({{"A", Value()}, {"B", "b"}})), " / /B=b") << "null is left out";
+    EXPECT_EQ(treeOf({}), " /=(unknown)") << "absent";
 }
 
 TEST(OrvexModelNode, PathDictionaryKeepsTheLaterOfTwoNodes)
@@ -64,7 +46,8 @@ TEST(OrvexModelNode, PathDictionaryKeepsTheLaterOfTwoNodes)
     NodesByPath nodes;
     OrvexModelNode::makeTreeFromObject(
         Dictionary::make({{"_sorted", ""}, {"1;Cell", "first"}, {"2;Cell", "second"},
-            {"3;a/b", nested("deep")}, {"4;//", nested("of no name")}, {"5;c/", nested("trimmed")}}),
+            {"3;a/b", Dictionary::make({{"x", "deep"}})}, {"4;//", Dictionary::make({{"x", "of no name"}})},
+            {"5;c/", Dictionary::make({{"x", "trimmed"}})}}),
         nodes);
     EXPECT_EQ(*nodes["/Cell"]->value(), "second");
     EXPECT_EQ(*nodes["/a/b/x"]->value(), "deep");

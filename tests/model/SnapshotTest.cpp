@@ -1,7 +1,5 @@
 #include "Snapshot.h"
 
-#include "DisplayTreePrinter.h"
-#include "PropertyList.h"
 #include "SnapshotTree.h"
 
 #include <gtest/gtest.h>
@@ -70,26 +68,6 @@ TEST_F(SnapshotTest, LargeAndDeepOnesAreReadAsTheyWereWritten)
     EXPECT_TRUE(read->description == written.description);
 }
 
-TEST_F(SnapshotTest, SaysWhyAFileIsNotASnapshot)
-{
-    const std::string data = "<key>Data</key><array>";
-    const std::pair<std::string, const char*> cases[] = {
-        {"<array/>", "its property list is no dictionary"},
-        {"<dict/>", "it has no list \"Data\""},
-        {"<dict>" + data + "<string/></array></dict>", "an entry of \"Data\" is no dictionary"},
-        {"<dict>" + data + "</array></dict>", "\"Timestamp\" or \"Description\" is no text"},
-    };
-    const std::string path = directory + "/file.orvex";
-    for (const auto& [content, reason] : cases) {
-        std::ofstream(path) << R"(<plist version="1.0">)" << content << "</plist>";
-        const auto [read, error] = readSnapshot(path);
-        EXPECT_FALSE(read) << content;
-        EXPECT_EQ(error, path + ": not a snapshot: " + reason);
-    }
-    EXPECT_EQ(readSnapshot(directory + "/none").error, directory + "/none: No such file or directory");
-    EXPECT_EQ(readSnapshot(directory).error, directory + ": Is a directory");
-}
-
 TEST_F(SnapshotTest, SaysWhyItCouldNotBeWritten)
 {
     Snapshot unwritable = someSnapshot();
@@ -101,20 +79,6 @@ TEST_F(SnapshotTest, SaysWhyItCouldNotBeWritten)
     EXPECT_EQ(writeSnapshot(someSnapshot(), directory + "/gone/x.orvex"),
         directory + "/gone/x.orvex: No such file or directory");
     EXPECT_EQ(writeSnapshot(someSnapshot(), "/dev/full"), "/dev/full: No space left on device");
-}
-
-TEST(SnapshotTree, ShowsDisplaysThenTheSizeOfTheDLFAndTheDescription)
-{
-    Snapshot snapshot = someSnapshot();
-    snapshot.data->append(Dictionary::make({{"Display", Array::make({"c"})}}));
-    snapshot.data->append(Dictionary::make({{"DLF", std::make_shared<Bytes>(3)}}));
-    const std::string entries = "Orvex\n  Snapshot (x)\n    A\n      0: b\n  (no description)\n    0: c\n";
-    EXPECT_EQ(DisplayTreePrinter::text(*snapshotTree(snapshot)),
-        entries + "  DLF: 3 bytes\n  Description: words\n");
-    snapshot.description.clear();
-    snapshot.data->append(Dictionary::make({{"DLF", std::make_shared<Bytes>(4)}}));
-    EXPECT_EQ(
-        DisplayTreePrinter::text(*snapshotTree(snapshot)), entries + "  DLF: 7 bytes\n  Description: —\n");
 }
 
 TEST(NumberedRows, NoRowHidesAnother)

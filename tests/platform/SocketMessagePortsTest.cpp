@@ -122,20 +122,6 @@ TEST_F(SocketMessagePortsTest, AStarterTakesOverAStaleSocketOnceItHasTheDirector
     EXPECT_EQ(access(pathOf("file").c_str(), F_OK), 0) << "somebody's file was removed";
 }
 
-TEST_F(SocketMessagePortsTest, RemotePortNoticesThatItsPeerHasGone)
-{
-    auto local = ports.createLocalPort("a", collector()).port;
-    const auto idle = ports.createRemotePort("a");
-    turnFor(20ms);
-    local.reset();
-    EXPECT_TRUE(waitUntil([&] { return !idle->isValid(); }));
-    int invalidations = 0;
-    idle->setInvalidationCallback([&] { ++invalidations; });
-    idle->invalidate();
-    idle->invalidate();
-    EXPECT_EQ(invalidations, 1);
-}
-
 TEST_F(SocketMessagePortsTest, SendingWaitsForAPeerThatDoesNotReadAndLosesNothing)
 {
     const auto dataOf = [](std::int32_t i) {

@@ -53,7 +53,7 @@ TEST(PropertyListReference, ReadsAndWritesWhatWeDo)
         "each kind");
     for (const char* file :
         {"resources/C2KTemplate.plist", "resources/MRL_GSM.plist", "fuzz/corpus/Snapshot/IFX"}) {
-        const std::string path = std::string(ORVEX_SOURCE_DIR "/") + file;
+        const std::string path = std::string(ORVEX_TESTS "/../") + file;
         const Bytes bytes = readFile(path, 1 << 20).bytes;
         const auto list = propertyListFromData(bytes);
         expectAgreement(list.value.value(), path);

@@ -57,11 +57,7 @@ protected:
 
 TEST_F(CaptureSourceTest, PaceIsThatOfTheCaptureWhereItHasOneAndRoundsFollowAfterASecond)
 {
-    const struct {
-        const char* name;
-        Times captured;
-        Times due;
-    } cases[] = {
+    const std::tuple<const char*, Times, Times> cases[] = {
         {"as captured", {5s, 5s + 3us, 6s}, {0s, 3us, 1s}},
         {"a minute is a pause", {0s, 60s, 61s}, {0s, 60s, 61s}},
         {"more is another session", {0s, 60s + 1us, 61s}, {0s, 0s, 1s - 1us}},

@@ -57,11 +57,7 @@ private:
 
 TEST(ConsoleTerminal, GetsItsModesBackWhateverHappens)
 {
-    const struct {
-        const char* name;
-        char key;
-        int signal;
-    } cases[] = {
+    const std::tuple<const char*, char, int> cases[] = {
         {"q", 'q', 0},
         {"Ctrl+C", '\x03', 0},
         {"Ctrl+Z", '\x1a', 0},

@@ -1,5 +1,6 @@
 // koratd as a program, with clients inside the test.
 
+#include "Captures.h"
 #include "KoratClient.h"
 #include "Programs.h"
 
@@ -7,49 +8,15 @@
 
 #include <gmock/gmock.h>
 
+#include <algorithm>
 #include <csignal>
-#include <filesystem>
-#include <fstream>
 #include <thread>
 
 namespace orvex::test {
 namespace {
 
+using namespace std::chrono_literals;
 using testing::HasSubstr;
-
-TEST(KoratProcess, WrongOptionsAndFilesOfNoUseEndItAtTheStart)
-{
-    const ProgramFolder folder;
-    const QString capture = folder.name("capture");
-    std::ofstream(folder.path("capture")) << std::string(1000, 'x');
-    std::filesystem::create_symlink("capture", folder.path("link"));
-    const std::string conflict = "--record " + folder.path("link") + " and --capture "
-        + folder.path("capture") + " are the same file\n";
-    const struct {
-        std::string complaint;
-        QStringList arguments;
-        int status = 2;
-    } cases[] = {
-        {"Unknown technology 'MRL_NOISE'.\nTry 'koratd --help'.", {"--technology", "MRL_NOISE"}},
-        {"--rate takes a number", {"--rate", "0"}},
-        {"--count takes a number", {"--count", "-1"}},
-        {"Unknown fault 'garbage=101'.", {"--fault", "garbage=101"}},
-        {"Unknown fault 'die-after'.", {"--fault", "die-after"}},
-        {"Unknown fault 'refuse-channel=0'.", {"--fault", "refuse-channel=0"}},
-        {"Unknown fault 'null-port=1'.", {"--fault", "null-port=1"}},
-        {conflict, {"--capture", capture, "--record", folder.name("link")}},
-        {"koratd: /no/such/capture: No such file or directory\n", {"--capture", "/no/such/capture"}, 1},
-        {"neither a pcap nor a DLF file\n", {"--capture", capture}, 1},
-        {"koratd: /dev/full: No space left on device\n", {"--record", "/dev/full"}, 1},
-    };
-    for (const auto& [complaint, arguments, status] : cases) {
-        const Result result = run(KORATD_PATH, arguments);
-        EXPECT_EQ(result.status, status) << complaint;
-        EXPECT_THAT(result.errors, HasSubstr(complaint));
-    }
-    EXPECT_EQ(std::filesystem::file_size(folder.path("capture")), 1000U);
-    EXPECT_THAT(run(KORATD_PATH, {"--help"}).output, HasSubstr("--fault"));
-}
 
 TEST(KoratProcess, StreamsWhatWasAskedForAfterTheStartCommand)
 {
@@ -111,20 +78,50 @@ TEST(KoratProcess, RefusesChannelsToItselfAndToNamesThatAreNone)
     EXPECT_THAT(korat.errors(), testing::Not(HasSubstr("\x1b")));
 }
 
-TEST(KoratProcess, ASecondServiceFindsThePlaceTakenAndLeavesTheRecordingAlone)
+using Captured = std::pair<std::chrono::microseconds, Bytes>; // since the first message
+
+std::vector<Captured> messagesIn(const std::string& path)
+{
+    std::vector<Captured> result;
+    const auto reader = CaptureReader::open(path);
+    std::optional<std::chrono::microseconds> start;
+    while (reader->next() == CaptureReader::Status::message) {
+        start = start.value_or(reader->time());
+        result.emplace_back(
+            reader->time() - *start, Bytes(reader->message().begin(), reader->message().end()));
+    }
+    return result;
+}
+
+TEST(KoratProcess, RecordedPlayedAndRecordedAgainItIsTheSame)
 {
     const ProgramFolder folder;
-    KoratProgram first(folder, {"--record", folder.name("capture"), "--rate", "2000", "--count", "50"});
-    KoratClient client(folder.ports());
-    ASSERT_EQ(client.open(), 0);
-    client.send();
-    ASSERT_TRUE(waitUntil([&] { return client.messages.size() == 50; }));
-    Program second(folder, KORATD_PATH, {"--record", folder.name("capture")});
-    EXPECT_EQ(second.waitForEnd(), 1);
-    EXPECT_THAT(second.errors(), HasSubstr("another service is running already"));
-    EXPECT_EQ(first.terminateAndCount(), 50);
-    EXPECT_GT(std::filesystem::file_size(folder.path("capture")), 50U * 16);
-    EXPECT_EQ(KoratProgram(folder).terminateAndCount(), 0) << "nothing was left behind";
+    constexpr std::size_t kCount = 2000; // several rounds of most captures
+    for (const char* technology : kTechnologies) {
+        SCOPED_TRACE(technology);
+        const auto record = [&](const char* name, const QStringList& arguments) {
+            KoratProgram korat(folder,
+                QStringList{"--technology", technology, "--rate", "20000", "--record", folder.name(name)}
+                    + arguments);
+            KoratClient client(folder.ports());
+            EXPECT_EQ(client.open(), 0);
+            EXPECT_EQ(client.technology(), Value(technology));
+            client.send();
+            EXPECT_TRUE(waitUntil([&] { return client.messages.size() >= kCount; }, 20s));
+            turnFor(50ms); // in which nothing more comes
+            EXPECT_EQ(korat.terminateAndCount(), kCount);
+            return client.messages;
+        };
+        const auto received = record("first", {"--count", QString::number(kCount)});
+        EXPECT_TRUE(record("second", {"--capture", folder.name("first"), "--once"}) == received);
+        const auto first = messagesIn(folder.path("first"));
+        ASSERT_EQ(first.size(), kCount);
+        EXPECT_TRUE(std::ranges::equal(first, received, {}, &Captured::second));
+        EXPECT_TRUE(first == messagesIn(folder.path("second")));
+        // Messages stand at the capture's times, however fast they went.
+        EXPECT_GT(first.back().first, 20s);
+        EXPECT_TRUE(std::ranges::is_sorted(first, {}, &Captured::first));
+    }
 }
 
 } // namespace

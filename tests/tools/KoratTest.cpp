@@ -43,7 +43,7 @@ TEST(Subscription, TakesTheCodesThatTheCommandNames)
     }
 }
 
-TEST(Recorder, SaysOnceThatAMessageIsTooLongAndGoesOn)
+TEST(Recorder, SaysOnceThatAMessageIsTooLongForReadersAndGoesOn)
 {
     const TemporaryFile file;
     testing::internal::CaptureStderr();
@@ -58,6 +58,12 @@ TEST(Recorder, SaysOnceThatAMessageIsTooLongAndGoesOn)
         "koratd: a message of 262145 bytes is too long for the recording; only its first 262144 bytes were "
         "written\n"
         "koratd: 2 messages were cut in the recording; a replay skips them\n");
+    const auto replay = CaptureReader::open(file.path);
+    for (const std::size_t length : {262'144U, 5U}) {
+        ASSERT_EQ(replay->next(), CaptureReader::Status::message) << replay->error();
+        EXPECT_EQ(replay->message().size(), length);
+    }
+    EXPECT_EQ(replay->next(), CaptureReader::Status::end) << replay->error();
 }
 
 // A client that takes what it is sent only when the test says so.
@@ -132,21 +138,14 @@ TEST_F(StreamerTest, StandsStillAboveItsBacklogAndDropsNothing)
 TEST_F(StreamerTest, RestsAfterTheEndAndRepeatsOnlyWhatIsWanted)
 {
     const TemporaryFile file;
-    const struct {
-        const char* name;
-        int wantedCode;
-        std::uint8_t length;
-        bool once;
-        std::optional<std::uint64_t> count;
-        std::size_t atLeast;
-        bool rests;
-    } cases[] = {
-        {"one round", 1, 3, true, {}, 3, true},
-        {"endless", 1, 3, false, {}, 30, false},
-        {"so many of those that are wanted", 1, 3, false, 30, 30, true},
-        {"endless, nothing in it", 1, 0, false, {}, 0, true},
-        {"endless, nothing wanted in it", 2, 3, false, {}, 0, true},
-    };
+    const std::tuple<const char*, int, std::uint8_t, bool, std::optional<std::uint64_t>, std::size_t, bool>
+        cases[] = {
+            {"one round", 1, 3, true, {}, 3, true},
+            {"endless", 1, 3, false, {}, 30, false},
+            {"so many of those that are wanted", 1, 3, false, 30, 30, true},
+            {"endless, nothing in it", 1, 0, false, {}, 0, true},
+            {"endless, nothing wanted in it", 2, 3, false, {}, 0, true},
+        };
     for (const auto& [name, wantedCode, length, once, count, atLeast, rests] : cases) {
         client->received.clear();
         {

@@ -10,27 +10,6 @@
 namespace orvex {
 namespace {
 
-std::string keysOf(const Dictionary& dictionary)
-{
-    std::string keys;
-    for (const auto& entry : dictionary)
-        keys += entry.key + ' ';
-    return keys;
-}
-
-TEST(Dictionary, KeysKeepThePlaceWhereTheyWereFirstSet)
-{
-    Dictionary dictionary{{"c", 1}, {"a", 2}, {"b", 3}, {"a", 4}};
-    dictionary.set("c", 5);
-    EXPECT_EQ(keysOf(dictionary), "c a b ");
-    EXPECT_EQ(*dictionary["a"].integer(), 4);
-    dictionary.remove("c");
-    dictionary.remove("not there");
-    dictionary.set("c", 6);
-    EXPECT_TRUE(dictionary["not there"].isNull());
-    EXPECT_EQ(keysOf(dictionary), "a b c ") << "looking a key up does not make it";
-}
-
 // Around the size at which an index takes over from the direct search.
 TEST(Dictionary, LargeOnesFindRemoveAndCopyLikeSmallOnes)
 {

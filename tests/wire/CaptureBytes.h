@@ -2,7 +2,6 @@
 
 #include "Value.h"
 
-#include <bit>
 #include <fstream>
 #include <string>
 
@@ -23,38 +22,20 @@ inline Bytes dlfRecord(std::size_t length, std::uint8_t time, std::uint8_t fill 
     return record;
 }
 
-// The bytes of a classic pcap file, made by hand: 24 bytes of file header, 16 of header for each packet.
-class PcapFile {
-public:
-    explicit PcapFile(
-        std::uint32_t linkType = 147, bool isBigEndian = false, std::uint32_t magic = 0xA1B2C3D4)
-        : _isBigEndian(isBigEndian)
-    {
-        put({magic, 4U << (isBigEndian ? 0 : 16) | 2U << (isBigEndian ? 16 : 0), 0, 0, 262144, linkType});
+// Records of all lengths, and between them bytes that make none; longer than what is read at once.
+inline Bytes longDlf()
+{
+    Bytes dlf;
+    for (std::size_t i = 0; dlf.size() < std::size_t{3} << 20; ++i) {
+        dlf += dlfRecord(i % 97 == 0 ? 65'535 : 12 + i % 1'000, static_cast<std::uint8_t>(i), 0);
+        if (i % 50 == 0)
+            dlf += Bytes(i); // makes no record
     }
-
-    // A packet, 654321 micro- or nanoseconds after a second. The capture lacks its last bytes.
-    PcapFile& add(const Bytes& message, std::uint32_t lacking = 0)
-    {
-        const auto length = static_cast<std::uint32_t>(message.size());
-        put({1'700'000'000, 654'321, length - lacking, length});
-        bytes.insert(bytes.end(), message.begin(), message.end() - lacking);
-        return *this;
-    }
-
-    Bytes bytes;
-
-private:
-    void put(std::initializer_list<std::uint32_t> words)
-    {
-        for (const std::uint32_t word : words) {
-            for (unsigned i = 0; i < 4; ++i)
-                bytes.push_back(static_cast<std::uint8_t>(word >> 8 * (_isBigEndian ? 3 - i : i)));
-        }
-    }
-
-    bool _isBigEndian;
-};
+    dlf += Bytes(std::size_t{2} << 20); // longer than a window
+    dlf += dlfRecord(40, 1);
+    dlf += dlfRecord(50, 2);
+    return dlf;
+}
 
 inline std::string writeFile(const std::string& path, const Bytes& bytes)
 {

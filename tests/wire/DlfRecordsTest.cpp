@@ -111,28 +111,20 @@ TEST(DlfRecords, AreFoundAgainBehindALengthThatLies)
 
 TEST(DlfRecords, OfASnapshotGiveEveryMessageOfEveryCaptureBack)
 {
-    using Prefix = Bytes (*)(std::size_t number);
-    constexpr Prefix kPrefixes[] = {
-        [](std::size_t) { return Bytes(); },
-        [](std::size_t) {
-            return Bytes{0x81, 0};
-        },
-        [](std::size_t i) {
-            return i % 3 ? Bytes() : Bytes{0x81, static_cast<std::uint8_t>(i)};
-        },
-        [](std::size_t i) {
-            return Bytes{0x81, static_cast<std::uint8_t>(i % 2 ? 255 : 1)};
-        },
+    // No prefixes, all the same one, some of any second byte, and some that look like log types.
+    const auto prefixOf = [](int kind, std::size_t i) {
+        const std::size_t seconds[] = {0, 0, i, i % 2 ? 255U : 1U};
+        const bool hasNone = kind == 0 || (kind == 2 && i % 3 != 0);
+        return hasNone ? Bytes() : Bytes{0x81, static_cast<std::uint8_t>(seconds[kind])};
     };
     for (const char* technology : {"MRL_GSM", "MRL_CDMA", "MRL_LTE", "MRL_UTRAN2"}) {
         const std::vector<Bytes> drive = captureOf(technology);
-        for (const Prefix& prefixOf : kPrefixes) {
+        for (int kind = 0; kind < 4; ++kind) {
             for (const std::size_t perInterval : {1U, 2U, 7U, 60U}) {
-                SCOPED_TRACE(
-                    technology + std::to_string(&prefixOf - kPrefixes) + std::to_string(perInterval));
+                SCOPED_TRACE(technology + std::to_string(kind) + std::to_string(perInterval));
                 Pieces pieces{{{}, versionReport()}};
                 for (std::size_t i = 0; i < drive.size(); ++i) {
-                    Bytes front = prefixOf(i);
+                    Bytes front = prefixOf(kind, i);
                     front.push_back(drive[i][0]);
                     if (i % perInterval == 0)
                         front.erase(front.begin());

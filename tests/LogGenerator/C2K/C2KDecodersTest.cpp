@@ -10,7 +10,7 @@ namespace {
 
 TEST(C2KDecoders, ShowTheirCases)
 {
-    for (const std::string& line : caseLines("MRL_CDMA")) {
+    for (const std::string& line : caseLines("LogGenerator/cases/MRL_CDMA.txt")) {
         SCOPED_TRACE(line.substr(0, 200));
         C2KFixture fixture;
         if (line.find(" => ") != std::string::npos) {

@@ -13,37 +13,25 @@ namespace orvex::test {
 // appear in the order in which they are first published.
 class C2KFixture {
 public:
-    C2KFixture() { clear(); }
-
-    void clear()
+    C2KFixture()
     {
-        display = Dictionary::make();
-        _lookup = Dictionary::make();
-        for (const auto& [key, rows] : internalKeys())
+        const RecordingLog log; // a line for each dictionary
+        Dictionary keys;        // every key that the template names
+        const auto laidOut = resources.dictionaryNamed("C2KTemplate").dictionary;
+        C2KLogGenerator::processTemplate(*laidOut, Dictionary::make(), keys);
+        for (const auto& [key, rows] : keys)
             Publisher::addRow(*_lookup, key, key, display);
     }
     void feed(const Bytes& packet) { generator.updateFromLog(packet, _lookup, state); }
 
     FixedClock clock;
     Dictionary state;
-    DictionaryRef display;
-    FileResources resources{ORVEX_SOURCE_DIR "/resources"};
+    DictionaryRef display = Dictionary::make();
+    FileResources resources{ORVEX_RESOURCES};
     C2KLogGenerator generator{GeneratorEnvironment{resources, clock, {}}};
 
 private:
-    // The lookup of the template: every key that it names.
-    const Dictionary& internalKeys()
-    {
-        if (_keys.isEmpty()) {
-            const RecordingLog log; // a line for each dictionary
-            const auto laidOut = resources.dictionaryNamed("C2KTemplate").dictionary;
-            C2KLogGenerator::processTemplate(*laidOut, Dictionary::make(), _keys);
-        }
-        return _keys;
-    }
-
-    Dictionary _keys;
-    DictionaryRef _lookup;
+    DictionaryRef _lookup = Dictionary::make();
 };
 
 } // namespace orvex::test

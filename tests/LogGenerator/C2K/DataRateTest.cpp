@@ -7,11 +7,8 @@ namespace {
 
 TEST(DataRate, CountersGoIntoStateAndSnapshot)
 {
-    const struct {
-        std::string prefix;
-        const char* first;
-        const char* second; // of the same sequence number, so without a rate
-    } links[] = {
+    // A second packet of the same sequence number is without a rate.
+    const std::tuple<std::string, const char*, const char*> links[] = {
         {"FL", "1192: FEFFFFFF 01000000 00*220", "1192: FEFFFFFF 03000000 00*220"},
         {"RL", "127E: EE FEFFFFFF 01000000 00*1728", "127E: EE FEFFFFFF 03000000 00*1728"},
     };

@@ -8,7 +8,33 @@
 #include "Shown.h"
 #include "SystemLog.h"
 
+#include <nlohmann/json.hpp>
+
 namespace orvex::korat {
+
+using Json = nlohmann::ordered_json;
+
+// A value as ModemManager has it on the bus.
+inline Value valueOf(const Json& json)
+{
+    if (json.is_object()) {
+        const auto dictionary = Dictionary::make();
+        for (const auto& [key, value] : json.items())
+            dictionary->set(key, valueOf(value));
+        return dictionary;
+    }
+    if (json.is_array()) {
+        const auto array = Array::make();
+        for (const Json& element : json)
+            array->append(valueOf(element));
+        return array;
+    }
+    if (json.is_string())
+        return json.get<std::string>();
+    if (json.is_boolean())
+        return json.get<bool>();
+    return json.is_number_float() ? Value(json.get<double>()) : Value(json.get<std::int64_t>());
+}
 
 // What a monitor shows after all messages about the state.
 inline Value display(const char* technology, const ModemState& state, bool withMeasurements = false)

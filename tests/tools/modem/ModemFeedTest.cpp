@@ -37,11 +37,7 @@ TEST(TechnologyChoice, FollowsTheServingCellAfterItHasSettled)
     EXPECT_EQ(choice.choose(stateOn(Radio::lte)), "MRL_LTE"); // a monitor asks: at once
     ModemState silent = stateOn(Radio::lte);
     silent.cells.clear();
-    const struct {
-        std::chrono::seconds time;
-        ModemState state;
-        const char* technology;
-    } steps[] = {
+    const std::tuple<std::chrono::seconds, ModemState, const char*> steps[] = {
         {0s, stateOn(Radio::gsm), "MRL_LTE"},
         {9s, stateOn(Radio::umts), "MRL_LTE"}, // shown by the same technology
         {10s, stateOn(Radio::gsm), "MRL_GSM"},
@@ -61,12 +57,7 @@ TEST(TechnologyChoice, FollowsTheServingCellAfterItHasSettled)
 
 TEST(TechnologyChoice, GoesByTheAccessTechnologyUntilCellsAreAnsweredFor)
 {
-    const struct {
-        const char* name;
-        CellAnswer answer;
-        std::optional<Radio> radio;
-        const char* technology;
-    } cases[] = {
+    const std::tuple<const char*, CellAnswer, std::optional<Radio>, const char*> cases[] = {
         {"not asked yet", CellAnswer::notAsked, Radio::lte, "MRL_LTE"},
         {"not asked, not registered", CellAnswer::notAsked, std::nullopt, "IFX"},
         {"cells are not told", CellAnswer::notSupported, Radio::lte, "IFX"},

@@ -4,9 +4,12 @@
 #include "modem/ModemManagerCells.h"
 #include "modem/ModemManagerState.h"
 
+#include "CaseLines.h"
 #include "ModemDisplay.h"
 
 #include <gtest/gtest.h>
+
+#include <fstream>
 
 namespace orvex::korat {
 namespace {
@@ -14,99 +17,56 @@ namespace {
 // The objects of an LTE modem as an AT modem of version 1.20 has them.
 DictionaryRef objects()
 {
-    const Value none = Dictionary::make();
-    return Dictionary::make({
-        {"/org/freedesktop/ModemManager1/Modem/3",
-            Dictionary::make({
-                {kModemInterface,
-                    Dictionary::make({{"Manufacturer", "Example"}, {"Model", "M\x1b[1m"},
-                        {"Revision", "1.0.0"}, {"EquipmentIdentifier", "490154203237518"}, {"State", 11},
-                        {"AccessTechnologies", 0xC000}, {"SignalQuality", Array::make({64, true})},
-                        {"Sim", "/SIM/0"}, {"OwnNumbers", Array::make({"+15551234567"})},
-                        {"Bearers", Array::make({"/Bearer/0", "/Bearer/1"})}})},
-                {kModem3gppInterface,
-                    Dictionary::make({{"RegistrationState", 5}, {"OperatorCode", "00101"},
-                        {"OperatorName", "Test Net"}, {"Imei", "490154203237518"}})},
-                {kSignalInterface,
-                    Dictionary::make({{"Rate", 5}, {"Gsm", none},
-                        {"Lte", Dictionary::make({{"rsrp", -89.0}, {"rsrq", -10.0}, {"snr", 7.4}})}})},
-            })},
-        {"/SIM/0",
-            Dictionary::make({{kSimInterface,
-                Dictionary::make({{"SimIdentifier", "89000101123456789001"}, {"Imsi", "001010123456789"},
-                    {"Eid", "89049032000001"}, {"OperatorIdentifier", "00101"},
-                    {"OperatorName", "Home Op"}})}})},
-        {"/Bearer/0",
-            Dictionary::make({{kBearerInterface,
-                Dictionary::make({{"Connected", true}, {"Interface", "wwan0"},
-                    {"Properties",
-                        Dictionary::make(
-                            {{"apn", "internet.example"}, {"user", "u"}, {"password", "secret"}})},
-                    {"Ip4Config",
-                        Dictionary::make({{"method", 2}, {"address", "10.20.30.40"}, {"prefix", 30},
-                            {"dns1", "192.0.2.53"}, {"gateway", "10.20.30.41"}})},
-                    {"Ip6Config", Dictionary::make({{"address", "2001:db8::1"}, {"prefix", 64}})},
-                    {"Stats",
-                        Dictionary::make(
-                            {{"duration", 61}, {"rx-bytes", 5'000'000'000}, {"tx-bytes", 7}})}})}})},
-    });
+    std::ifstream file(ORVEX_TESTS "/tools/modem/objects.json");
+    return valueOf(Json::parse(file)).dictionary();
 }
 
 constexpr const char* kModemPath = "/org/freedesktop/ModemManager1/Modem/3";
 
-TEST(ModemState, IsShownWithoutIdentitiesUnlessTheyAreAskedFor)
+// The state of a modem with these properties.
+ModemState stateOf(const std::string& properties)
 {
-    ModemState state = modemStateOf(*objects(), kModemPath, false);
-    state.cellAnswer = CellAnswer::notSupported;
-    state.location = locationIn(Dictionary::make({{"1", "001,01,0,1A2D001,84CD"}}));
-    EXPECT_EQ(test::shown(display("IFX", state)),
-        "{Modem={Manufacturer=Example, Model=M\\x1b[1m, Firmware=1.0.0, State=connected, "
-        "Access Technology=LTE, 5G NR, Signal Quality=64 %}, "
-        "Registration={State=roaming, Operator=Test Net, Network=001-01}, "
-        "Cells=This modem does not tell its cells, "
-        "Signal={LTE RSRP=-89.0 dBm, LTE RSRQ=-10.0 dB, LTE SNR=7.4 dB}, "
-        "Location={Network=001-01, TAC=33997, Cell ID=27447297}, "
-        "SIM={ICCID=89000101123456789001, Operator=Home Op, Home Network=001-01, Own Number=+15551234567}, "
-        "Connections=[APN=internet.example, State=connected, Interface=wwan0, IPv4 Address=10.20.30.40/30, "
-        "IPv4 Gateway=10.20.30.41, IPv6 Address=2001:db8::1/64, Name Servers=192.0.2.53, Duration=61 s, "
-        "Received=5000000000 bytes, Sent=7 bytes]}");
-    const Value lte = display("MRL_LTE", state);
-    EXPECT_EQ(
-        test::shown(section(lte, "SIM Info")), "{EF-ICCID=89000101123456789001, EF-MSISDN=+15551234567}");
-    EXPECT_EQ(test::shown(section(lte, "PDP Context Info")),
-        test::shown(section(display("IFX", state), "Connections")));
+    const Value all = valueOf({{"/a", {{kModemInterface, Json::parse(properties)}, {kSignalInterface, 3}}}});
+    return modemStateOf(*all.dictionary(), "/a", true);
+}
 
+std::string shownOf(const std::string& subject)
+{
+    const auto [kind, rest] = test::divided(subject, " ");
+    if (kind[0] == '{')
+        return conditionLine(stateOf(subject));
+    if (kind == "modem")
+        return test::shown(section(display("IFX", stateOf(rest)), "Modem"));
+    ModemState state;
+    if (kind == "location") {
+        state.condition = Condition::enabled;
+        state.location = locationIn(Dictionary::make({{"1", rest}, {"4", "$GPGGA"}}));
+        return test::shown(section(display("IFX", state), "Location"));
+    }
+    state = modemStateOf(*objects(), kModemPath, false);
+    state.cellAnswer = CellAnswer::notSupported;
+    const auto [technology, name] = test::divided(rest.substr(2), " | ");
+    const Value whole = display(technology.c_str(), state);
+    return test::shown(name.empty() ? whole : section(whole, name.c_str()));
+}
+
+// Lines of states.txt: "SUBJECT -> SHOWN". The subject is a modem's properties, for what stands in the way,
+// "modem" and properties, for IFX's section of it, "location" and a text, or "objects | TECHNOLOGY |
+// SECTION".
+TEST(ModemState, IsShown)
+{
+    for (const std::string& line : test::caseLines("tools/modem/states.txt")) {
+        const std::string subject = test::divided(line, " ->").first;
+        const std::string shown = shownOf(subject);
+        EXPECT_EQ(subject + (shown.empty() ? " ->" : " -> " + shown), line);
+    }
+}
+
+TEST(ModemState, HasIdentitiesOnlyIfTheyAreAskedFor)
+{
     const std::string all = test::shown(display("IFX", modemStateOf(*objects(), kModemPath, true)));
     for (const char* identity : {"IMEI=490154203237518", "IMSI=001010123456789", "EID=89049032000001"})
         EXPECT_NE(all.find(identity), all.npos) << identity;
-}
-
-TEST(ModemState, SaysWhatStandsInTheWay)
-{
-    const struct {
-        int state;
-        const char* property;
-        int value;
-        const char* line;
-    } cases[] = {
-        {-1, "StateFailedReason", 2, "The modem has failed: the SIM is missing"},
-        {2, "UnlockRequired", 2, "The modem is locked and wants SIM PIN"},
-        {2, "UnlockRequired", 77, "The modem is locked and wants a code"},
-        {3, "UnlockRequired", 1, "The modem is not enabled"},
-        {8, "UnlockRequired", 1, ""},
-    };
-    for (const auto& [state, property, value, line] : cases) {
-        const auto modem = Dictionary::make({{"State", state}, {property, value}});
-        const auto all = Dictionary::make({{"/a", Dictionary::make({{kModemInterface, modem}})}});
-        EXPECT_EQ(conditionLine(modemStateOf(*all, "/a", false)), line);
-    }
-    const auto wrong = Dictionary::make({{"State", "11"}, {"SignalQuality", Array::make()}, {"Sim", 7},
-        {"Bearers", "/Bearer/0"}, {"OwnNumbers", Array::make({1})}, {"AccessTechnologies", -1}});
-    const auto all =
-        Dictionary::make({{"/a", Dictionary::make({{kModemInterface, wrong}, {kSignalInterface, 3}})}});
-    const ModemState state = modemStateOf(*all, "/a", true);
-    EXPECT_EQ(test::shown(section(display("IFX", state), "Modem")), "State: unknown");
-    EXPECT_EQ(conditionLine(state), "The modem is not enabled");
 }
 
 TEST(ModemState, OfSeveralModemsTheFirstThatIsEnabledIsWatched)
@@ -122,27 +82,6 @@ TEST(ModemState, OfSeveralModemsTheFirstThatIsEnabledIsWatched)
     EXPECT_EQ(modems({}), "");
     EXPECT_EQ(modems({{"/10", 8}, {"/9", 8}, {"/2", 3}}), "/9");
     EXPECT_EQ(modems({{"/1", -1}, {"/2", 3}}), "/2");
-}
-
-TEST(ModemLocation, IsWhatTheNetworkTells)
-{
-    const struct {
-        const char* text;
-        const char* shown;
-    } cases[] = {
-        {"001,01,1234,D30156,0", "{Network=001-01, LAC=4660, Cell ID=13828438}"},
-        {"310,410,FFFE,1A2D001,84CD", "{Network=310-410, LAC=65534, TAC=33997, Cell ID=27447297}"},
-        {"001,01,0,0,0", "(null)"},
-        {"001,01,1234,D30156", "(null)"},
-        {"001,01,xyz,D30156,84CD", "{Network=001-01, TAC=33997, Cell ID=13828438}"},
-        {"", "(null)"},
-    };
-    for (const auto& [text, shown] : cases) {
-        ModemState state;
-        state.condition = Condition::enabled;
-        state.location = locationIn(Dictionary::make({{"1", text}, {"4", "$GPGGA"}}));
-        EXPECT_EQ(test::shown(section(display("IFX", state), "Location")), shown) << text;
-    }
 }
 
 } // namespace
