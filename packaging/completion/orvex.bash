@@ -12,7 +12,7 @@ _orvex()
             COMPREPLY=($(compgen -W '$("$1" --help | grep -oE "IFX|MRL_[A-Z0-9]+" | sort -u)' -- "$cur"))
             return
             ;;
-        *:FILE)
+        *:FILE*)
             _filedir
             return
             ;;
