@@ -52,7 +52,7 @@ CommandLine::Program baseProgram()
                     "FILE"},
                 {"report",
                     "Instead of the tree, write to FILE.html a page that any browser opens: plots of the "
-                    "levels over time, serving cells, neighbors, contexts, log codes and the last display.",
+                    "levels over time, serving cells, neighbours, contexts, log codes and the last display.",
                     "FILE.html"},
                 {"every",
                     "With --timeline or --report: look at the display every SECONDS, at least 0.1. Default: "
