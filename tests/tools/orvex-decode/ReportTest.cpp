@@ -113,13 +113,14 @@ protected:
         const Rows rows = rowsOf(contentsOf("out.csv"));
         std::size_t count = 0;
         for (const json& plot : page["plots"]) {
+            const std::string unit = plot["unit"];
             for (const json& line : plot["lines"]) {
                 const auto row = rows.find({line["path"], line["key"]});
                 if (row == rows.end()) {
                     ADD_FAILURE() << line["path"] << line["key"];
                     continue;
                 }
-                EXPECT_EQ(pointsOf(line, page["shifts"]), pointsOf(row->second, plot["unit"] != ""))
+                EXPECT_EQ(pointsOf(line, page["shifts"]), pointsOf(row->second, !unit.empty()))
                     << line["path"] << line["key"];
                 ++count;
             }
