@@ -29,9 +29,13 @@ void makeCapture(const std::string& path, const std::string& packets)
     PcapWriter writer(path);
     std::istringstream stream(packets);
     for (std::string packet; std::getline(stream >> std::ws, packet, ';');) {
+        std::chrono::microseconds time(1'700'000'000'654'321);
+        if (packet[0] == '@') {
+            time += std::chrono::milliseconds(std::stoll(packet.substr(1)));
+            packet.erase(0, packet.find(' ') + 1);
+        }
         const bool isBare = packet.starts_with("bytes ");
-        writer.write(isBare ? bytesOfWords(packet.substr(6)) : packetOfText(packet),
-            std::chrono::microseconds(1'700'000'000'654'321));
+        writer.write(isBare ? bytesOfWords(packet.substr(6)) : packetOfText(packet), time);
     }
 }
 
@@ -108,7 +112,8 @@ TEST_P(TranscriptsTest, AreWhatTheProgramsSay)
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(, TranscriptsTest, testing::Values("console", "decode", "programs", "sessions"),
+INSTANTIATE_TEST_SUITE_P(, TranscriptsTest,
+    testing::Values("console", "decode", "programs", "sessions", "timeline"),
     [](const auto& each) { return std::string(each.param); });
 
 } // namespace

@@ -2,10 +2,6 @@
 
 #include "Captures.h"
 
-#include "Array.h"
-#include "Dictionary.h"
-#include "Snapshot.h"
-
 #include <QDrag>
 #include <QMimeData>
 #include <QMouseEvent>
@@ -60,7 +56,6 @@ struct FileDrop : testing::Test {
         fs::create_directory(name("a program"));
         fs::copy_file(ORVEX_PATH, name("a program/orvex"));
         fs::copy_file(capturePath("MRL_LTE"), name("a capture.pcap"));
-        writeSnapshot({"", Array::make({Dictionary::make({{"Description", "x"}})}), ""}, name("saved.orvex"));
         source.show();
         EXPECT_TRUE(QTest::qWaitForWindowExposed(&source));
     }
@@ -116,7 +111,7 @@ TEST_F(FileDrop, OpensAnotherWindowThatLooksTheSame)
         const char* file;
         const char* endingKey;
         int status;
-    } cases[] = {{"a capture.pcap", "ctrl+q", 0}, {"saved.orvex", "ctrl+q", 0}, {"nothing", "Return", 1}};
+    } cases[] = {{"a capture.pcap", "ctrl+q", 0}, {"nothing", "Return", 1}};
     ASSERT_EQ(::prctl(PR_SET_CHILD_SUBREAPER, 1), 0); // processes without a parent become this one's
     for (const auto& [file, endingKey, status] : cases) {
         QProcess direct;
