@@ -60,3 +60,8 @@ function decimalsOf(numbers) {
 }
 
 const numberText = (number, decimals) => number.toFixed(decimals).replace('-', '−');
+
+// What identifies cells and channels, as short as there is room for beside a plot and on a phone.
+const kShortNames = [['Physical Cell ID', 'PCI'], ['E-ARFCN', 'EARFCN'], ['Scrambling Code', 'PSC'],
+    ['Transport Channel ID', 'TrCH'], ['TRCH ID', 'TrCH'], ['CCTRCH ID', 'CCTrCH']];
+const shortName = (text) => kShortNames.reduce((result, [name, short]) => result.replaceAll(name, short), text);

@@ -1,9 +1,6 @@
 // The plots: each value holds until the next one, or until its row is gone.
 const kMostLines = 8; // shown from the start
 const kAxisWidth = 52;
-// What identifies cells, as short as there is room for beside a plot.
-const kShortNames = [['Physical Cell ID', 'PCI'], ['E-ARFCN', 'EARFCN'], ['Scrambling Code', 'PSC'],
-    ['Downlink Frequency', 'DL'], ['Transport Channel ID', 'TrCH'], ['TRCH ID', 'TrCH'], ['CCTRCH ID', 'CCTrCH']];
 
 // Its legend writes style attributes, which the page's policy refuses; the readings at the side replace it.
 Dygraph.PLUGINS = [Dygraph.Plugins.Axes, Dygraph.Plugins.Grid];
@@ -133,7 +130,7 @@ function prepareLines(plot) {
     const isOneName = plot.lines.every((line) => line.key && line.name === plot.lines[0].name);
     plot.lines.forEach((line) => {
         line.title = isOneName ? line.key : [line.key, line.name].filter(Boolean).join(' · ');
-        line.label = kShortNames.reduce((label, [name, short]) => label.replaceAll(name, short), line.title);
+        line.label = shortName(line.title);
         line.duration = line.times.reduce((sum, time, i) =>
             line.numbers[i] === null ? sum : sum + (line.times[i + 1] ?? axis.last) - time, 0);
     });

@@ -68,7 +68,8 @@ function addNeighbours() {
         const columns = [...texts('Cell'), ...numbers('Samples'),
             ...(hasLevel ? numbers(`${list.level} best`, 'median', 'last') : [])];
         const cells = hasLevel ? list.cells.sort((a, b) => (b.best ?? -Infinity) - (a.best ?? -Infinity)) : list.cells;
-        addTable(section, columns, transposed([cells.map((cell) => cell.name), cells.map((cell) => grouped(cell.samples)),
+        addTable(section, columns, transposed([cells.map((cell) => shortName(cell.name)),
+            cells.map((cell) => grouped(cell.samples)),
             ...(hasLevel ? ['best', 'median', 'last'].map((member) => levelTexts(cells, member)) : [])]));
         addRemark(section, list.omitted, 'cells');
     }
