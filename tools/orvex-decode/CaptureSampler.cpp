@@ -73,7 +73,9 @@ std::string CaptureSampler::clockNote() const
 {
     if (_jumps == 0)
         return {};
-    const std::string more = _jumps == 1 ? "" : text(", and %zu times after that", _jumps - 1);
+    std::string more;
+    if (_jumps > 1)
+        more = _jumps == 2 ? ", and once after that" : text(", and %zu times after that", _jumps - 1);
     return text("the clock goes back by %.3f s at message %zu%s; times are as captured",
         std::chrono::duration<double>(_firstJump->back).count(), _firstJump->message, more.c_str());
 }
