@@ -1,5 +1,7 @@
 #include "ReportClock.h"
 
+#include "Sampling.h"
+
 #include <algorithm>
 #include <cmath>
 
@@ -29,7 +31,7 @@ void ReportClock::takeMessage(std::chrono::microseconds time)
         _first = _newest = captured;
         return;
     }
-    if (time + kDisorder < _newestTime) {
+    if (time + kMessageDisorder < _newestTime) {
         _newestTime = time;
         const std::int64_t from = std::max(_newest, _last.position) + 1;
         _shift = from - captured;

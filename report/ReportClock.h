@@ -17,7 +17,6 @@ namespace orvex {
 class ReportClock {
 public:
     static constexpr std::int64_t kShortestGap = 10'000; // ms
-    static constexpr std::chrono::seconds kDisorder{1};  // messages that a modem reports late
     static constexpr std::size_t kLimit = 1'000;         // of the gaps and of the shifts listed
 
     void takeMessage(std::chrono::microseconds time);

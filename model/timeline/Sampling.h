@@ -7,6 +7,10 @@
 
 namespace orvex {
 
+// How far the clock of a capture may go back before it counts as set back: a modem reports some messages
+// late.
+inline constexpr std::chrono::seconds kMessageDisorder{1};
+
 // How the display is to be followed.
 struct Sampling {
     // Sets the members from the values of --every and --field. Returns what is wrong with them; empty for

@@ -10,10 +10,7 @@ namespace orvex {
 
 namespace {
 using std::chrono::microseconds;
-
-// Messages that a modem reports late are not a clock set back.
-constexpr std::chrono::seconds kDisorder{1};
-} // namespace
+}
 
 CaptureSampler::CaptureSampler(const Sampling& sampling, OfflineSession& session, TimelineOutput& output)
     : _session(session)
@@ -36,7 +33,7 @@ void CaptureSampler::advance(microseconds time)
 {
     if (!_newest) {
         _next = time + _every;
-    } else if (time + kDisorder < *_newest) {
+    } else if (time + kMessageDisorder < *_newest) {
         goBack(time);
         return;
     } else if (time >= _next) {

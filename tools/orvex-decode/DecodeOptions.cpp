@@ -81,8 +81,7 @@ CommandLine::Program baseProgram()
         .argumentsDescription =
             "Captures or snapshots (.orvex), not both. A capture is a DLF file or a pcap file with link type "
             "147 (USER0), one log message per packet; gzip and xz are undone. Databases of timelines "
-            "(.sqlite) "
-            "are merged into that of --timeline.",
+            "(.sqlite) are merged into that of --timeline.",
     };
 }
 
@@ -106,7 +105,7 @@ std::string readDatabases(const CommandLine& line, DecodeOptions& options)
         return "Databases cannot be combined with other inputs.";
     if (!isDatabaseFile(line.value("timeline").value_or("")))
         return "Databases go with --timeline FILE.sqlite.";
-    for (const char* option : {"every", "field", "technology"}) {
+    for (const char* option : {"report", "every", "field", "technology"}) {
         if (line.isSet(option))
             return "--" + std::string(option) + " goes with captures.";
     }
